@@ -1,0 +1,19 @@
+// SPDX-License-Identifier: MIT
+// The Interface Kit, all of it.
+#ifndef _INTERFACE_KIT_H
+#define _INTERFACE_KIT_H
+
+#include <Bitmap.h>
+#include <Font.h>
+#include <GraphicsDefs.h>
+#include <InterfaceDefs.h>
+#include <Point.h>
+#include <Polygon.h>
+#include <Rect.h>
+#include <Region.h>
+#include <Screen.h>
+#include <Size.h>
+#include <View.h>
+#include <Window.h>
+
+#endif // _INTERFACE_KIT_H
