@@ -24,7 +24,7 @@ struct LooperAccess;
 
 #define B_OBSERVE_WHAT_CHANGE "be:observe_change_what"
 #define B_OBSERVE_ORIGINAL_WHAT "be:observe_orig_what"
-const uint32 B_OBSERVER_OBSERVE_ALL = 0xffffffff;
+#define B_OBSERVER_OBSERVE_ALL 0xffffffff
 
 
 /// Receives messages in the thread of the looper that it belongs to.
