@@ -1,0 +1,135 @@
+// SPDX-License-Identifier: MIT
+
+#include "app/ReplacementFile.h"
+
+#include <vector>
+
+#include <Entry.h>
+#include <OS.h>
+#include <Path.h>
+#include <fs_attr.h>
+
+namespace {
+
+constexpr size_t kBlockSize = 64 * 1024;
+constexpr int32 kMostAttempts = 100;
+
+} // namespace
+
+TReplacementFile::TReplacementFile(const char* path)
+	: fStatus(path == nullptr || *path == '\0' ? B_BAD_VALUE : OpenBeside(path))
+{
+}
+
+
+TReplacementFile::~TReplacementFile()
+{
+	fNewFile.Unset();
+	if (!fNewPath.IsEmpty())
+		BEntry(fNewPath.String()).Remove();
+}
+
+
+status_t
+TReplacementFile::KeepTail()
+{
+	if (fStatus != B_OK || fNewPath.IsEmpty())
+		return fStatus;
+
+	BFile present(fPath.String(), B_READ_ONLY);
+	if (present.InitCheck() == B_ENTRY_NOT_FOUND)
+		return B_OK;
+	if (present.InitCheck() != B_OK)
+		return present.InitCheck();
+
+	std::vector<char> block(kBlockSize);
+	off_t position = fNewFile.Seek(0, SEEK_END);
+	for (;;) {
+		const ssize_t length = present.ReadAt(position, block.data(), block.size());
+		if (length <= 0)
+			return length;
+		const ssize_t written = fNewFile.WriteAt(position, block.data(), length);
+		if (written != length)
+			return written < 0 ? written : B_DEVICE_FULL;
+		position += length;
+	}
+}
+
+
+status_t
+TReplacementFile::Replace()
+{
+	if (fStatus != B_OK)
+		return fStatus;
+	if (fNewPath.IsEmpty())
+		return B_OK;
+
+	BFile present(fPath.String(), B_READ_ONLY);
+	if (present.InitCheck() == B_OK) {
+		TakeOverAttributes(present);
+		mode_t permissions;
+		if (present.GetPermissions(&permissions) == B_OK)
+			fNewFile.SetPermissions(permissions & 07777);
+	}
+
+	// The content has to be on the disk before the name leads to it.
+	status_t status = fNewFile.Sync();
+	if (status == B_OK)
+		status = BEntry(fNewPath.String()).Rename(fPath.String(), true);
+	if (status == B_OK) {
+		fNewPath = "";
+		fStatus = B_NO_INIT;
+	}
+	return status;
+}
+
+
+status_t
+TReplacementFile::OpenBeside(const char* path)
+{
+	BEntry entry(path, true);
+	if (entry.InitCheck() != B_OK)
+		return entry.InitCheck();
+	BPath resolved;
+	status_t status = entry.GetPath(&resolved);
+	if (status != B_OK)
+		return status;
+	fPath = resolved.Path();
+
+	if (entry.Exists()) {
+		// A file that may not be written is not replaced either, though its folder would allow it.
+		BFile present(&entry, B_WRITE_ONLY);
+		if (present.InitCheck() != B_OK)
+			return present.InitCheck();
+		if (!entry.IsFile())
+			return fNewFile.SetTo(&entry, entry.IsDirectory() ? B_READ_WRITE : B_WRITE_ONLY);
+	}
+
+	for (int32 attempt = 0; attempt < kMostAttempts; attempt++) {
+		BString name(fPath);
+		name << ".new" << static_cast<int64>(find_thread(nullptr)) << "-" << attempt;
+		status = fNewFile.SetTo(name.String(), B_READ_WRITE | B_CREATE_FILE | B_FAIL_IF_EXISTS);
+		if (status == B_OK)
+			fNewPath = name;
+		if (status != B_FILE_EXISTS)
+			return status;
+	}
+	return status;
+}
+
+
+void
+TReplacementFile::TakeOverAttributes(BFile& present)
+{
+	char name[B_ATTR_NAME_LENGTH];
+	while (present.GetNextAttrName(name) == B_OK) {
+		attr_info info;
+		if (fNewFile.GetAttrInfo(name, &info) == B_OK)
+			continue;
+		if (present.GetAttrInfo(name, &info) != B_OK)
+			continue;
+		std::vector<char> value(info.size);
+		if (present.ReadAttr(name, info.type, 0, value.data(), value.size()) >= 0)
+			fNewFile.WriteAttr(name, info.type, 0, value.data(), value.size());
+	}
+}
