@@ -1,0 +1,42 @@
+// SPDX-License-Identifier: MIT
+// Loading component libraries.
+
+#pragma once
+
+#include <SupportDefs.h>
+
+class BPath;
+class BView;
+class TPaletteCatalog;
+class TPaletteEntry;
+
+/// Loads component libraries and collects their palette entries.
+///
+/// A library is an add-on image that exports, unmangled,
+/// `bool InitComponentLib(image_id)`, `void UnInitComponentLib()`, `uint32 CountComponents()` and
+/// `TPaletteEntry* EntryAt(uint32 index)`. What cannot be used is reported on standard output and left
+/// out. Loaded libraries stay loaded until the program ends.
+class TLibraryLoader {
+public:
+	/// \a catalog gets the entries. \a palette, if any, gets their buttons, in one column.
+	explicit TLibraryLoader(TPaletteCatalog* catalog, BView* palette = nullptr);
+
+	/// Loads each library in \a folder, in the folder's own order; B_ENTRY_NOT_FOUND without a folder.
+	status_t LoadFolder(const char* folder);
+
+	/// The number of entries placed so far, and the height of their column in pixels.
+	int32 CountEntries() const { return fEntryCount; }
+	float ColumnHeight() const { return fColumnHeight; }
+
+private:
+	void LoadLibrary(const char* path);
+	void AddEntries(uint32 (*count)(), TPaletteEntry* (*entryAt)(uint32 index));
+
+	TPaletteCatalog* fCatalog;
+	BView* fPalette;
+	int32 fEntryCount;
+	float fColumnHeight;
+};
+
+/// Sets \a path to the "Components" folder beside the running program.
+status_t FindComponentsFolder(BPath* path);
