@@ -1,0 +1,375 @@
+// SPDX-License-Identifier: MIT
+
+#include "designer/DesignForm.h"
+
+#include <cmath>
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+
+#include <Autolock.h>
+
+#include "app/Dialogs.h"
+#include "designer/DesignFormView.h"
+#include "model/ColorText.h"
+#include "model/Property.h"
+#include "props/PropertyEditor.h"
+
+namespace {
+
+const BRect kFirstFrame(120, 120, 420, 420);
+
+// The codes of the form's commands, which the shortcuts send to the design view.
+struct form_shortcut {
+	uint32 key;
+	uint32 command;
+};
+constexpr form_shortcut kShortcuts[] = {{'S', 8}, {'R', 13}, {'L', 11}, {'V', 6}};
+constexpr uint32 kMsgSavePanel = 14;
+
+void
+WriteEdge(TComponent* component, const char* name, float edge)
+{
+	TProperty* property = component->FindProperty(name);
+	if (property == nullptr || property->Editor() == nullptr)
+		return;
+	char text[1024];
+	snprintf(text, sizeof(text), "%d", static_cast<int>(lroundf(edge)));
+	property->Editor()->SetValue(text, false);
+}
+
+
+void
+WriteEdges(TComponent* component, BRect frame)
+{
+	WriteEdge(component, "Left", frame.left);
+	WriteEdge(component, "Top", frame.top);
+	WriteEdge(component, "Right", frame.right);
+	WriteEdge(component, "Bottom", frame.bottom);
+}
+
+} // namespace
+
+TDesignForm::TDesignForm(const char* name, form_visibility visibility)
+	: BWindow(kFirstFrame, name, B_TITLED_WINDOW, 0),
+	  fDesignView(nullptr),
+	  fClosing(false)
+{
+	SetComponentName(name);
+	SetClassName("TForm");
+	SetFlags(Flags() | B_WILL_ACCEPT_FIRST_CLICK);
+	InitPropertyList();
+	InitEventList();
+	InitPropertyValues();
+	InitEventValues();
+	InitControls();
+	SetDTView(fDesignView);
+	CenterWindowOnScreen(this);
+	if (visibility == FORM_SHOWN)
+		Show();
+}
+
+
+TDesignForm::~TDesignForm() {}
+
+
+void
+TDesignForm::MessageReceived(BMessage* message)
+{
+	switch (message->what) {
+		case DFM_LOADFILE:
+			ReplyToLoad(message);
+			break;
+
+		case DFM_SAVEFILE:
+			ReplyToSave(message);
+			break;
+
+		case kMsgSavePanel:
+			fDesignView->MessageReceived(message);
+			break;
+
+		case B_SIMPLE_DATA:
+			// Files dropped on a form are not opened.
+			if (!message->HasRef("refs"))
+				BWindow::MessageReceived(message);
+			break;
+
+		default:
+			BWindow::MessageReceived(message);
+			break;
+	}
+}
+
+
+bool
+TDesignForm::QuitRequested()
+{
+	if (fClosing)
+		return true;
+	Hide();
+	return false;
+}
+
+
+void
+TDesignForm::FrameMoved(BPoint origin)
+{
+	BWindow::FrameMoved(origin);
+	UpdateWindowPosition();
+}
+
+
+void
+TDesignForm::FrameResized(float width, float height)
+{
+	fDesignView->Invalidate();
+	BWindow::FrameResized(width, height);
+	UpdateWindowPosition();
+}
+
+
+const char*
+TDesignForm::GetPropertyValue(const char* name)
+{
+	printf("TDesignForm::GetPropertyValue('%s')\n", name);
+	return TFormComponent::GetPropertyValue(name);
+}
+
+
+void
+TDesignForm::SetPropertyValue(const char* name, const char* value)
+{
+	printf("TDesignForm::SetPropertyValue('%s', '%s')\n", name, value);
+	if (name == nullptr || value == nullptr)
+		return;
+
+	BAutolock lock(this);
+	if (!lock.IsLocked())
+		return;
+
+	if (strcmp(name, "Title") == 0) {
+		SetTitle(value);
+		StoreProperty(name, value);
+	} else if (ApplyEdge(name, value) || ApplyColor(name, value))
+		StoreProperty(name, value);
+	else
+		TFormComponent::SetPropertyValue(name, value);
+}
+
+
+bool
+TDesignForm::PropertyModified(const char* name, const char* oldValue, const char* newValue)
+{
+	return fDesignView == nullptr || fDesignView->PropertyModified(name, oldValue, newValue);
+}
+
+
+bool
+TDesignForm::Modified() const
+{
+	return fDesignView->Modified();
+}
+
+
+bool
+TDesignForm::ComponentPropertyModified(
+	TComponent* component, const char* name, const char* oldValue, const char* newValue)
+{
+	return fDesignView->ComponentPropertyModified(component, name, oldValue, newValue);
+}
+
+
+int32
+TDesignForm::CountComponents() const
+{
+	return fDesignView->CountComponents();
+}
+
+
+TComponent*
+TDesignForm::ComponentAt(int32 index) const
+{
+	return fDesignView->ComponentAt(index);
+}
+
+
+void
+TDesignForm::AddComponent(TComponent* component)
+{
+	fDesignView->AddComponent(component);
+}
+
+
+bool
+TDesignForm::RemoveComponent(TComponent* component)
+{
+	return fDesignView->RemoveComponent(component);
+}
+
+
+TComponent*
+TDesignForm::RemoveComponent(int32 index)
+{
+	return fDesignView->RemoveComponent(index);
+}
+
+
+void
+TDesignForm::ClearComponents(bool deleteComponents)
+{
+	fDesignView->ClearComponents(deleteComponents);
+}
+
+
+bool
+TDesignForm::IsDropWaiting()
+{
+	return fDesignView->IsDropWaiting();
+}
+
+
+TComponent*
+TDesignForm::CreateComponent(BView* parent, BRect frame)
+{
+	return fDesignView->CreateComponent(parent, frame);
+}
+
+
+void
+TDesignForm::DoneDroppingComponent()
+{
+	fDesignView->DoneDroppingComponent();
+}
+
+
+void
+TDesignForm::UpdateWindowPosition()
+{
+	WriteEdges(this, Frame());
+}
+
+
+void
+TDesignForm::UpdateComponentPosition(TComponent* component, BRect frame)
+{
+	WriteEdges(component, frame);
+}
+
+
+const char*
+TDesignForm::Filename() const
+{
+	return fDesignView->Filename();
+}
+
+
+void
+TDesignForm::SetFilename(const char* name)
+{
+	fDesignView->SetFilename(name);
+}
+
+
+bool
+TDesignForm::SaveToFile(const char* path)
+{
+	return fDesignView->SaveToFile(path);
+}
+
+
+bool
+TDesignForm::LoadFromFile(const char* path, TLoadReport* report)
+{
+	return fDesignView->LoadFromFile(path, report);
+}
+
+
+bool
+TDesignForm::IsMainForm() const
+{
+	return fDesignView->IsMainForm();
+}
+
+
+void
+TDesignForm::SetAsMainForm(bool isMainForm)
+{
+	fDesignView->SetAsMainForm(isMainForm);
+}
+
+
+void
+TDesignForm::InitControls()
+{
+	fDesignView = new TDesignFormView(Bounds(), this);
+	AddChild(fDesignView);
+	SetDTFormView(fDesignView);
+	for (const form_shortcut& shortcut : kShortcuts)
+		AddShortcut(shortcut.key, B_COMMAND_KEY, new BMessage(shortcut.command), fDesignView);
+}
+
+
+/// Moves or resizes the window when \a name is one of its edges; false when it is none.
+bool
+TDesignForm::ApplyEdge(const char* name, const char* value)
+{
+	const BRect frame = Frame();
+	const float edge = static_cast<float>(strtol(value, nullptr, 10));
+	if (strcmp(name, "Left") == 0)
+		MoveTo(edge, frame.top);
+	else if (strcmp(name, "Top") == 0)
+		MoveTo(frame.left, edge);
+	else if (strcmp(name, "Right") == 0)
+		ResizeTo(edge - frame.left, frame.Height());
+	else if (strcmp(name, "Bottom") == 0)
+		ResizeTo(frame.Width(), edge - frame.top);
+	else
+		return false;
+	return true;
+}
+
+
+/// Gives the design view a colour when \a name is one of its three; false when it is none.
+bool
+TDesignForm::ApplyColor(const char* name, const char* value)
+{
+	void (BView::*setColor)(rgb_color) = nullptr;
+	if (strcmp(name, "ViewColor") == 0)
+		setColor = &BView::SetViewColor;
+	else if (strcmp(name, "HighColor") == 0)
+		setColor = &BView::SetHighColor;
+	else if (strcmp(name, "LowColor") == 0)
+		setColor = &BView::SetLowColor;
+	if (setColor == nullptr || fDesignView == nullptr)
+		return false;
+
+	rgb_color color = {0, 0, 0, 255};
+	(fDesignView->*setColor)(StrToRGBColor(value, &color));
+	fDesignView->Invalidate();
+	return true;
+}
+
+
+void
+TDesignForm::ReplyToLoad(BMessage* message)
+{
+	const char* path = nullptr;
+	const bool loaded = message->FindString("filename", &path) == B_OK && LoadFromFile(path);
+
+	BMessage reply(DFM_LOADFILE);
+	reply.AddBool("result", loaded);
+	reply.AddString("formname", ComponentName());
+	message->SendReply(&reply);
+}
+
+
+void
+TDesignForm::ReplyToSave(BMessage* message)
+{
+	const bool saved = *Filename() != '\0' && SaveToFile(Filename());
+
+	BMessage reply(DFM_SAVEFILE);
+	reply.AddBool("result", saved);
+	message->SendReply(&reply);
+}

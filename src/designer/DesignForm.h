@@ -1,0 +1,93 @@
+// SPDX-License-Identifier: MIT
+// The window in which the user lays out one form.
+
+#pragma once
+
+#include <Window.h>
+
+#include "model/FormComponent.h"
+#include "model/FormDesigner.h"
+
+class TDesignFormView;
+class TLoadReport;
+
+enum {
+	DFM_LOADFILE = 'f_lF', // "filename" (string); reply: "result" (bool), "formname" (string)
+	DFM_SAVEFILE = 'f_sF'  // reply: "result" (bool)
+};
+
+/// Whether a design form's window appears. A hidden one is a document without a window thread, for
+/// programs that only load, save and generate.
+enum form_visibility { FORM_SHOWN, FORM_HIDDEN };
+
+/// A form being designed: a window, the form's own component, and the designer of its components.
+///
+/// Its component list is the design view's. Closing the window hides it until OKToClose(true). Lock
+/// the window unless an operation says that it locks by itself; a hidden form is locked by the thread
+/// that made it.
+class TDesignForm : public BWindow, public TFormComponent, public TFormDesigner {
+public:
+	/// \a name: the form's name and first title; null leaves both empty.
+	explicit TDesignForm(const char* name, form_visibility visibility = FORM_SHOWN);
+	virtual ~TDesignForm();
+
+	// BWindow
+	void MessageReceived(BMessage* message) override;
+	bool QuitRequested() override;
+	void FrameMoved(BPoint origin) override;
+	void FrameResized(float width, float height) override;
+
+	// TComponent
+	const char* GetPropertyValue(const char* name) override;
+	/// Applies the value to the window or its view and stores it. Locks the window.
+	///
+	/// Nothing is stored when the window cannot be locked. Edges are base-10 integers in screen
+	/// coordinates; text that is no number counts as 0.
+	void SetPropertyValue(const char* name, const char* value) override;
+	bool PropertyModified(const char* name, const char* oldValue, const char* newValue) override;
+	bool Modified() const override;
+
+	// TComponentOwner, all forwarded to the design view
+	bool ComponentPropertyModified(TComponent* component, const char* name, const char* oldValue,
+		const char* newValue) override;
+	int32 CountComponents() const override;
+	TComponent* ComponentAt(int32 index) const override;
+	void AddComponent(TComponent* component) override;
+	bool RemoveComponent(TComponent* component) override;
+	TComponent* RemoveComponent(int32 index) override;
+	void ClearComponents(bool deleteComponents) override;
+
+	// TFormDesigner, forwarded to the design view
+	bool IsDropWaiting() override;
+	TComponent* CreateComponent(BView* parent, BRect frame) override;
+	void DoneDroppingComponent() override;
+
+	/// Lets the window really close from now on.
+	void OKToClose(bool closing) { fClosing = closing; }
+
+	/// Writes the window's edges, rounded, into the editors of "Left", "Top", "Right" and "Bottom".
+	void UpdateWindowPosition();
+
+	/// The same for \a component and \a frame, in its parent's coordinates.
+	void UpdateComponentPosition(TComponent* component, BRect frame);
+
+	// Forwarded to the design view
+	const char* Filename() const;
+	void SetFilename(const char* name);
+	bool SaveToFile(const char* path);
+	bool LoadFromFile(const char* path, TLoadReport* report = nullptr);
+	bool IsMainForm() const;
+	void SetAsMainForm(bool isMainForm);
+
+	TDesignFormView* View() const { return fDesignView; }
+
+private:
+	void InitControls();
+	bool ApplyEdge(const char* name, const char* value);
+	bool ApplyColor(const char* name, const char* value);
+	void ReplyToLoad(BMessage* message);
+	void ReplyToSave(BMessage* message);
+
+	TDesignFormView* fDesignView;
+	bool fClosing;
+};

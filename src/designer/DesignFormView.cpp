@@ -1,0 +1,174 @@
+// SPDX-License-Identifier: MIT
+
+#include "designer/DesignFormView.h"
+
+#include <cstdio>
+#include <cstring>
+
+#include "designer/DesignForm.h"
+#include "designer/FormReader.h"
+#include "designer/FormWriter.h"
+#include "palette/PaletteCatalog.h"
+#include "palette/PaletteEntry.h"
+
+namespace {
+
+constexpr rgb_color kSurfaceColor = {216, 216, 216, 255};
+constexpr rgb_color kSelectionColor = {0, 200, 200, 255};
+constexpr int32 kNameSize = 80;
+
+} // namespace
+
+TDesignFormView::TDesignFormView(BRect frame, TDesignForm* form)
+	: BView(frame, "vwDesign", B_FOLLOW_ALL_SIDES, B_WILL_DRAW),
+	  fForm(form),
+	  fFilename(),
+	  fModified(false),
+	  fIsMainForm(false)
+{
+	SetClassName("TForm");
+	SetViewColor(kSurfaceColor);
+	SetDTView(this);
+	SetDTFormView(this);
+}
+
+
+TDesignFormView::~TDesignFormView()
+{
+	TFormDesigner::ClearComponents(true);
+}
+
+
+void
+TDesignFormView::Draw(BRect updateRect)
+{
+	BView::Draw(updateRect);
+	if (!fForm->IsDesignerSelected())
+		return;
+
+	const BRect bounds = Bounds();
+	const BPoint corners[] = {BPoint(0, 0), BPoint(bounds.Width(), 0),
+		BPoint(bounds.Width(), bounds.Height()), BPoint(0, bounds.Height())};
+	BeginLineArray(4);
+	for (int32 i = 0; i < 4; i++)
+		AddLine(corners[i], corners[(i + 1) % 4], kSelectionColor);
+	EndLineArray();
+}
+
+
+bool
+TDesignFormView::PropertyModified(const char* name, const char*, const char* newValue)
+{
+	if (name != nullptr && newValue != nullptr && strcmp(name, "Name") == 0)
+		fForm->SetComponentName(newValue);
+	return true;
+}
+
+
+void
+TDesignFormView::SetModified(bool modified)
+{
+	fModified = modified;
+	if (modified)
+		return;
+	for (int32 i = 0; i < TFormDesigner::CountComponents(); i++) {
+		TComponent* component = TFormDesigner::ComponentAt(i);
+		if (component->Modified())
+			component->SetModified(false);
+	}
+}
+
+
+bool
+TDesignFormView::Modified() const
+{
+	if (fModified)
+		return true;
+	for (int32 i = 0; i < TFormDesigner::CountComponents(); i++) {
+		if (TFormDesigner::ComponentAt(i)->Modified())
+			return true;
+	}
+	return false;
+}
+
+
+bool
+TDesignFormView::ComponentPropertyModified(TComponent*, const char*, const char*, const char*)
+{
+	SetModified(true);
+	return true;
+}
+
+
+bool
+TDesignFormView::IsDropWaiting()
+{
+	return PaletteCatalog().DropEntry() != nullptr;
+}
+
+
+TComponent*
+TDesignFormView::CreateComponent(BView* parent, BRect frame)
+{
+	TPaletteEntry* entry = PaletteCatalog().DropEntry();
+	if (entry == nullptr)
+		return nullptr;
+
+	TComponent* component = entry->CreateComponent(parent, this, frame);
+	if (component == nullptr) {
+		printf("No component returned from CreateComponent()\n");
+		return nullptr;
+	}
+
+	char name[kNameSize];
+	GetNewComponentName(component, this, name, sizeof(name));
+	component->SetComponentName(name);
+	component->SetPropertyValue("Name", name);
+	fForm->UpdateComponentPosition(component, frame);
+	printf("Creating Component '%s'\n", component->ComponentName());
+	AddComponent(component);
+	return component;
+}
+
+
+void
+TDesignFormView::DoneDroppingComponent()
+{
+	PaletteCatalog().SetDropEntry(nullptr);
+}
+
+
+bool
+TDesignFormView::SaveToFile(const char* path)
+{
+	TFormWriter writer(this);
+	if (!writer.Write(path))
+		return false;
+	SetFilename(path);
+	SetModified(false);
+	fForm->TFormComponent::SetModified(false);
+	return true;
+}
+
+
+bool
+TDesignFormView::LoadFromFile(const char* path, TLoadReport* report)
+{
+	TFormReader reader(this, report);
+	if (!reader.Read(path))
+		return false;
+	SetFilename(path);
+	SetModified(false);
+	fForm->TFormComponent::SetModified(false);
+	return true;
+}
+
+
+void
+TDesignFormView::SetFilename(const char* name)
+{
+	if (name == nullptr)
+		return;
+	strncpy(fFilename, name, sizeof(fFilename) - 1);
+	fFilename[sizeof(fFilename) - 1] = '\0';
+}

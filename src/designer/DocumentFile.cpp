@@ -1,0 +1,110 @@
+// SPDX-License-Identifier: MIT
+
+#include "designer/DocumentFile.h"
+
+#include <cstring>
+
+#include <File.h>
+#include <NodeInfo.h>
+
+#include "app/ReplacementFile.h"
+
+namespace {
+
+constexpr uint32 kDocument = 'PlmF';
+constexpr const char* kDesignerSignature = "application/x-qtx.Plim";
+
+/// Copies \a text into the zero-filled \a field of \a size bytes, cutting what is too long.
+void
+CopyText(char* field, size_t size, const char* text)
+{
+	memset(field, 0, size);
+	strncpy(field, text, size - 1);
+}
+
+} // namespace
+
+TPLIMFile::TPLIMFile(const char* mimeType, const char* fileName)
+	: TTypedMessage(kDocument),
+	  fFilename(),
+	  fFilenameCut(false),
+	  fFileType(),
+	  fStatus(B_NO_INIT)
+{
+	if (mimeType != nullptr)
+		CopyText(fFileType, sizeof(fFileType), mimeType);
+	if (fileName != nullptr) {
+		SetFilename(fileName);
+		OpenFile();
+	}
+}
+
+
+TPLIMFile::~TPLIMFile() {}
+
+
+bool
+TPLIMFile::SaveFile()
+{
+	fStatus = WriteDocument();
+	return fStatus == B_OK;
+}
+
+
+bool
+TPLIMFile::OpenFile()
+{
+	fStatus = ResolvePath();
+	if (fStatus != B_OK)
+		return false;
+
+	BFile file(fPath.Path(), B_READ_ONLY);
+	fStatus = file.InitCheck();
+	if (fStatus != B_OK)
+		return false;
+
+	fStatus = Unflatten(&file);
+	return fStatus == B_OK;
+}
+
+
+void
+TPLIMFile::SetFilename(const char* name)
+{
+	if (name == nullptr)
+		return;
+	CopyText(fFilename, sizeof(fFilename), name);
+	fFilenameCut = strlen(name) >= sizeof(fFilename);
+}
+
+
+status_t
+TPLIMFile::ResolvePath()
+{
+	return fFilenameCut ? B_NAME_TOO_LONG : fPath.SetTo(fFilename);
+}
+
+
+status_t
+TPLIMFile::WriteDocument()
+{
+	status_t status = ResolvePath();
+	if (status != B_OK)
+		return status;
+
+	TReplacementFile file(fPath.Path());
+	status = file.InitCheck();
+	if (status == B_OK)
+		status = Flatten(file.Stream());
+	if (status == B_OK)
+		status = file.KeepTail();
+	if (status != B_OK)
+		return status;
+
+	// A file system without attributes keeps documents all the same: the type is then found from
+	// the content and the name.
+	BNodeInfo info(file.Stream());
+	info.SetType(fFileType);
+	info.SetPreferredApp(kDesignerSignature, B_OPEN);
+	return file.Replace();
+}

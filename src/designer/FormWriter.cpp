@@ -1,0 +1,160 @@
+// SPDX-License-Identifier: MIT
+
+#include "designer/FormWriter.h"
+
+#include <cstdio>
+
+#include <View.h>
+
+#include "designer/DesignForm.h"
+#include "designer/DesignFormView.h"
+#include "designer/FormFile.h"
+#include "model/Event.h"
+#include "model/Property.h"
+
+namespace {
+
+const char*
+BoolText(bool value)
+{
+	return value ? "true" : "false";
+}
+
+} // namespace
+
+TFormWriter::TFormWriter(TDesignFormView* form)
+	: fForm(form),
+	  fRecord('info'),
+	  fProperties('cprp'),
+	  fEvents('evts')
+{
+}
+
+
+bool
+TFormWriter::Write(const char* path)
+{
+	TPLIMFormFile file;
+	AddFormProperties(&fProperties);
+	AddFormEvents(&fEvents);
+	if (file.SetMessage("_FormProperties", &fProperties) != B_OK)
+		printf("Warning: Unable to save form properties\n");
+	if (file.SetMessage("_FormEvents", &fEvents) != B_OK)
+		printf("Warning: Unable to save form events\n");
+
+	BMessage collection('PCmp');
+	AddComponents(&collection);
+	file.AddMessage("Components", &collection);
+
+	file.SetFilename(path);
+	return file.SaveFile();
+}
+
+
+void
+TFormWriter::AddFormProperties(BMessage* properties)
+{
+	TFormComponent* form = fForm->DesignWindow();
+	for (int32 i = 0; i < form->CountProperties(); i++) {
+		TProperty* property = form->PropertyAt(i);
+		printf("Writing form property %s: %s\n", property->Name(), property->Value());
+		properties->AddString(property->Name(), property->Value());
+	}
+}
+
+
+void
+TFormWriter::AddFormEvents(BMessage* events)
+{
+	TFormComponent* form = fForm->DesignWindow();
+	for (int32 i = 0; i < form->CountEvents(); i++) {
+		TEvent* event = form->EventAt(i);
+		printf("Writing form event %s: %s\n", event->name, BoolText(event->selected));
+		events->AddBool(event->name, event->selected);
+	}
+}
+
+
+void
+TFormWriter::AddComponents(BMessage* collection)
+{
+	for (int32 i = 0; i < fForm->CountComponents(); i++)
+		AddComponent(i, collection);
+}
+
+
+void
+TFormWriter::AddComponent(int32 index, BMessage* collection)
+{
+	TComponent* component = fForm->ComponentAt(index);
+	fRecord.MakeEmpty();
+	fProperties.MakeEmpty();
+	fEvents.MakeEmpty();
+	printf("*** %s info ***\n", component->ComponentName());
+
+	AddPlace(component);
+	AddProperties(component, index);
+	AddEvents(component);
+	component->WriteExtendedComponentDataTo(&fRecord);
+	if (fRecord.AddMessage("Properties", &fProperties) != B_OK)
+		printf("Warning: Unable to add Prop Info to ComponentInfo\n");
+	if (fRecord.AddMessage("Events", &fEvents) != B_OK)
+		printf("Warning: Unable to add Event Info to ComponentInfo\n");
+	if (collection->AddMessage(component->ComponentName(), &fRecord) != B_OK)
+		printf("Warning: Unable to add the component to the collection\n");
+}
+
+
+void
+TFormWriter::AddPlace(TComponent* component)
+{
+	if (fProperties.AddString("_ClassName", component->ClassName()) != B_OK)
+		printf("Warning: Unable to add class name\n");
+
+	if (fForm->LockLooper()) {
+		BView* view = component->DTView();
+		if (view == nullptr || fProperties.AddRect("_Frame", view->Frame()) != B_OK)
+			printf("Warning: Unable to add frame\n");
+		fForm->UnlockLooper();
+	}
+
+	if (component->Owner() == nullptr || fForm->IsForm(component->Owner()))
+		return;
+	TComponent* owner = dynamic_cast<TComponent*>(component->Owner());
+	if (owner == nullptr)
+		return;
+	printf("  Writing Owner name for %s: %s\n", component->ComponentName(), owner->ComponentName());
+	fProperties.AddString("_OwnerName", owner->ComponentName());
+}
+
+
+void
+TFormWriter::AddProperties(TComponent* component, int32 index)
+{
+	// After each property its writer's hook is due, but of the property that stands where the component
+	// stands in the form: files written so far hold what that one adds. Many components have no
+	// property there.
+	TProperty* extended = component->PropertyAt(index);
+
+	printf(">> %s Properties:\n", component->ComponentName());
+	for (int32 i = 0; i < component->CountProperties(); i++) {
+		TProperty* property = component->PropertyAt(i);
+		printf("  %s.%s(%s)\n", component->ComponentName(), property->Name(), property->Value());
+		fProperties.AddString(property->Name(), property->Value());
+		if (extended != nullptr)
+			extended->WriteExtendedData(&fProperties);
+	}
+}
+
+
+void
+TFormWriter::AddEvents(TComponent* component)
+{
+	printf("\n>> %s Events:\n", component->ComponentName());
+	for (int32 i = 0; i < component->CountEvents(); i++) {
+		TEvent* event = component->EventAt(i);
+		printf("  Writing %s.%s(%s)\n", component->ComponentName(), event->name,
+			BoolText(event->selected));
+		fEvents.AddBool(event->name, event->selected);
+	}
+}

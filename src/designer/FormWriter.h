@@ -1,0 +1,36 @@
+// SPDX-License-Identifier: MIT
+// Writing a form's document.
+
+#pragma once
+
+#include <Message.h>
+
+class TComponent;
+class TDesignFormView;
+
+/// Writes one form into its document; used once.
+///
+/// What is written is told line by line on standard output, and so is what could not be added; the
+/// writing then goes on. Locks the form's window for each component's frame.
+class TFormWriter {
+public:
+	explicit TFormWriter(TDesignFormView* form);
+
+	/// Writes the document to \a path; false, with the file as it was, when that fails.
+	bool Write(const char* path);
+
+private:
+	void AddFormProperties(BMessage* properties);
+	void AddFormEvents(BMessage* events);
+	void AddComponents(BMessage* collection);
+	void AddComponent(int32 index, BMessage* collection);
+	void AddPlace(TComponent* component);
+	void AddProperties(TComponent* component, int32 index);
+	void AddEvents(TComponent* component);
+
+	TDesignFormView* fForm;
+	// Scratch messages, emptied for each component.
+	BMessage fRecord;
+	BMessage fProperties;
+	BMessage fEvents;
+};
