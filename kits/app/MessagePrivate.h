@@ -101,11 +101,18 @@ public:
 	ssize_t R5FlattenedSize() const;
 	status_t FlattenR5(char* buffer, ssize_t size) const;
 
+	/// BMessage::HasSameData() of messages that are \a depth levels deep in others.
+	static bool HasSameData(
+		const BMessage& one, const BMessage& other, bool ignoreFieldOrder, bool deep, int32 depth);
+
 	/// The hash of a field's name as the flattened hash table has it.
 	static uint32 HashName(const char* name);
 
 private:
-	friend class BMessage;
+	static Body* ParseHaiku(const uint8* buffer, size_t size, BMessage* header, size_t* used);
+	static Body* ParseR5(const uint8* buffer, size_t size, BMessage* header, size_t* used);
+	uint8 R5Flags() const;
+	uint64 R5DataSize(int32 field) const;
 
 	BMessage* fMessage;
 };

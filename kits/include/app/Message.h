@@ -391,23 +391,31 @@ private:
 	struct Body;
 
 	void InitHeader();
-	void CopyFrom(const BMessage& other);
 	void Clear();
-	void PrintIndented(int32 indent, int32 depth) const;
+	void CopyFrom(const BMessage& other);
+	status_t DeliverReply(const BMessage& reply, const BMessenger* replyTo, BMessage* answer,
+		bigtime_t sendTimeout, bigtime_t replyTimeout);
 
-	Field* FieldAt(const char* name) const;
-	status_t FindField(const char* name, type_code type, Field** field) const;
-	status_t FindItem(const Field& field, int32 index, uint32* offset, uint32* size) const;
-	status_t FindFixed(
-		const char* name, type_code type, int32 index, size_t size, void* value) const;
-	status_t AddField(const char* name, type_code type, bool isFixedSize, Field** field);
-	status_t AddItem(Field* field, const void* data, uint32 size);
-	void RemoveItem(Field* field, uint32 offset, uint32 size);
-	void RemoveField(Field* field);
-	void Unlink(Field* field);
-	void Link(Field* field);
+	void FlattenHeaders(char* buffer) const;
+	void PrintIndented(int32 depth) const;
+
+	int32 CountFields() const;
+	int32 IndexOf(const char* name) const;
+	status_t FindField(const char* name, type_code type, int32* field) const;
+	status_t FindItem(int32 field, int32 index, const uint8** data, uint32* size) const;
+	status_t FindValue(
+		const char* name, type_code type, int32 index, void* value, size_t size) const;
+	bool HasValue(const char* name, type_code type, int32 index, size_t size) const;
+
+	status_t AddField(
+		const char* name, type_code type, bool isFixedSize, const void* data, uint32 size);
+	status_t AddItem(int32 field, const void* data, uint32 size);
+	void RemoveField(int32 field);
+	void Link(int32 field);
+	void Unlink(int32 field);
 	status_t Reserve(uint32 moreFields, uint32 moreData);
-	status_t ResizeData(uint32 offset, uint32 oldSize, uint32 newSize, const Field* within);
+	status_t ResizeBytes(int32 field, uint32 offset, uint32 oldSize, uint32 newSize);
+	bool Owns(const void* bytes) const;
 
 	uint32 fFlags;
 	int32 fTarget;
@@ -417,7 +425,7 @@ private:
 	int32 fReplyTeam;
 	// Set while this very object is a delivery: flags that were read from a file answer nobody.
 	bool fIsLive;
-	// The fields in one block of memory, null while there are none.
+	// The fields in one block of memory; may be null while there are none.
 	Body* fBody;
 	const BMessage* fOriginal;
 };

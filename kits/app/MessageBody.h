@@ -1,0 +1,118 @@
+// SPDX-License-Identifier: MIT
+// How a message keeps its fields in memory, and the layout of the flattened form they come from.
+#ifndef _MESSAGE_BODY_H
+#define _MESSAGE_BODY_H
+
+#include <bit>
+
+#include <Message.h>
+
+// The data block holds numbers exactly as a file does.
+static_assert(std::endian::native == std::endian::little);
+
+inline constexpr uint32 kBucketCount = 5;
+
+/// The most bytes that the names and items of one message can take.
+inline constexpr uint32 kMaxDataSize = 0x7fffffff;
+
+/// Functions that call themselves for nested messages go this deep. A file can nest far deeper.
+inline constexpr int32 kMaxNesting = 64;
+
+
+/// A field: a name and items in the data block, and a link of a hash chain.
+struct BMessage::Field {
+	enum { kValid = 0x1, kFixedSize = 0x2 };
+
+	uint16 flags;
+	uint16 nameLength; // with the terminator
+	uint32 type;
+	uint32 count;
+	uint32 dataSize; // of the items, with the size words of variable items
+	uint32 offset;   // of the name in the data block
+	int32 next;      // the next field of the same chain, or -1
+	uint32 hash;
+
+	bool IsFixedSize() const { return (flags & kFixedSize) != 0; }
+	uint32 ItemsOffset() const { return offset + nameLength; }
+	uint32 EndOffset() const { return offset + nameLength + dataSize; }
+};
+
+
+/// The fields of a message in one block of memory: this header, room for fieldCapacity fields, room
+/// for dataCapacity bytes.
+///
+/// Invariant: the data block holds, per field in the order of the fields and without gaps, the name
+/// with its terminator and the items. So the end of a field is the start of the next.
+struct BMessage::Body {
+	int32 buckets[kBucketCount];
+	uint32 fieldCount;
+	uint32 dataSize;
+	uint32 fieldCapacity;
+	uint32 dataCapacity;
+	// The variable item that was found last, index << 32 | offset of its size word, or 0: a loop over
+	// the items of a field would else walk from the first one each time. Several threads may be
+	// reading, so it is only touched by the two functions below.
+	uint64 cursor;
+
+	/// An empty body with room for that much; null when there is no memory. Freed with free().
+	static Body* Create(uint32 fieldCapacity, uint32 dataCapacity);
+
+	Field* Fields() { return reinterpret_cast<Field*>(this + 1); }
+	uint8* Data() { return reinterpret_cast<uint8*>(Fields() + fieldCapacity); }
+	const char* NameOf(const Field& field)
+	{
+		return reinterpret_cast<const char*>(Data()) + field.offset;
+	}
+
+	uint64 Cursor() { return __atomic_load_n(&cursor, __ATOMIC_RELAXED); }
+	void SetCursor(uint64 position) { __atomic_store_n(&cursor, position, __ATOMIC_RELAXED); }
+};
+
+
+/// The message header of the Haiku format, as it lies in a file.
+struct FlatMessageHeader {
+	uint32 format;
+	uint32 what;
+	uint32 flags;
+	int32 target;
+	int32 currentSpecifier;
+	int32 area;
+	int32 replyPort;
+	int32 replyTarget;
+	int32 replyTeam;
+	uint32 dataSize;
+	uint32 fieldCount;
+	uint32 bucketCount;
+	int32 buckets[kBucketCount];
+};
+static_assert(sizeof(FlatMessageHeader) == 68);
+
+/// A field header of the Haiku format.
+struct FlatFieldHeader {
+	uint16 flags;
+	uint16 nameLength;
+	uint32 type;
+	uint32 count;
+	uint32 dataSize;
+	uint32 offset;
+	int32 next;
+};
+static_assert(sizeof(FlatFieldHeader) == 24);
+
+/// First words of the two formats; R5's is in the byte order of its writer.
+inline constexpr uint32 kHaikuFormat = 0x31464d48;
+inline constexpr uint32 kR5Format = 0x464f4231;
+inline constexpr uint32 kR5SwappedFormat = 0x31424f46;
+
+
+/// A number from bytes at any address.
+template <typename Number>
+inline Number
+ReadNumber(const void* bytes)
+{
+	Number number;
+	__builtin_memcpy(&number, bytes, sizeof(number));
+	return number;
+}
+
+#endif // _MESSAGE_BODY_H
