@@ -6,8 +6,6 @@
 
 #include <dirent.h>
 
-#include <string>
-
 #include <EntryList.h>
 #include <Node.h>
 #include <StorageDefs.h>
@@ -46,7 +44,8 @@ public:
 	bool Contains(const char* path, int32 nodeFlags = B_ANY_NODE) const;
 	bool Contains(const BEntry* entry, int32 nodeFlags = B_ANY_NODE) const;
 
-	/// "." and ".." are left out; the order is the file system's.
+	/// "." and ".." are left out; the order is the file system's. A link that cannot be followed
+	/// stands for itself.
 	status_t GetNextEntry(BEntry* entry, bool traverse = false) override;
 	status_t GetNextRef(entry_ref* ref) override;
 	status_t Rewind() override;
@@ -62,10 +61,9 @@ public:
 	BDirectory& operator=(const BDirectory& dir);
 
 private:
-	status_t Open(const char* path);
+	status_t Open(int folder, const char* path);
 	status_t NextName(const char** name);
 	void CloseListing();
-	status_t ResolveInside(const char* path, std::string* resolved) const;
 
 	DIR* fListing;
 };

@@ -83,6 +83,7 @@ public:
 
 private:
 	status_t SetStat(const struct stat& stat, stat_field field) override;
+	status_t FindPath(std::string* path) const override;
 	status_t Fail(status_t status);
 
 	entry_ref fRef;

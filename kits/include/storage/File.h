@@ -48,7 +48,7 @@ public:
 	BFile& operator=(const BFile& file);
 
 private:
-	status_t Open(const char* path, uint32 openMode);
+	status_t Open(int folder, const char* path, uint32 openMode);
 };
 
 #endif

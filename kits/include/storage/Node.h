@@ -91,20 +91,22 @@ public:
 	bool operator!=(const BNode& node) const;
 
 	/// A duplicate of the descriptor, the caller's to close, or an error.
-	int Dup();
+	int Dup() const;
 
 protected:
+	// Opens the path, which starts at the folder's descriptor (AT_FDCWD: the current directory).
+	int OpenAt(int folder, const char* path) const;
 	// Takes over an open descriptor, or the reason why there is none (a negative status).
 	status_t Adopt(int fdOrError);
 	int Descriptor() const { return fFd; }
-
-	friend class BEntry;
-	friend class BPath;
 
 private:
 	struct AttributeListing;
 
 	status_t SetStat(const struct stat& stat, stat_field field) override;
+	status_t FindPath(std::string* path) const override;
+	// The status for the errno that a failed attribute function left.
+	status_t AttributeError() const;
 
 	int fFd;
 	status_t fStatus;

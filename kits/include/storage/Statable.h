@@ -4,6 +4,8 @@
 #ifndef _STATABLE_H
 #define _STATABLE_H
 
+#include <string>
+
 #include <sys/stat.h>
 #include <sys/types.h>
 
@@ -62,8 +64,8 @@ protected:
 private:
 	// Sets the one field of the node to its value in the given status.
 	virtual status_t SetStat(const struct stat& stat, stat_field field) = 0;
-
-	status_t ChangeStat(stat_field field, struct stat* stat);
+	// Where the node is, as far as it can be told.
+	virtual status_t FindPath(std::string* path) const = 0;
 };
 
 #endif
