@@ -274,7 +274,7 @@ void
 TProject::ReadMainForm()
 {
 	BNode node(fFilename);
-	char name[B_FILE_NAME_LENGTH * 4];
+	char name[1024];
 	const ssize_t length =
 		node.ReadAttr(kMainFormAttribute, B_STRING_TYPE, 0, name, sizeof(name) - 1);
 	if (length <= 0)
