@@ -199,8 +199,6 @@ public:
 	void StoreProperty(const char* name, const char* value);
 
 private:
-	void TakeIn(TComponent* component);
-
 	static const size_t kComponentNameSize = 1024;
 	static const size_t kClassNameSize = 32;
 

@@ -44,8 +44,5 @@ private:
 	static const size_t kShortSize = 24;
 
 	char* fText;
-	union {
-		char fShort[kShortSize];
-		size_t fCapacity; // of the text on the heap
-	};
+	char fShort[kShortSize];
 };

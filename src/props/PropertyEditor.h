@@ -3,7 +3,6 @@
 
 #pragma once
 
-class BString;
 class TComponent;
 class TProperty;
 class TStringList;
@@ -65,8 +64,6 @@ public:
 	void SetProperty(TProperty* property) { fProperty = property; }
 
 private:
-	void ApplyChange(const BString& oldValue, const char* value);
-
 	TComponent* fComponent;
 	TProperty* fProperty;
 	TPropEditType fType;
