@@ -5,6 +5,7 @@
 
 #include <cstring>
 #include <memory>
+#include <string>
 #include <string_view>
 #include <vector>
 
@@ -17,6 +18,7 @@
 
 #include "app/MessageBody.h"
 #include "app/MessagePrivate.h"
+#include "storage/EntryRefFlattening.h"
 
 namespace {
 
@@ -40,48 +42,6 @@ FlattenObject(const BFlattenable* object, status_t* status)
 	std::vector<uint8> bytes(size);
 	*status = object->Flatten(bytes.data(), size);
 	return bytes;
-}
-
-
-/// The fixed part of an entry reference's item; the name with its terminator follows, if it has one.
-struct FlatRef {
-	int32 device;
-	uint32 directory[2];
-};
-
-
-std::vector<uint8>
-FlattenRef(const entry_ref& ref)
-{
-	FlatRef flat;
-	flat.device = int32(ref.device);
-	const uint64 directory = uint64(ref.directory);
-	memcpy(flat.directory, &directory, sizeof(directory));
-
-	const size_t nameSize = ref.name != nullptr ? strlen(ref.name) + 1 : 0;
-	std::vector<uint8> bytes(sizeof(flat) + nameSize);
-	memcpy(bytes.data(), &flat, sizeof(flat));
-	if (nameSize > 0)
-		memcpy(bytes.data() + sizeof(flat), ref.name, nameSize);
-	return bytes;
-}
-
-
-status_t
-UnflattenRef(const uint8* data, size_t size, entry_ref* ref)
-{
-	FlatRef flat;
-	if (size < sizeof(flat))
-		return B_BAD_DATA;
-	if (size > sizeof(flat) && !IsText(data + sizeof(flat), size - sizeof(flat)))
-		return B_BAD_DATA;
-
-	memcpy(&flat, data, sizeof(flat));
-	// Device numbers of the host have no sign; only "none" is negative.
-	ref->device = flat.device == -1 ? dev_t(-1) : dev_t(uint32(flat.device));
-	ref->directory = ino_t(ReadNumber<uint64>(flat.directory));
-	const bool hasName = size > sizeof(flat);
-	return ref->set_name(hasName ? reinterpret_cast<const char*>(data + sizeof(flat)) : nullptr);
 }
 
 } // namespace
@@ -390,7 +350,7 @@ BMessage::AddRef(const char* name, const entry_ref* value)
 {
 	if (value == nullptr)
 		return B_BAD_VALUE;
-	const std::vector<uint8> bytes = FlattenRef(*value);
+	const std::string bytes = BPrivate::flatten_entry_ref(*value);
 	return AddData(name, B_REF_TYPE, bytes.data(), ssize_t(bytes.size()), false);
 }
 
@@ -407,7 +367,7 @@ BMessage::ReplaceRef(const char* name, int32 index, const entry_ref* value)
 {
 	if (value == nullptr)
 		return B_BAD_VALUE;
-	const std::vector<uint8> bytes = FlattenRef(*value);
+	const std::string bytes = BPrivate::flatten_entry_ref(*value);
 	return ReplaceData(name, B_REF_TYPE, index, bytes.data(), ssize_t(bytes.size()));
 }
 
@@ -429,7 +389,7 @@ BMessage::FindRef(const char* name, int32 index, entry_ref* value) const
 	ssize_t size;
 	status_t status = FindData(name, B_REF_TYPE, index, &data, &size);
 	if (status == B_OK)
-		status = UnflattenRef(static_cast<const uint8*>(data), size, value);
+		status = BPrivate::unflatten_entry_ref(data, size_t(size), value);
 	if (status != B_OK)
 		*value = entry_ref();
 	return status;

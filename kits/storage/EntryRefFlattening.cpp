@@ -74,8 +74,10 @@ flatten_entry_ref(const entry_ref& ref)
 status_t
 unflatten_entry_ref(const void* buffer, size_t size, entry_ref* ref)
 {
-	if (buffer == nullptr || ref == nullptr || size < kNumbersSize)
+	if (buffer == nullptr || ref == nullptr)
 		return B_BAD_VALUE;
+	if (size < kNumbersSize)
+		return B_BAD_DATA;
 
 	const char* bytes = (const char*)buffer;
 	uint32 device;
@@ -94,9 +96,9 @@ unflatten_entry_ref(const void* buffer, size_t size, entry_ref* ref)
 	std::string name;
 	std::string folder;
 	if (!TakeText(&bytes, &size, &name))
-		return B_BAD_VALUE;
+		return B_BAD_DATA;
 	if (size > 0 && !TakeText(&bytes, &size, &folder))
-		return B_BAD_VALUE;
+		return B_BAD_DATA;
 
 	RememberIfTrue(folder, hostDevice, (ino_t)directory);
 	*ref = entry_ref(hostDevice, directory, name.c_str());

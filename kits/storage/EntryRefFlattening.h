@@ -17,8 +17,8 @@ namespace BPrivate {
 /// a terminator when it is known, so that another program can find the folder.
 std::string flatten_entry_ref(const entry_ref& ref);
 
-/// B_BAD_VALUE, \a ref unchanged, for bytes that are no reference. The bytes are not trusted: a path
-/// is believed only where device and inode of what it names agree.
+/// B_BAD_DATA, \a ref unchanged, for bytes that are no reference; B_BAD_VALUE for null pointers. The
+/// bytes are not trusted: a path is believed only where device and inode of what it names agree.
 status_t unflatten_entry_ref(const void* buffer, size_t size, entry_ref* ref);
 
 } // namespace BPrivate
