@@ -4,13 +4,14 @@
 #ifndef _APPLICATION_H
 #define _APPLICATION_H
 
+#include <vector>
+
 #include <AppDefs.h>
 #include <InterfaceDefs.h>
 #include <Looper.h>
 #include <Messenger.h>
 
 class BCursor;
-class BList;
 class BMessageRunner;
 class BResources;
 class BWindow;
@@ -73,13 +74,14 @@ public:
 	const char* Signature() const;
 	/// This program's thread, team, file, flags and signature.
 	status_t GetAppInfo(app_info* info) const;
-	/// NULL: programs carry no resources of that form here.
+	/// An empty set: programs carry no resources of that form here.
 	static BResources* AppResources();
 
 	/// Calls Pulse() every \a rate microseconds (multiples of 100000); 0 turns it off.
 	void SetPulseRate(bigtime_t rate);
 
-	/// Makes \a looper one that QuitRequested() asks, as the windows. B_BAD_VALUE when it is none or already so.
+	/// Makes the destructor quit \a looper too, after the windows. B_BAD_VALUE for NULL or a window, B_ERROR when it
+	/// is registered (for the second: is not).
 	status_t RegisterLooper(BLooper* looper);
 	status_t UnregisterLooper(BLooper* looper);
 
@@ -87,16 +89,15 @@ private:
 	void InitData(const char* signature, status_t* error);
 	void QueueStartMessages();
 	void HandleArgv(BMessage* message);
-	bool QuitWindows(bool filePanels, bool force);
-	bool QuitRegisteredLoopers();
-	void QuitAllWindows(bool force);
+	bool QuitAllWindows(bool force);
+	void QuitRegisteredLoopers();
 
 	status_t fInitError;
 	char* fSignature;
 	bool fReadyToRunCalled;
 	bigtime_t fPulseRate;
 	BMessageRunner* fPulseRunner;
-	BList* fRegisteredLoopers;
+	std::vector<BLooper*> fRegisteredLoopers;
 };
 
 /// The application object, NULL when there is none.

@@ -5,6 +5,7 @@
 #define _LOOPER_H
 
 #include <memory>
+#include <vector>
 
 #include <Handler.h>
 #include <Message.h>
@@ -120,24 +121,29 @@ private:
 	virtual void QueueRanEmpty();
 
 	static status_t TaskEntry(void* looper);
-	void Init(BWindow* window, const char* name, int32 priority, int32 portCapacity);
+	void Register(BWindow* window);
 	void RunLoop();
+	void EnterLoop();
 	void DispatchNext(BMessage* message);
 	BHandler* FilterMessage(BMessage* message, BHandler* target);
-	BHandler* RunFilters(BList* filters, BMessage* message, BHandler* target);
+	BHandler* RunFilters(bool common, BMessage* message, BHandler* target);
 	void HandleQuitRequest(BMessage* message);
 	[[noreturn]] void DeleteAndLeave();
 
 	std::shared_ptr<BPrivate::LooperPort> fPort;
 	BMessageQueue* fQueue;
 	BMessage* fLastMessage;
-	BList* fHandlers;
+	std::vector<BHandler*> fHandlers;
 	BHandler* fPreferred;
 	BList* fCommonFilters;
 	int32 fPriority;
 	int32 fPortCapacity;
 	bool fRunCalled;
+	// Loop() rather than Run(): there is no thread to wait for.
+	bool fLoopsInCaller;
 	bool fTerminating;
+	// Its creator deletes it after the loop; the loop itself never does (the application).
+	bool fOutlivesLoop;
 };
 
 #endif // _LOOPER_H

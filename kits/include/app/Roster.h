@@ -80,6 +80,7 @@ public:
 		BMessenger target, uint32 eventMask = B_REQUEST_LAUNCHED | B_REQUEST_QUIT) const;
 	status_t StopWatching(BMessenger target) const;
 
+	/// B_NOT_SUPPORTED for this program: activate a window instead. B_BAD_TEAM_ID for others.
 	status_t ActivateApp(team_id team) const;
 
 	/// Starts a program, or hands the message or arguments to this one when it is the one asked for and not
