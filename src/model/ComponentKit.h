@@ -16,6 +16,7 @@
 #include "model/PropertyStore.h"
 #include "model/ViewComponent.h"
 #include "model/VisualComponent.h"
+#include "palette/PaletteEntry.h"
 #include "props/FlagsProperty.h"
 #include "props/PickListProperty.h"
 #include "props/PropertyEditor.h"
