@@ -1,0 +1,188 @@
+// SPDX-License-Identifier: MIT
+// A view on a form that calls the form's event handlers.
+
+#pragma once
+
+#include <utility>
+
+#include <View.h>
+
+/// What a form knows of its components.
+class TFormPart {
+public:
+	/// The form is shown for the first time: the part was attached before it had handlers.
+	virtual void FormAttached() = 0;
+	virtual void FormAllAttached() = 0;
+
+protected:
+	~TFormPart() = default;
+};
+
+/// A \a View whose events call member functions of the form of class \a Form.
+///
+/// An event is a pointer to such a member, null when the form has no handler for it. Handlers run in the
+/// window's thread with the window locked, after what the view itself does.
+template <class Form, class View>
+class TPart : public View, public TFormPart {
+public:
+	typedef void (Form::*Event)();
+
+	Event OnAllAttached = nullptr;
+	Event OnAttachedToWindow = nullptr;
+	Event OnAllDetached = nullptr;
+	void (Form::*OnDraw)(BRect updateRect) = nullptr;
+	void (Form::*OnFrameMoved)(BPoint parentPoint) = nullptr;
+	void (Form::*OnFrameResized)(float width, float height) = nullptr;
+	Event OnKeyDown = nullptr;
+	Event OnKeyUp = nullptr;
+	Event OnGotFocus = nullptr;
+	Event OnLostFocus = nullptr;
+	void (Form::*OnMouseUp)(BPoint point) = nullptr;
+	void (Form::*OnMouseDown)(BPoint point) = nullptr;
+	void (Form::*OnMouseMoved)(BPoint point, uint32 transit, const BMessage* message) = nullptr;
+
+	/// \a form: the form that the part lies on; it outlives the part. The other arguments are those of
+	/// \a View's constructor.
+	template <class... Arguments>
+	explicit TPart(Form* form, Arguments&&... arguments)
+		: View(std::forward<Arguments>(arguments)...),
+		  fForm(form)
+	{
+	}
+
+	Form* ParentForm() const { return fForm; }
+
+	/// Shows or hides the part; calls with the present state do nothing.
+	void SetVisible(bool visible)
+	{
+		if (visible == !this->IsHidden(this))
+			return;
+		if (visible)
+			this->Show();
+		else
+			this->Hide();
+	}
+
+	void FormAttached() override { Call(OnAttachedToWindow); }
+	void FormAllAttached() override { Call(OnAllAttached); }
+
+	void AllAttached() override
+	{
+		View::AllAttached();
+		Call(OnAllAttached);
+	}
+
+	void AttachedToWindow() override
+	{
+		View::AttachedToWindow();
+		Call(OnAttachedToWindow);
+	}
+
+	void AllDetached() override
+	{
+		View::AllDetached();
+		Call(OnAllDetached);
+	}
+
+	void Draw(BRect updateRect) override
+	{
+		View::Draw(updateRect);
+		Call(OnDraw, updateRect);
+	}
+
+	void FrameMoved(BPoint parentPoint) override
+	{
+		View::FrameMoved(parentPoint);
+		Call(OnFrameMoved, parentPoint);
+	}
+
+	void FrameResized(float width, float height) override
+	{
+		View::FrameResized(width, height);
+		Call(OnFrameResized, width, height);
+	}
+
+	void KeyDown(const char* bytes, int32 numBytes) override
+	{
+		View::KeyDown(bytes, numBytes);
+		Call(OnKeyDown);
+	}
+
+	void KeyUp(const char* bytes, int32 numBytes) override
+	{
+		View::KeyUp(bytes, numBytes);
+		Call(OnKeyUp);
+	}
+
+	void MakeFocus(bool focus = true) override
+	{
+		const bool hadFocus = this->IsFocus();
+		View::MakeFocus(focus);
+		if (this->IsFocus() != hadFocus)
+			Call(hadFocus ? OnLostFocus : OnGotFocus);
+	}
+
+	void MouseUp(BPoint point) override
+	{
+		View::MouseUp(point);
+		Call(OnMouseUp, point);
+	}
+
+	void MouseDown(BPoint point) override
+	{
+		View::MouseDown(point);
+		Call(OnMouseDown, point);
+	}
+
+	void MouseMoved(BPoint point, uint32 transit, const BMessage* message) override
+	{
+		View::MouseMoved(point, transit, message);
+		Call(OnMouseMoved, point, transit, message);
+	}
+
+protected:
+	/// Calls the handler of an event, if the form is open and has one.
+	template <class... Parameters, class... Arguments>
+	void Call(void (Form::*handler)(Parameters...), Arguments... arguments)
+	{
+		if (handler != nullptr && fForm->IsOpen())
+			(fForm->*handler)(arguments...);
+	}
+
+private:
+	Form* fForm;
+};
+
+/// A part that is no control, with an event for a press and release of the mouse inside it.
+template <class Form, class View>
+class TClickPart : public TPart<Form, View> {
+public:
+	typename TPart<Form, View>::Event OnClick = nullptr;
+
+	using TPart<Form, View>::TPart;
+
+	void MouseDown(BPoint point) override
+	{
+		TPart<Form, View>::MouseDown(point);
+		fPressed = true;
+	}
+
+	void MouseUp(BPoint point) override
+	{
+		TPart<Form, View>::MouseUp(point);
+		if (fPressed && this->Bounds().Contains(point))
+			this->Call(OnClick);
+		fPressed = false;
+	}
+
+	void MouseMoved(BPoint point, uint32 transit, const BMessage* message) override
+	{
+		TPart<Form, View>::MouseMoved(point, transit, message);
+		// The button may be released where no message tells of it.
+		if (transit == B_EXITED_VIEW)
+			fPressed = false;
+	}
+
+private:
+	bool fPressed = false;
+};
