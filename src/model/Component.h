@@ -199,6 +199,8 @@ public:
 	void StoreProperty(const char* name, const char* value);
 
 private:
+	void TakeIn(TComponent* component);
+
 	static const size_t kComponentNameSize = 1024;
 	static const size_t kClassNameSize = 32;
 

@@ -30,7 +30,9 @@ public:
 	TProperty(const TProperty& other);
 	TProperty& operator=(const TProperty&) = delete;
 
-	/// Deleting through the base class must not tell the allocator the base's size.
+	/// The class's own pair, so that deleting a derived property through this class does not tell the
+	/// allocator the size of this one.
+	static void* operator new(size_t size);
 	static void operator delete(void* memory);
 
 	virtual TComponent* Owner() const;

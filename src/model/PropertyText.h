@@ -44,5 +44,8 @@ private:
 	static const size_t kShortSize = 24;
 
 	char* fText;
-	char fShort[kShortSize];
+	union {
+		char fShort[kShortSize];
+		size_t fCapacity; // of the text on the heap
+	};
 };

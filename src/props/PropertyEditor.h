@@ -3,6 +3,7 @@
 
 #pragma once
 
+class BString;
 class TComponent;
 class TProperty;
 class TStringList;
@@ -64,6 +65,8 @@ public:
 	void SetProperty(TProperty* property) { fProperty = property; }
 
 private:
+	void ApplyChange(const BString& oldValue, const char* value);
+
 	TComponent* fComponent;
 	TProperty* fProperty;
 	TPropEditType fType;

@@ -1,0 +1,603 @@
+// SPDX-License-Identifier: MIT
+// The base of everything that can be designed: names, owners, properties and events. What concerns the
+// view and the mouse is in ComponentDesign.cpp.
+
+#include "model/Component.h"
+
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+#include <cxxabi.h>
+#include <string_view>
+#include <typeinfo>
+#include <unordered_set>
+
+#include <String.h>
+
+#include "model/ComponentOwner.h"
+#include "model/Diagnostics.h"
+#include "model/Event.h"
+#include "model/Property.h"
+#include "model/PropertyStore.h"
+#include "model/PropertyTable.h"
+#include "props/PropertyEditor.h"
+#include "props/StringProperty.h"
+
+/// The step by which the lists grow, in entries.
+static const int32 kListStep = 20;
+
+/// The working buffer for new names, in bytes.
+static const int kNewNameSize = 80;
+
+
+/// Copies as much of \a text as fits; null is ignored. The text may be a part of the buffer.
+static void
+CopyText(char* buffer, size_t size, const char* text)
+{
+	if (text == nullptr)
+		return;
+	const size_t length = strnlen(text, size - 1);
+	memmove(buffer, text, length);
+	buffer[length] = '\0';
+}
+
+
+static void
+DeleteProperty(TProperty* property)
+{
+	// The class has no virtual destructor, on purpose: it would take a slot of the binary interface.
+#pragma GCC diagnostic push
+#pragma GCC diagnostic ignored "-Wdelete-non-virtual-dtor"
+	delete property;
+#pragma GCC diagnostic pop
+}
+
+
+TComponent::TComponent(TComponentOwner* owner, TFormDesigner* designer, TComponentType type)
+	: fComponentName(),
+	  fClassName(),
+	  fOwner(owner),
+	  fDesigner(designer),
+	  fComponentType(type),
+	  fProperties(new BList(kListStep)),
+	  fEvents(new BList(kListStep)),
+	  fComponentMode(CM_DESIGN),
+	  fModified(false),
+	  fPropertyStore(new TPropertyStore(this)),
+	  fDesignerSelected(false),
+	  fDTView(nullptr)
+{
+}
+
+
+TComponent::~TComponent()
+{
+	// Not the overrides of derived classes: those are gone.
+	TComponent::ClearProperties(true);
+	delete fProperties;
+	TComponent::ClearEvents(true);
+	delete fEvents;
+	delete fPropertyStore;
+}
+
+
+void
+TComponent::SetComponentName(const char* name)
+{
+	CopyText(fComponentName, sizeof(fComponentName), name);
+}
+
+
+const char*
+TComponent::ComponentName() const
+{
+	return fComponentName;
+}
+
+
+void
+TComponent::SetComponentType(TComponentType type)
+{
+	fComponentType = type;
+}
+
+
+TComponentType
+TComponent::ComponentType() const
+{
+	return fComponentType;
+}
+
+
+void
+TComponent::SetOwner(TComponentOwner* owner)
+{
+	fOwner = owner;
+}
+
+
+TComponentOwner*
+TComponent::Owner() const
+{
+	return fOwner;
+}
+
+
+void
+TComponent::SetComponentMode(TComponentMode mode)
+{
+	fComponentMode = mode;
+}
+
+
+TComponentMode
+TComponent::ComponentMode() const
+{
+	return fComponentMode;
+}
+
+
+void
+TComponent::SetDesigner(TFormDesigner* designer)
+{
+	fDesigner = designer;
+}
+
+
+TFormDesigner*
+TComponent::Designer() const
+{
+	return fDesigner;
+}
+
+
+void
+TComponent::DesignerSelect(bool selected)
+{
+	fDesignerSelected = selected;
+}
+
+
+bool
+TComponent::IsDesignerSelected() const
+{
+	return fDesignerSelected;
+}
+
+
+void
+TComponent::SetModified(bool modified)
+{
+	fModified = modified;
+}
+
+
+bool
+TComponent::Modified() const
+{
+	return fModified;
+}
+
+
+bool
+TComponent::PropertyModified(const char*, const char*, const char*)
+{
+	return true;
+}
+
+
+void
+TComponent::AddComponentContextMenuItems(BPopUpMenu*)
+{
+}
+
+
+bool
+TComponent::HandleComponentContextMessage(BMessage*)
+{
+	return false;
+}
+
+
+void
+TComponent::SelectedInFormDesigner()
+{
+}
+
+
+void
+TComponent::InvokedInFormDesigner()
+{
+}
+
+
+void
+TComponent::PopupMenuInvokedInFormDesigner(BPopUpMenu*)
+{
+}
+
+
+void
+TComponent::MenuItemSelectedInFormDesigner(BMenuItem*)
+{
+}
+
+
+void
+TComponent::DeletedFromFormDesigner()
+{
+}
+
+
+void
+TComponent::AddedToPalette()
+{
+}
+
+
+void
+TComponent::PopupMenuInvokedInPalette(BPopUpMenu*)
+{
+}
+
+
+void
+TComponent::MenuItemSelectedInPalette(BMenuItem*)
+{
+}
+
+
+void
+TComponent::DeletedFromPalette()
+{
+}
+
+
+const char*
+TComponent::GetPropertyValue(const char* name)
+{
+	printf("TComponent::GetPropertyValue('%s')\n", ShownText(name));
+	if (name == nullptr)
+		return nullptr;
+	if (strcmp(name, "Name") == 0)
+		return ComponentName();
+
+	const char* value;
+	return fPropertyStore->FindString(name, &value) == B_OK ? value : nullptr;
+}
+
+
+void
+TComponent::SetPropertyValue(const char* name, const char* value)
+{
+	printf("TComponent::SetPropertyValue('%s', '%s')\n", ShownText(name), ShownText(value));
+	if (name == nullptr || value == nullptr)
+		return;
+	if (strcmp(name, "Name") == 0)
+		SetComponentName(value);
+	StoreProperty(name, value);
+}
+
+
+bool
+TComponent::EventSelection(const char* name)
+{
+	const TEvent* event = FindEvent(name);
+	return event != nullptr && event->selected;
+}
+
+
+void
+TComponent::SetEventSelection(const char* name, bool selected)
+{
+	TEvent* event = FindEvent(name);
+	if (event != nullptr)
+		event->selected = selected;
+}
+
+
+void
+TComponent::InitPropertyList()
+{
+	fPropertyStore->MakeEmpty();
+	ClearProperties(true);
+
+	TProperty* name = new TProperty(this, "Name", ComponentName(), nullptr, false);
+	AddPropAndEditor(name, new TNameProperty(this, name), nullptr, nullptr, true);
+}
+
+
+void
+TComponent::InitEventList()
+{
+	ClearEvents(true);
+}
+
+
+void
+TComponent::InitPropertyValues()
+{
+	for (int32 i = 0; i < CountProperties(); i++) {
+		const TProperty* property = PropertyAt(i);
+		if (property == nullptr || property->Editor() == nullptr)
+			continue;
+		property->Editor()->SetValue(GetPropertyValue(property->Name()), true);
+	}
+}
+
+
+void
+TComponent::InitEventValues()
+{
+}
+
+
+void
+TComponent::WriteExtendedComponentDataTo(BMessage*)
+{
+}
+
+
+void
+TComponent::ReadExtendedComponentDataFrom(const BMessage*)
+{
+}
+
+
+const char*
+TComponent::HeaderFile()
+{
+	return nullptr;
+}
+
+
+bool
+TComponent::OnGenConstructorCall(BString&)
+{
+	return false;
+}
+
+
+void
+TComponent::OnSetConstructorParams(BString&)
+{
+}
+
+
+bool
+TComponent::OnGenHeaderFileTop(BString&)
+{
+	return false;
+}
+
+
+bool
+TComponent::OnGenInitForm(BString&)
+{
+	return false;
+}
+
+
+bool
+TComponent::OnGenDestroyForm(BString&)
+{
+	return false;
+}
+
+
+void
+TComponent::AddProperty(TProperty* property)
+{
+	fProperties->AddItem(property);
+}
+
+
+void
+TComponent::AddPropAndEditor(TProperty* property, TPropertyEditor* editor, const char* setStatement,
+	const char* getStatement, bool quoted)
+{
+	if (property != nullptr && editor != nullptr) {
+		property->SetEditor(editor);
+		editor->SetProperty(property);
+		property->SetSetStatement(setStatement);
+		property->SetGetStatement(getStatement);
+		property->SetQuoted(quoted);
+	}
+	AddProperty(property);
+}
+
+
+bool
+TComponent::RemoveProperty(TProperty* property)
+{
+	return fProperties->RemoveItem(property);
+}
+
+
+TProperty*
+TComponent::RemoveProperty(int32 index)
+{
+	return static_cast<TProperty*>(fProperties->RemoveItem(index));
+}
+
+
+void
+TComponent::ClearProperties(bool deleteProperties)
+{
+	for (int32 i = 0; deleteProperties && PropertyAt(i) != nullptr; i++)
+		DeleteProperty(PropertyAt(i));
+	fProperties->MakeEmpty();
+}
+
+
+void
+TComponent::AddEvent(TEvent* event)
+{
+	fEvents->AddItem(event);
+}
+
+
+bool
+TComponent::RemoveEvent(TEvent* event)
+{
+	return fEvents->RemoveItem(event);
+}
+
+
+TEvent*
+TComponent::RemoveEvent(int32 index)
+{
+	return static_cast<TEvent*>(fEvents->RemoveItem(index));
+}
+
+
+void
+TComponent::ClearEvents(bool deleteEvents)
+{
+	for (int32 i = 0; deleteEvents && EventAt(i) != nullptr; i++)
+		delete EventAt(i);
+	fEvents->MakeEmpty();
+}
+
+
+void
+TComponent::SetClassName(const char* name)
+{
+	CopyText(fClassName, sizeof(fClassName), name);
+}
+
+
+int32
+TComponent::CountProperties() const
+{
+	return fProperties->CountItems();
+}
+
+
+TProperty*
+TComponent::PropertyAt(int32 index) const
+{
+	return static_cast<TProperty*>(fProperties->ItemAt(index));
+}
+
+
+TProperty*
+TComponent::FindProperty(const char* name) const
+{
+	if (name == nullptr)
+		return nullptr;
+	for (int32 i = 0; i < CountProperties(); i++) {
+		TProperty* property = PropertyAt(i);
+		if (property != nullptr && strcmp(property->Name(), name) == 0)
+			return property;
+	}
+	return nullptr;
+}
+
+
+int32
+TComponent::CountEvents() const
+{
+	return fEvents->CountItems();
+}
+
+
+TEvent*
+TComponent::EventAt(int32 index) const
+{
+	return static_cast<TEvent*>(fEvents->ItemAt(index));
+}
+
+
+TEvent*
+TComponent::FindEvent(const char* name) const
+{
+	if (name == nullptr)
+		return nullptr;
+	for (int32 i = 0; i < CountEvents(); i++) {
+		TEvent* event = EventAt(i);
+		if (event != nullptr && event->name != nullptr && strcmp(event->name, name) == 0)
+			return event;
+	}
+	return nullptr;
+}
+
+
+void
+TComponent::StoreProperty(const char* name, const char* value)
+{
+	if (name == nullptr || value == nullptr)
+		return;
+
+	TProperty* property = FindProperty(name);
+	if (property == nullptr) {
+		fPropertyStore->SetString(name, value);
+		return;
+	}
+
+	// Compared as far as the property can hold it: the rest of a longer text is no change.
+	if (strncmp(property->Value(), value, TPropertyText::kSize - 1) != 0) {
+		if (!PropertyModified(name, property->Value(), value))
+			return;
+		// The owner's refusal does not keep the value out.
+		if (Owner() == nullptr
+			|| Owner()->ComponentPropertyModified(this, name, property->Value(), value))
+			SetModified(true);
+	}
+	property->SetValue(value);
+	fPropertyStore->SetString(name, property->Value());
+}
+
+
+bool
+GetNewComponentName(
+	const TComponent* component, const TComponentOwner* owner, char* buffer, int32 size)
+{
+	if (component == nullptr || buffer == nullptr || size <= 0)
+		return false;
+
+	std::unordered_set<std::string_view> taken;
+	for (int32 i = 0; owner != nullptr && i < owner->CountComponents(); i++) {
+		const TComponent* other = owner->ComponentAt(i);
+		if (other != nullptr)
+			taken.insert(other->ComponentName());
+	}
+
+	char name[kNewNameSize];
+	for (int32 number = 1;; number++) {
+		// A long stem gives way to the number, which alone makes the name a new one.
+		const int digits = snprintf(nullptr, 0, "%d", static_cast<int>(number));
+		const int stemSize = kNewNameSize - 1 - digits;
+		printf("before\n");
+		snprintf(name, sizeof(name), "%.*s%d", stemSize, component->ComponentName(),
+			static_cast<int>(number));
+		printf("after\n");
+		if (taken.count(name) == 0)
+			break;
+	}
+	snprintf(buffer, size, "%s", name);
+	return true;
+}
+
+
+BString
+ClassTypeName(const TComponent* component)
+{
+	if (component == nullptr)
+		return BString();
+
+	const char* mangled = typeid(*component).name();
+	int status;
+	char* whole = abi::__cxa_demangle(mangled, nullptr, nullptr, &status);
+	BString name(whole != nullptr ? whole : mangled);
+	free(whole);
+
+	// Scopes go, but not those of a template's arguments.
+	int32 templateStart = name.FindFirst("<");
+	if (templateStart < 0)
+		templateStart = name.Length();
+	const int32 scopeEnd = name.FindLast("::", templateStart);
+	if (scopeEnd >= 0)
+		name.Remove(0, scopeEnd + 2);
+	return name;
+}

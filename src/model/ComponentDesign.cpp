@@ -1,0 +1,158 @@
+// SPDX-License-Identifier: MIT
+// What a component does on the design surface: moving, resizing, taking in another component.
+
+#include "model/Component.h"
+
+#include <cstdio>
+
+#include <Message.h>
+#include <String.h>
+#include <View.h>
+#include <Window.h>
+
+#include "model/ComponentOwner.h"
+#include "model/DesignMessages.h"
+#include "model/FormDesigner.h"
+#include "model/ViewLock.h"
+
+
+static bool
+IsInside(const BView* view, const BView* ancestor)
+{
+	while (view != nullptr && view != ancestor)
+		view = view->Parent();
+	return view != nullptr;
+}
+
+
+/// Posts a copy of a design message to the view beneath \a view, which may be none.
+static void
+PassToParent(BMessage* message, const BView* view)
+{
+	BView* parent = view != nullptr ? view->Parent() : nullptr;
+	if (parent == nullptr || parent->Window() == nullptr)
+		return;
+	BMessage copy(*message);
+	parent->Window()->PostMessage(&copy, parent);
+}
+
+
+bool
+TComponent::DefaultEditAction(BPoint)
+{
+	return false;
+}
+
+
+bool
+TComponent::CanDropOnDesignerAt(BPoint)
+{
+	return true;
+}
+
+
+void
+TComponent::DroppedOnFormDesigner(BRect)
+{
+}
+
+
+void
+TComponent::MoveComponentTo(BView* view, BPoint point)
+{
+	if (view != nullptr)
+		view->MoveTo(point);
+}
+
+
+void
+TComponent::MoveComponentTo(BPoint point)
+{
+	TViewLock lock(fDTView);
+	if (lock.IsLocked())
+		MoveComponentTo(fDTView, point);
+}
+
+
+void
+TComponent::ResizeComponentTo(BView* view, BRect frame)
+{
+	if (view != nullptr)
+		view->ResizeTo(frame.Width(), frame.Height());
+}
+
+
+void
+TComponent::ResizeComponentTo(BRect frame)
+{
+	ResizeComponentTo(fDTView, frame);
+}
+
+
+bool
+TComponent::HandleComponentDesignMessage(BMessage* message)
+{
+	if (message == nullptr || message->what != DTM_COMPONENT_MOVE)
+		return false;
+	void* pointer;
+	if (message->FindPointer("component", &pointer) != B_OK || pointer == nullptr)
+		return false;
+
+	TComponent* dragged = static_cast<TComponent*>(pointer);
+	if (dragged == this) {
+		printf("%s selected\n", ClassTypeName(this).String());
+		PassToParent(message, fDTView);
+		return false;
+	}
+
+	BView* view = dragged->DTView();
+	if (fDTView == nullptr || view == nullptr)
+		return false;
+
+	BPoint corner;
+	if (FindDroppedCorner(message, fDTView, &corner)) {
+		// What holds this component cannot go into it; the drop is for the view beneath.
+		if (IsInside(fDTView, view)) {
+			PassToParent(message, fDTView);
+			return false;
+		}
+		TakeIn(dragged);
+		dragged->MoveComponentTo(corner);
+	}
+
+	BPoint leftTop;
+	{
+		TViewLock lock(view);
+		leftTop = view->Frame().LeftTop();
+	}
+	if (Designer() != nullptr)
+		Designer()->ComponentMoved(dragged, leftTop);
+	return true;
+}
+
+
+void
+TComponent::TakeIn(TComponent* component)
+{
+	BView* view = component->DTView();
+	if (view->Parent() == fDTView)
+		return;
+
+	printf("%s Adding child from other parent\n", ClassTypeName(this).String());
+	TComponentOwner* newOwner = dynamic_cast<TComponentOwner*>(this);
+	if (newOwner != nullptr) {
+		// The designer lists every component of the form, containers list their direct children.
+		TComponentOwner* oldOwner = component->Owner();
+		TFormDesigner* designer = component->Designer();
+		if (oldOwner != nullptr && (designer == nullptr || !designer->IsForm(oldOwner)))
+			oldOwner->RemoveComponent(component);
+		newOwner->AddComponent(component);
+	}
+
+	{
+		TViewLock lock(view);
+		view->RemoveSelf();
+	}
+	TViewLock lock(fDTView);
+	fDTView->AddChild(view);
+}

@@ -1,0 +1,112 @@
+// SPDX-License-Identifier: MIT
+// The base of the components for controls.
+
+#include "model/ControlComponent.h"
+
+#include <cstdio>
+#include <cstring>
+
+#include <Control.h>
+#include <String.h>
+
+#include "model/ColorText.h"
+#include "model/Diagnostics.h"
+#include "model/PropertyStore.h"
+#include "model/PropertyTable.h"
+#include "model/ViewLock.h"
+#include "props/PickListProperty.h"
+#include "props/StringProperty.h"
+
+/// What a property is before a value has been stored.
+static const struct {
+	const char* name;
+	const char* value;
+} kFallbacks[] = {
+	{"ResizingMode", "B_FOLLOW_NONE"},
+	{"Enabled", "true"},
+	{"Flags", "B_WILL_DRAW|B_NAVIGABLE"},
+};
+
+
+TControlComponent::TControlComponent(
+	TComponentOwner* owner, TFormDesigner* designer, TComponentType)
+	: TViewComponent(owner, designer)
+{
+}
+
+
+void
+TControlComponent::InitPropertyList()
+{
+	TViewComponent::InitPropertyList();
+	AddEditedProperty<TBoolProperty>(this, "Enabled", "true", Generation::kPlain);
+	AddEditedProperty<TStringProperty>(this, "Label", "", Generation::kQuoted);
+	AddEditedProperty<TResizingModeProperty>(
+		this, "ResizingMode", "B_FOLLOW_NONE", Generation::kPlain);
+}
+
+
+const char*
+TControlComponent::GetPropertyValue(const char* name)
+{
+	printf("TControlComponent::GetPropertyValue('%s')\n", ShownText(name));
+	if (name == nullptr)
+		return TViewComponent::GetPropertyValue(name);
+
+	for (const auto& fallback : kFallbacks) {
+		if (strcmp(name, fallback.name) == 0) {
+			const char* value;
+			return PropertyStore()->FindString(name, &value) == B_OK ? value : fallback.value;
+		}
+	}
+
+	const BControl* control = dynamic_cast<const BControl*>(DTView());
+	if (strcmp(name, "Label") == 0 && control != nullptr)
+		return control->Label();
+	return TViewComponent::GetPropertyValue(name);
+}
+
+
+void
+TControlComponent::SetPropertyValue(const char* name, const char* value)
+{
+	printf("TControlComponent::SetPropertyValue('%s', '%s')\n", ShownText(name), ShownText(value));
+	if (name == nullptr || value == nullptr)
+		return;
+
+	if (strcmp(name, "Label") != 0 && strcmp(name, "Enabled") != 0
+		&& strcmp(name, "ViewColor") != 0) {
+		TViewComponent::SetPropertyValue(name, value);
+		return;
+	}
+	ApplyToControl(name, value);
+	StoreProperty(name, value);
+}
+
+
+void
+TControlComponent::ApplyToControl(const char* name, const char* value)
+{
+	TViewLock lock(DTView());
+	if (!lock.IsLocked()) {
+		printf("Warning: %s::DTView() not set\n", ClassTypeName(this).String());
+		return;
+	}
+
+	if (strcmp(name, "ViewColor") == 0) {
+		rgb_color color = DTView()->ViewColor();
+		DTView()->SetViewColor(StrToRGBColor(value, &color));
+		DTView()->Invalidate();
+		return;
+	}
+
+	BControl* control = dynamic_cast<BControl*>(DTView());
+	if (control == nullptr)
+		return;
+	if (strcmp(name, "Label") == 0) {
+		control->SetLabel(value);
+		return;
+	}
+	control->SetEnabled(strcmp(value, "true") == 0);
+	control->Invalidate();
+}

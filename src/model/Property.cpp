@@ -1,0 +1,150 @@
+// SPDX-License-Identifier: MIT
+// One named property of a component.
+
+#include "model/Property.h"
+
+#include <cstdio>
+#include <cstring>
+#include <new>
+
+#include <String.h>
+
+#include "model/Component.h"
+
+/// The longest set statement, in bytes.
+static const int32 kMaxSetStatement = 1103;
+
+
+static const char*
+NameOf(const TComponent* component)
+{
+	return component != nullptr ? component->ComponentName() : "";
+}
+
+
+TProperty::TProperty(TComponent* component, const char* name, const char* value,
+	TPropertyEditor* editor, bool generated)
+	: fComponent(component),
+	  fEditor(editor),
+	  fQuoted(false),
+	  fGenerated(generated)
+{
+	snprintf(fName, sizeof(fName), "%s", name != nullptr ? name : "");
+	fValue.SetTo(value);
+	fDefValue.SetTo(value);
+}
+
+
+TProperty::TProperty(const TProperty& other)
+	: fComponent(other.fComponent),
+	  fEditor(other.fEditor),
+	  fQuoted(other.fQuoted),
+	  fGenerated(other.fGenerated)
+{
+	memcpy(fName, other.fName, sizeof(fName));
+	fValue.Fill(other.fValue.Text());
+	fDefValue.SetTo(other.fDefValue.Text());
+	fSetStatement.SetTo(other.fSetStatement.Text());
+	fGetStatement.SetTo(other.fGetStatement.Text());
+}
+
+
+void*
+TProperty::operator new(size_t size)
+{
+	return ::operator new(size);
+}
+
+
+void
+TProperty::operator delete(void* memory)
+{
+	::operator delete(memory);
+}
+
+
+TComponent*
+TProperty::Owner() const
+{
+	return fComponent;
+}
+
+
+const char*
+TProperty::Name() const
+{
+	return fName;
+}
+
+
+TPropertyEditor*
+TProperty::Editor() const
+{
+	return fEditor;
+}
+
+
+void
+TProperty::SetEditor(TPropertyEditor* editor)
+{
+	fEditor = editor;
+}
+
+
+void
+TProperty::SetSetStatement(const char* statement)
+{
+	fSetStatement.SetTo(statement);
+}
+
+
+BString
+TProperty::SetStatement() const
+{
+	if (!fSetStatement.IsEmpty())
+		return BString(fSetStatement.Text());
+
+	const char* quote = fQuoted ? "\"" : "";
+	BString statement;
+	statement << NameOf(fComponent) << "->Set" << Name() << "(" << quote << Value() << quote
+			  << ");";
+	return statement.Truncate(kMaxSetStatement);
+}
+
+
+void
+TProperty::SetGetStatement(const char* statement)
+{
+	fGetStatement.SetTo(statement);
+}
+
+
+BString
+TProperty::GetStatement() const
+{
+	if (!fGetStatement.IsEmpty())
+		return BString(fGetStatement.Text());
+
+	BString statement;
+	statement << NameOf(fComponent) << "->" << Name() << "()";
+	return statement;
+}
+
+
+void
+TProperty::WriteExtendedData(BMessage*) const
+{
+}
+
+
+void
+TProperty::ReadExtendedData(const BMessage*)
+{
+}
+
+
+bool
+TProperty::IsDefValue() const
+{
+	return strcmp(Value(), DefValue()) == 0;
+}

@@ -1,0 +1,129 @@
+// SPDX-License-Identifier: MIT
+// How the property window edits one property.
+
+#include "props/PropertyEditor.h"
+
+#include <cstring>
+
+#include <String.h>
+
+#include "model/Component.h"
+#include "model/ComponentOwner.h"
+#include "model/Property.h"
+
+
+TPropertyEditor::TPropertyEditor(TComponent* component, TProperty* property, TPropEditType type)
+	: fComponent(component),
+	  fProperty(property),
+	  fType(type)
+{
+}
+
+
+TPropertyEditor::~TPropertyEditor() {}
+
+
+void
+TPropertyEditor::Activate()
+{
+}
+
+
+bool
+TPropertyEditor::ModalEdit()
+{
+	return false;
+}
+
+
+void
+TPropertyEditor::Modified()
+{
+}
+
+
+void
+TPropertyEditor::Initialize()
+{
+}
+
+
+long
+TPropertyEditor::EditLimit()
+{
+	return 1024;
+}
+
+
+void
+TPropertyEditor::SetValue(const char* value, bool notify)
+{
+	if (fProperty == nullptr)
+		return;
+	if (fComponent == nullptr) {
+		fProperty->FillValue(value);
+		return;
+	}
+	if (!fComponent->PropertyModified(fProperty->Name(), fProperty->Value(), value))
+		return;
+
+	if (value == nullptr || strncmp(fProperty->Value(), value, TPropertyText::kSize) == 0) {
+		if (notify)
+			fComponent->SetPropertyValue(fProperty->Name(), value);
+		return;
+	}
+
+	const BString oldValue(fProperty->Value());
+	fProperty->FillValue(value);
+	if (notify)
+		ApplyChange(oldValue, value);
+}
+
+
+void
+TPropertyEditor::ApplyChange(const BString& oldValue, const char* value)
+{
+	// Copies: the component may build its list of properties anew.
+	const BString name(fProperty->Name());
+	const BString newValue(fProperty->Value());
+	fComponent->SetPropertyValue(fProperty->Name(), value);
+
+	// The component saw no change, as the property had the new text already. If it has another one by
+	// now, then the component has stored that itself, and the change has been asked about.
+	const TProperty* property = fComponent->FindProperty(name.String());
+	if (property != nullptr
+		&& strncmp(property->Value(), newValue.String(), TPropertyText::kSize - 1) != 0)
+		return;
+
+	TComponentOwner* owner = fComponent->Owner();
+	if (owner == nullptr
+		|| owner->ComponentPropertyModified(
+			fComponent, name.String(), oldValue.String(), newValue.String()))
+		fComponent->SetModified(true);
+}
+
+
+const char*
+TPropertyEditor::GetValue() const
+{
+	return fProperty != nullptr ? fProperty->Value() : nullptr;
+}
+
+
+const char*
+TPropertyEditor::GetDisplayValue() const
+{
+	return GetValue();
+}
+
+
+void
+TPropertyEditor::GetValuePickList(TStringList*)
+{
+}
+
+
+void
+TPropertyEditor::GetValueList(TStringList*)
+{
+}
