@@ -22,6 +22,14 @@ PathExists(const char* path)
 
 
 bool
+IsFolder(const char* path)
+{
+	BEntry entry(path, true);
+	return entry.InitCheck() == B_OK && entry.IsDirectory();
+}
+
+
+bool
 FileExists(const char* path)
 {
 	BEntry entry(path, false);

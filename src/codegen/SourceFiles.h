@@ -12,6 +12,9 @@ class BString;
 /// True when \a path names an entry; links are followed.
 bool PathExists(const char* path);
 
+/// True when \a path is a folder or leads to one.
+bool IsFolder(const char* path);
+
 /// True when there is an entry at \a path, be it a link that leads nowhere.
 bool FileExists(const char* path);
 

@@ -1,0 +1,341 @@
+// SPDX-License-Identifier: MIT
+// Finds what would keep a project's generated sources from compiling.
+
+#include "codegen/ProjectCheck.h"
+
+#include <ctype.h>
+
+#include <algorithm>
+
+#include "codegen/FormParts.h"
+#include "codegen/HandlerNames.h"
+#include "designer/DesignForm.h"
+#include "model/AppComponent.h"
+#include "model/Event.h"
+
+namespace {
+
+const std::unordered_set<std::string_view> kKeywords = {"alignas", "alignof", "and", "and_eq",
+	"asm", "auto", "bitand", "bitor", "bool", "break", "case", "catch", "char", "char16_t",
+	"char32_t", "char8_t", "class", "co_await", "co_return", "co_yield", "compl", "concept",
+	"const", "const_cast", "consteval", "constexpr", "constinit", "continue", "decltype", "default",
+	"delete", "do", "double", "dynamic_cast", "else", "enum", "explicit", "export", "extern",
+	"false", "float", "for", "friend", "goto", "if", "inline", "int", "long", "mutable",
+	"namespace", "new", "noexcept", "not", "not_eq", "nullptr", "operator", "or", "or_eq",
+	"private", "protected", "public", "register", "reinterpret_cast", "requires", "return", "short",
+	"signed", "sizeof", "static", "static_assert", "static_cast", "struct", "switch", "template",
+	"this", "thread_local", "throw", "true", "try", "typedef", "typeid", "typename", "union",
+	"unsigned", "using", "virtual", "void", "volatile", "wchar_t", "while", "xor", "xor_eq"};
+
+/// Names that the generated code of a form uses or declares inside the form's class.
+const char* const kFormMembers[] = {"_formInit", "BMessage", "BRect", "FormCreate", "FormDestroy",
+	"FormView", "MessageReceived", "SetFormView", "TForm", "TFormView"};
+
+/// The same of the application class.
+const char* const kAppMembers[] = {
+	"APP_SIG", "BApplication", "BMessage", "MainForm", "MessageReceived", "TForm", "m_MainForm"};
+
+/// Classes that generated code takes from the runtime library.
+const char* const kRuntimeClasses[] = {"TForm", "TFormView"};
+
+
+bool
+IsWordByte(char c)
+{
+	return c == '_' || (c >= '0' && c <= '9') || (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z');
+}
+
+
+bool
+IsWord(std::string_view text)
+{
+	return !text.empty() && std::all_of(text.begin(), text.end(), IsWordByte);
+}
+
+
+std::string
+Quoted(const std::string& text)
+{
+	return "'" + text + "'";
+}
+
+
+std::string
+LowerCase(std::string text)
+{
+	std::transform(text.begin(), text.end(), text.begin(),
+		[](unsigned char c) { return static_cast<char>(c < 0x80 ? tolower(c) : c); });
+	return text;
+}
+
+
+bool
+IsAscii(const char* text)
+{
+	for (; *text != '\0'; text++) {
+		if (static_cast<unsigned char>(*text) >= 0x80)
+			return false;
+	}
+	return true;
+}
+
+
+/// Whether every bracket in \a text is closed by its own kind.
+bool
+IsBalanced(const char* text)
+{
+	std::string open;
+	for (; *text != '\0'; text++) {
+		if (*text == '(')
+			open += ')';
+		else if (*text == '[')
+			open += ']';
+		else if (*text == '{')
+			open += '}';
+		else if (*text == ')' || *text == ']' || *text == '}') {
+			if (open.empty() || open.back() != *text)
+				return false;
+			open.pop_back();
+		}
+	}
+	return open.empty();
+}
+
+
+/// Whether "TYPE result;" declares a variable that can then be returned.
+bool
+IsReturnable(std::string_view type)
+{
+	while (!type.empty() && isspace(static_cast<unsigned char>(type.back())))
+		type.remove_suffix(1);
+	if (type.empty() || type == "void" || type.back() == '&')
+		return false;
+	const bool isPointer = type.find('*') != std::string_view::npos;
+	return isPointer || type.substr(0, 6) != "const ";
+}
+
+
+std::string
+ComponentOwnerText(const TComponent* component)
+{
+	return "the component " + Quoted(component->ComponentName());
+}
+
+
+/// The path of the form's document, or its name when it was never saved.
+std::string
+FormFileText(TDesignForm* form)
+{
+	const char* path = form->Filename();
+	return path != nullptr && path[0] != '\0' ? path : form->ComponentName();
+}
+
+} // namespace
+
+
+TProjectCheck::TProjectCheck(const TAppComponent* app, const char* projectFile)
+	: fApp(app),
+	  fProjectFile(projectFile)
+{
+}
+
+
+const std::vector<project_problem>&
+TProjectCheck::Run()
+{
+	for (const char* name : kRuntimeClasses)
+		fClasses.emplace(name, "the runtime library");
+
+	CheckApp();
+	for (int32 i = 0; i < fApp->CountComponents(); i++) {
+		TDesignForm* form = FormAt(fApp, i);
+		if (form != nullptr)
+			CheckForm(form);
+	}
+	return fProblems;
+}
+
+
+void
+TProjectCheck::CheckApp()
+{
+	fFile = fProjectFile;
+	const std::string name = fApp->ComponentName();
+	const std::string owner = "the application " + Quoted(name);
+	CheckIdentifier(name.c_str(), owner);
+	fFiles.emplace(name, owner);
+	ClaimName(fClasses, "T" + name, owner, "class");
+
+	fMembers.clear();
+	fHandlers.clear();
+	for (const char* member : kAppMembers)
+		fMembers.emplace(member, "the generated class");
+	for (int32 i = 0; i < fApp->CountEvents(); i++) {
+		const TEvent* event = fApp->EventAt(i);
+		if (IsSelected(event))
+			CheckHandler(*event, HandlerName(*event).String(), owner);
+	}
+}
+
+
+void
+TProjectCheck::CheckForm(TDesignForm* form)
+{
+	fFile = FormFileText(form);
+	CheckFormFile(form);
+	CheckFormClasses(form);
+
+	fMembers.clear();
+	fHandlers.clear();
+	for (const char* member : kFormMembers)
+		fMembers.emplace(member, "the generated class");
+	fMembers.emplace(std::string("T") + form->ComponentName(), "the form's class");
+	fMembers.emplace(std::string("T") + form->ComponentName() + "View", "the form's view class");
+	CheckComponentNames(form);
+	CheckHandlers(form);
+}
+
+
+void
+TProjectCheck::CheckFormFile(TDesignForm* form)
+{
+	const std::string name = form->ComponentName();
+	const std::string owner = "the form " + Quoted(name);
+	CheckIdentifier(name.c_str(), owner);
+
+	char buffer[kGeneratedNameSize];
+	const std::string file = BaseFormFilename(form, buffer);
+	// Where the sources are named after the form's file, that name guards the header.
+	if (file != name && !IsWord(file)) {
+		Report("the file's name " + Quoted(file)
+			+ " cannot be part of a C++ identifier, as its include guard needs; rename the file");
+	}
+	ClaimName(fFiles, file, owner, "files");
+}
+
+
+void
+TProjectCheck::CheckFormClasses(TDesignForm* form)
+{
+	const std::string name = form->ComponentName();
+	const std::string owner = "the form " + Quoted(name);
+	ClaimName(fClasses, "T" + name, owner, "class");
+	ClaimName(fClasses, "T" + name + "View", owner, "class");
+}
+
+
+void
+TProjectCheck::CheckComponentNames(TDesignForm* form)
+{
+	const TComponentOwner* components = FormComponents(form);
+	const int32 count = components->CountComponents();
+	// The class of a member cannot be named by another member.
+	for (int32 i = 0; i < count; i++) {
+		const std::string className = components->ComponentAt(i)->ClassName();
+		const bool isNew =
+			fMembers.emplace(className, "the components' class " + Quoted(className)).second;
+		if (isNew && !IsIdentifier(className))
+			Report("the class name " + Quoted(className) + " of "
+				+ ComponentOwnerText(components->ComponentAt(i))
+				+ " is no C++ identifier; correct its component library");
+		const auto clash = fClasses.find(className);
+		if (isNew && clash != fClasses.end() && clash->second != "the runtime library")
+			Report("the components' class " + Quoted(className) + " is also the class of "
+				+ clash->second + "; rename that");
+	}
+	for (int32 i = 0; i < count; i++) {
+		const TComponent* component = components->ComponentAt(i);
+		const std::string owner = ComponentOwnerText(component);
+		CheckIdentifier(component->ComponentName(), owner);
+		ClaimName(fMembers, component->ComponentName(), owner, "member");
+	}
+}
+
+
+void
+TProjectCheck::CheckHandlers(TDesignForm* form)
+{
+	for (int32 i = 0; i < form->CountEvents(); i++) {
+		const TEvent* event = form->EventAt(i);
+		if (IsSelected(event))
+			CheckHandler(
+				*event, HandlerName(*event).String(), "the form " + Quoted(form->ComponentName()));
+	}
+
+	const TComponentOwner* components = FormComponents(form);
+	for (int32 i = 0; i < components->CountComponents(); i++) {
+		TComponent* component = components->ComponentAt(i);
+		for (int32 j = 0; j < component->CountEvents(); j++) {
+			const TEvent* event = component->EventAt(j);
+			if (IsSelected(event))
+				CheckHandler(*event, HandlerName(*component, *event).String(),
+					ComponentOwnerText(component));
+		}
+	}
+}
+
+
+void
+TProjectCheck::CheckHandler(
+	const TEvent& event, const std::string& name, const std::string& eventOwner)
+{
+	const std::string owner = "the event " + std::string(event.name) + " of " + eventOwner;
+	const std::string handler = "the handler " + Quoted(name) + " of " + owner;
+	if (!IsIdentifier(name))
+		Report(handler + " is no C++ identifier; rename the component or switch the event off");
+
+	const char* parameters = event.parameters != nullptr ? event.parameters : "";
+	if (!IsAscii(parameters))
+		Report(handler
+			+ " would not compile: its parameters hold characters that are no plain ASCII"
+			+ " (such as non-breaking spaces); switch the event off");
+	else if (!IsBalanced(parameters))
+		Report(handler + " would not compile: the brackets of its parameters do not match;"
+			+ " switch the event off");
+	if (event.returnType != nullptr
+		&& (!IsAscii(event.returnType) || !IsReturnable(event.returnType)))
+		Report(handler + " would not compile: it cannot return " + Quoted(event.returnType)
+			+ "; switch the event off");
+
+	const size_t before = fProblems.size();
+	ClaimName(fMembers, name, owner, "member");
+	// An existing source is searched without regard to case: one handler would stand for both.
+	const auto claimed = fHandlers.emplace(LowerCase(name), owner);
+	if (!claimed.second && fProblems.size() == before)
+		Report("the handlers of " + claimed.first->second + " and of " + owner
+			+ " differ in the case of letters only; rename a component");
+}
+
+
+void
+TProjectCheck::CheckIdentifier(const char* name, const std::string& owner)
+{
+	if (!IsIdentifier(name))
+		Report("the name of " + owner + " is no C++ identifier; rename it");
+}
+
+
+/// Gives \a name to \a owner, unless another one has it already, which is a problem.
+void
+TProjectCheck::ClaimName(
+	name_owners& owners, const std::string& name, const std::string& owner, const char* kind)
+{
+	const auto claimed = owners.emplace(name, owner);
+	if (!claimed.second)
+		Report(claimed.first->second + " and " + owner + " would both have the " + kind + " "
+			+ Quoted(name) + "; rename one of them");
+}
+
+
+void
+TProjectCheck::Report(const std::string& text)
+{
+	fProblems.push_back({fFile, text});
+}
+
+
+bool
+IsIdentifier(std::string_view name)
+{
+	return IsWord(name) && !(name[0] >= '0' && name[0] <= '9') && kKeywords.count(name) == 0;
+}

@@ -1,0 +1,62 @@
+// SPDX-License-Identifier: MIT
+// Finds what would keep a project's generated sources from compiling.
+
+#pragma once
+
+#include <string>
+#include <string_view>
+#include <unordered_map>
+#include <unordered_set>
+#include <vector>
+
+class TAppComponent;
+class TComponent;
+class TDesignForm;
+struct TEvent;
+
+/// A reason why generated sources would not compile, or would overwrite each other.
+struct project_problem {
+	std::string file; // the document that has it
+	std::string text; // what is wrong and what to do, in one sentence
+};
+
+/// Looks through an application and its forms for names that cannot be used in generated sources.
+///
+/// That is: names of the application, a form or a component that are no C++ identifiers; files, classes and
+/// members that would have the same name; selected events whose handlers would not compile. Used once; reads
+/// the forms without locking them.
+class TProjectCheck {
+public:
+	/// \a projectFile: the name under which problems of the application are reported.
+	TProjectCheck(const TAppComponent* app, const char* projectFile);
+
+	/// Looks at everything, and returns the problems in the order of the project's forms.
+	const std::vector<project_problem>& Run();
+
+private:
+	typedef std::unordered_map<std::string, std::string> name_owners;
+
+	void CheckApp();
+	void CheckForm(TDesignForm* form);
+	void CheckFormFile(TDesignForm* form);
+	void CheckFormClasses(TDesignForm* form);
+	void CheckComponentNames(TDesignForm* form);
+	void CheckHandlers(TDesignForm* form);
+	void CheckHandler(const TEvent& event, const std::string& name, const std::string& owner);
+	void CheckIdentifier(const char* name, const std::string& owner);
+	void ClaimName(
+		name_owners& owners, const std::string& name, const std::string& owner, const char* kind);
+	void Report(const std::string& text);
+
+	const TAppComponent* fApp;
+	std::string fProjectFile;
+	std::string fFile; // the document being looked at
+	name_owners fFiles;
+	name_owners fClasses;
+	name_owners fMembers;  // of the class being looked at
+	name_owners fHandlers; // of the class being looked at, in lower case
+	std::vector<project_problem> fProblems;
+};
+
+/// Whether \a name is a C++ identifier and no keyword.
+bool IsIdentifier(std::string_view name);
