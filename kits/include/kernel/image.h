@@ -51,7 +51,7 @@ thread_id load_image(int32 argc, const char** argv, const char** environ);
 /// Loads an add-on, or counts one that is loaded already; each load needs its unload_add_on().
 ///
 /// Returns an id above 0; B_ENTRY_NOT_FOUND, B_NOT_AN_EXECUTABLE, B_MISSING_SYMBOL,
-/// B_MISSING_LIBRARY, B_BAD_VALUE for a null path, or B_ERROR. Why it failed is printed to the
+/// B_MISSING_LIBRARY, B_BAD_VALUE for a null path, or B_ERROR. What the host said is printed to the
 /// error output when BE_LOAD_VERBOSE is in the environment.
 image_id load_add_on(const char* path);
 /// B_BAD_IMAGE_ID for what is no loaded add-on.

@@ -45,7 +45,8 @@ BArchivable* instantiate_object(BMessage* from);
 /// Whether \a from is an archive of \a className (any of its levels of derivation).
 bool validate_instantiation(BMessage* from, const char* className);
 
-/// The Instantiate() function of a class, null when there is none.
+/// The Instantiate() function of a class, null when there is none. Only what is loaded is looked at:
+/// \a signature makes no difference.
 instantiation_func find_instantiation_func(const char* className, const char* signature);
 instantiation_func find_instantiation_func(const char* className);
 instantiation_func find_instantiation_func(BMessage* archive);

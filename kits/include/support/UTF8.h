@@ -39,8 +39,8 @@ enum {
 
 /// Converts as much of \a source as fits into \a dest.
 ///
-/// \a sourceLength, \a destLength: bytes there are, then bytes used. \a state: 0 before the first
-/// piece of a text, then left alone. Bytes that are no character give \a substitute, or are left
+/// \a sourceLength, \a destLength: bytes there are, then bytes used. \a state is not used: a piece of
+/// JIS text has to begin in ASCII. Bytes that are no character give \a substitute, or are left
 /// out when it is 0; a character that is cut off at the end of \a source is left for the next call.
 /// Returns B_OK; B_BAD_VALUE for null pointers, negative lengths or an unknown encoding; B_ERROR
 /// when nothing at all could be converted though there was text.
