@@ -73,20 +73,21 @@ TPropertyEditor::SetValue(const char* value, bool notify)
 		return;
 	}
 
+	// Copies: the value may be a part of the text that it replaces, or of the component's store.
 	const BString oldValue(fProperty->Value());
-	fProperty->FillValue(value);
+	const BString newValue(value);
+	fProperty->FillValue(newValue.String());
 	if (notify)
-		ApplyChange(oldValue, value);
+		ApplyChange(oldValue, newValue);
 }
 
 
 void
-TPropertyEditor::ApplyChange(const BString& oldValue, const char* value)
+TPropertyEditor::ApplyChange(const BString& oldValue, const BString& newValue)
 {
-	// Copies: the component may build its list of properties anew.
+	// A copy: the component may build its list of properties anew.
 	const BString name(fProperty->Name());
-	const BString newValue(fProperty->Value());
-	fComponent->SetPropertyValue(fProperty->Name(), value);
+	fComponent->SetPropertyValue(name.String(), newValue.String());
 
 	// The component saw no change, as the property had the new text already. If it has another one by
 	// now, then the component has stored that itself, and the change has been asked about.

@@ -65,7 +65,7 @@ public:
 	void SetProperty(TProperty* property) { fProperty = property; }
 
 private:
-	void ApplyChange(const BString& oldValue, const char* value);
+	void ApplyChange(const BString& oldValue, const BString& newValue);
 
 	TComponent* fComponent;
 	TProperty* fProperty;
