@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The base of everything that can be designed: names, owners, properties and events. What concerns the
-// view and the mouse is in ComponentDesign.cpp.
+// The base of everything that can be designed: names, owners, properties and events. The hooks for the
+// view and the mouse are in ComponentDesign.cpp and ComponentMouse.cpp.
 
 #include "model/Component.h"
 

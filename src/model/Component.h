@@ -200,6 +200,10 @@ public:
 
 private:
 	void TakeIn(TComponent* component);
+	void SelectAlone();
+	void CreateChild(TComponentOwner* container, BPoint where, BView* view);
+	void AskForContextMenu(BPoint where, BView* view);
+	void ResizeByMouse(BRect frame, BView* view);
 
 	static const size_t kComponentNameSize = 1024;
 	static const size_t kClassNameSize = 32;

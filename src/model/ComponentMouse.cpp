@@ -1,0 +1,184 @@
+// SPDX-License-Identifier: MIT
+// What the mouse does to a component on the design surface, and how a selected component is drawn. All of
+// it but the drawing runs inside the MouseDown() of the component's view.
+
+#include "model/Component.h"
+
+#include <cstdio>
+
+#include <Message.h>
+#include <OS.h>
+#include <String.h>
+#include <View.h>
+#include <Window.h>
+
+#include "model/ComponentOwner.h"
+#include "model/DesignMessages.h"
+#include "model/FormDesigner.h"
+#include "model/ViewLock.h"
+
+static const bigtime_t kPollInterval = 30000; // microseconds
+
+/// The side of the square at the right bottom corner that resizes, in pixels.
+static const float kHandleSize = 5;
+
+/// The least width and height that the mouse gives a component.
+static const float kMinimumSize = 8;
+
+static const rgb_color kSelectionColor = {0, 200, 200, 255};
+
+
+/// Lets the user move the right bottom corner of \a start until all buttons are up.
+static BRect
+TrackCorner(BView* view, BRect start)
+{
+	view->BeginRectTracking(start, B_TRACK_RECT_CORNER);
+	BPoint point;
+	uint32 buttons;
+	do {
+		snooze(kPollInterval);
+		view->GetMouse(&point, &buttons);
+	} while (buttons != 0);
+	view->EndRectTracking();
+	return BRect(start.LeftTop(), point);
+}
+
+
+static bool
+IsOnHandle(BPoint where, BRect frame)
+{
+	return where.x >= frame.right - kHandleSize && where.y >= frame.bottom - kHandleSize;
+}
+
+
+void
+TComponent::DesignerMouseDown(BPoint where, BRect frame, BView* view)
+{
+	SelectAlone();
+	if (view == nullptr || view->Window() == nullptr)
+		return;
+
+	const BMessage* press = view->Window()->CurrentMessage();
+	int32 clicks;
+	if (press != nullptr && press->FindInt32("clicks", &clicks) == B_OK && clicks > 1) {
+		DefaultEditAction(where);
+		return;
+	}
+
+	TComponentOwner* container = dynamic_cast<TComponentOwner*>(this);
+	if (container != nullptr && Designer() != nullptr && Designer()->IsDropWaiting()) {
+		CreateChild(container, where, view);
+		return;
+	}
+
+	BPoint point;
+	uint32 buttons;
+	view->GetMouse(&point, &buttons);
+	if ((buttons & B_PRIMARY_MOUSE_BUTTON) == 0) {
+		if ((buttons & B_SECONDARY_MOUSE_BUTTON) != 0)
+			AskForContextMenu(point, view);
+		return;
+	}
+
+	if (!frame.Contains(where))
+		return;
+	if (IsOnHandle(where, frame)) {
+		ResizeByMouse(frame, view);
+		return;
+	}
+	BMessage move(DTM_COMPONENT_MOVE);
+	move.AddPointer("component", this);
+	view->DragMessage(&move, frame);
+}
+
+
+void
+TComponent::SelectAlone()
+{
+	DesignerSelect(true);
+	for (int32 i = 0; Owner() != nullptr && i < Owner()->CountComponents(); i++) {
+		TComponent* other = Owner()->ComponentAt(i);
+		if (other == nullptr || other == this)
+			continue;
+		other->DesignerSelect(false);
+		if (other->DTView() != nullptr)
+			other->DTView()->Invalidate();
+	}
+
+	if (fDTView != nullptr) {
+		fDTView->Invalidate();
+		for (BView* child = fDTView->ChildAt(0); child != nullptr; child = child->NextSibling())
+			child->Invalidate();
+	}
+
+	if (Designer() != nullptr) {
+		SelectedInFormDesigner();
+		Designer()->ComponentSelected(this);
+	}
+}
+
+
+void
+TComponent::CreateChild(TComponentOwner* container, BPoint where, BView* view)
+{
+	BRect frame = TrackCorner(view, BRect(where, where));
+	if (frame.Width() < kMinimumSize)
+		frame.right = frame.left + kMinimumSize;
+	if (frame.Height() < kMinimumSize)
+		frame.bottom = frame.top + kMinimumSize;
+
+	TComponent* child = Designer()->CreateComponent(view, frame);
+	if (child == nullptr)
+		return;
+	container->AddComponent(child);
+	printf("%s: Created component '%s'\n", ClassTypeName(this).String(), child->ComponentName());
+	Designer()->DoneDroppingComponent();
+}
+
+
+void
+TComponent::AskForContextMenu(BPoint where, BView* view)
+{
+	BMessage message(DTM_COMPONENT_CONTEXTMENU);
+	message.AddPoint("where", where);
+	message.AddPointer("view", view);
+	message.AddPointer("component", this);
+	view->Window()->PostMessage(&message, view->Parent());
+}
+
+
+void
+TComponent::ResizeByMouse(BRect frame, BView* view)
+{
+	// Too small a frame is dropped, not clamped.
+	const BRect newFrame = TrackCorner(view, frame);
+	if (newFrame.Width() >= kMinimumSize && newFrame.Height() >= kMinimumSize)
+		ResizeComponentTo(view, newFrame);
+
+	BMessage message(DTM_COMPONENT_RESIZE);
+	message.AddPointer("component", this);
+	message.AddRect("frame", view->Frame());
+	view->Window()->PostMessage(&message, view->Parent());
+}
+
+
+void
+TComponent::DesignerDrawSelection()
+{
+	if (!IsDesignerSelected())
+		return;
+	TViewLock lock(fDTView);
+	if (!lock.IsLocked())
+		return;
+
+	const rgb_color oldColor = fDTView->HighColor();
+	const float width = fDTView->Bounds().Width();
+	const float height = fDTView->Bounds().Height();
+	fDTView->SetHighColor(kSelectionColor);
+	fDTView->StrokeLine(BPoint(0, 0), BPoint(width, 0));
+	fDTView->StrokeLine(BPoint(width, 0), BPoint(width, height));
+	fDTView->StrokeLine(BPoint(width, height), BPoint(0, height));
+	fDTView->StrokeLine(BPoint(0, height), BPoint(0, 0));
+	fDTView->FillRect(BRect(width - kHandleSize, height - kHandleSize, width, height));
+	fDTView->SetHighColor(oldColor);
+}
