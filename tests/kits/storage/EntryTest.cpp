@@ -293,7 +293,7 @@ TEST(EntryTest, NumbersAloneAreFoundForKnownFoldersAndRootsOnly)
 	EXPECT_EQ(PathOf(BEntry(&root)), "/leaf");
 
 	const TemporaryFolder folder;
-	folder.Make("never/seen");
+	folder.MakeUnknown("never/seen");
 	ASSERT_EQ(lstat((folder / "never/seen").c_str(), &stat), 0);
 	const entry_ref unknown(stat.st_dev, stat.st_ino, "leaf");
 	EXPECT_EQ(BEntry(&unknown).InitCheck(), B_ENTRY_NOT_FOUND);

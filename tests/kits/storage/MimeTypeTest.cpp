@@ -340,8 +340,9 @@ TEST_F(MimeDatabaseTest, RulesForContentDoWhatTheFormatSays)
 	for (const auto& test : cases) {
 		WriteSystemPackage(std::string("<mime-type type='x/rule'><magic><match ") + test.rule
 			+ "/></magic></mime-type>");
-		if (!test.yes.empty())
+		if (!test.yes.empty()) {
 			EXPECT_EQ(GuessContent(test.yes), "x/rule") << test.rule;
+		}
 		EXPECT_NE(GuessContent(test.no), "x/rule") << test.rule;
 	}
 }

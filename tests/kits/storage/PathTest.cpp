@@ -202,7 +202,7 @@ TEST(PathTest, EveryCutOffReferenceIsRefusedOrStillAReference)
 TEST(PathTest, FolderOfAForeignReferenceIsBelievedOnlyWhenItIsTheOne)
 {
 	const TemporaryFolder folder;
-	folder.Make("one");
+	folder.MakeUnknown("one");
 	folder.Make("two");
 	// Made without the kit, so that it knows neither folder.
 	struct stat stat;

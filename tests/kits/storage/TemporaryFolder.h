@@ -44,6 +44,14 @@ public:
 		std::filesystem::create_directories(*this / name);
 		return *this / name;
 	}
+	/// Makes a folder that is no successor of one that another test has removed: the host gives the
+	/// inodes of those away first, and the kit would know them.
+	std::string MakeUnknown(const std::string& name) const
+	{
+		for (int i = 0; i < 500; i++)
+			Make("used-up/" + std::to_string(i));
+		return Make(name);
+	}
 	void Link(const std::string& target, const std::string& name) const
 	{
 		std::filesystem::create_symlink(target, *this / name);
