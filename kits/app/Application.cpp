@@ -92,7 +92,12 @@ BApplication::~BApplication()
 BArchivable*
 BApplication::Instantiate(BMessage* archive)
 {
-	return validate_instantiation(archive, "BApplication") ? new BApplication(archive) : nullptr;
+	const char* name;
+	for (int32 i = 0; archive->FindString("class", i, &name) == B_OK; i++) {
+		if (strcmp(name, "BApplication") == 0)
+			return new BApplication(archive);
+	}
+	return nullptr;
 }
 
 
@@ -100,6 +105,8 @@ status_t
 BApplication::Archive(BMessage* archive, bool deep) const
 {
 	status_t status = BLooper::Archive(archive, deep);
+	if (status == B_OK)
+		status = archive->AddString("class", "BApplication");
 	if (status == B_OK)
 		status = archive->AddString(kSignatureField, Signature());
 	if (status == B_OK)

@@ -74,8 +74,7 @@ Report(const char* format, ...)
 bool
 IsRunningWindow(const LooperPort* port)
 {
-	return port->IsRunning() && port->Kind() != kPlainLooper
-		&& port->Kind() != kOffscreenWindowLooper;
+	return port->Window() != nullptr && port->Kind() != kOffscreenWindowLooper && port->IsRunning();
 }
 
 } // namespace

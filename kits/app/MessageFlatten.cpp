@@ -232,10 +232,10 @@ BMessage::Private::ParseHaiku(const uint8* buffer, size_t size, BMessage* messag
 status_t
 BMessage::Private::Unflatten(const void* buffer, size_t size, size_t* used)
 {
-	if (buffer == nullptr)
-		return B_BAD_VALUE;
 	if (size < sizeof(uint32))
 		return B_NOT_A_MESSAGE;
+	if (buffer == nullptr)
+		return B_BAD_VALUE;
 
 	const uint8* bytes = static_cast<const uint8*>(buffer);
 	const uint32 format = ReadNumber<uint32>(bytes);

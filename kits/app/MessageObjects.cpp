@@ -6,7 +6,6 @@
 #include <cstring>
 #include <memory>
 #include <string>
-#include <string_view>
 #include <vector>
 
 #include <Entry.h>
@@ -388,8 +387,8 @@ BMessage::FindRef(const char* name, int32 index, entry_ref* value) const
 	const void* data;
 	ssize_t size;
 	status_t status = FindData(name, B_REF_TYPE, index, &data, &size);
-	if (status == B_OK)
-		status = BPrivate::unflatten_entry_ref(data, size_t(size), value);
+	if (status == B_OK && BPrivate::unflatten_entry_ref(data, size, value) != B_OK)
+		status = B_BAD_DATA;
 	if (status != B_OK)
 		*value = entry_ref();
 	return status;

@@ -23,10 +23,8 @@ class BString;
 class BWindow;
 
 namespace BPrivate {
-class Canvas;
-class ScrollBarLink;
+class ViewClipping;
 class ViewDrawing;
-class WindowData;
 class WindowInput;
 class WindowPainter;
 struct GraphicsState;
@@ -128,7 +126,7 @@ public:
 	virtual ~BView();
 
 	static BArchivable* Instantiate(BMessage* archive);
-	virtual status_t Archive(BMessage* archive, bool deep = true) const override;
+	virtual status_t Archive(BMessage* archive, bool deep = true) const;
 
 	/// Parent before children; AllAttached() of a view after all of its descendants are attached.
 	virtual void AttachedToWindow();
@@ -136,7 +134,7 @@ public:
 	/// Window() is still valid in these two.
 	virtual void DetachedFromWindow();
 	virtual void AllDetached();
-	virtual void MessageReceived(BMessage* message) override;
+	virtual void MessageReceived(BMessage* message);
 
 	/// \a child must have no parent; it goes before \a before, else to the end (on top).
 	void AddChild(BView* child, BView* before = NULL);
@@ -375,7 +373,7 @@ public:
 	virtual void Show();
 	virtual void Hide();
 	bool IsHidden() const;
-	/// Up to \a looking_from, which still counts; with the view itself: its own state only.
+	/// Up to, without, \a looking_from; with the view itself: its own state only.
 	bool IsHidden(const BView* looking_from) const;
 
 	/// Right-left sense; either pointer may be null.
@@ -387,8 +385,8 @@ private:
 	friend class BBitmap;
 	friend class BScrollBar;
 	friend class BWindow;
+	friend class BPrivate::ViewClipping;
 	friend class BPrivate::ViewDrawing;
-	friend class BPrivate::WindowData;
 	friend class BPrivate::WindowInput;
 	friend class BPrivate::WindowPainter;
 
@@ -401,25 +399,21 @@ private:
 	void SetOwner(BWindow* window);
 	void ClearOwner();
 	void CallAttachedHooks();
-	void CallDetachedHooks();
+	void CallDetachedHooks(BWindow* window);
+	BView* TreeParent() const { return fParent; }
 	void CheckLock() const;
 
 	// Geometry
-	BPoint OffsetInWindow() const;
+	BPoint ToWindow() const;
 	void ParentResized(int32 dx, int32 dy);
 	void SetFrame(BPoint leftTop, float width, float height);
-	void PostFrameMessages(bool moved, bool resized);
-	void InvalidateFrame(BRect frame);
-	void SetScrollBar(orientation direction, BPrivate::ScrollBarLink* bar);
+	void ScrollRaw(BPoint where);
+	void InvalidateInParent(BRect frame);
+	void SetScrollBar(orientation direction, BScrollBar* bar);
 
 	// Drawing
 	BPrivate::ViewDrawing& Drawing();
 	const BPrivate::GraphicsState& State() const;
-	BPrivate::Canvas* BeginDrawing() const;
-	void EndDrawing(BRect rect) const;
-	void EndStroking(BRect rect) const;
-	BRect TextFrame(BPoint start, BPoint end) const;
-	void SetPenLocation(BPoint where);
 
 	BView* fParent;
 	BView* fPreviousSibling;
@@ -427,8 +421,8 @@ private:
 	BView* fFirstChild;
 	BView* fLastChild;
 	BWindow* fOwner;
-	BPrivate::ScrollBarLink* fHorizontalBar;
-	BPrivate::ScrollBarLink* fVerticalBar;
+	BScrollBar* fHorizontalBar;
+	BScrollBar* fVerticalBar;
 	// Made when something differs from a new view's state: most views of a large tree never draw.
 	std::unique_ptr<BPrivate::ViewDrawing> fDrawing;
 	BPoint fLeftTop;
@@ -443,6 +437,7 @@ private:
 	uint8 fMouseEventOptions;
 	bool fTopLevel;
 	bool fAttached;
+	bool fAllAttached;
 	int16 fShowLevel;
 };
 
