@@ -92,12 +92,7 @@ BApplication::~BApplication()
 BArchivable*
 BApplication::Instantiate(BMessage* archive)
 {
-	const char* name;
-	for (int32 i = 0; archive->FindString("class", i, &name) == B_OK; i++) {
-		if (strcmp(name, "BApplication") == 0)
-			return new BApplication(archive);
-	}
-	return nullptr;
+	return validate_instantiation(archive, "BApplication") ? new BApplication(archive) : nullptr;
 }
 
 
@@ -105,8 +100,6 @@ status_t
 BApplication::Archive(BMessage* archive, bool deep) const
 {
 	status_t status = BLooper::Archive(archive, deep);
-	if (status == B_OK)
-		status = archive->AddString("class", "BApplication");
 	if (status == B_OK)
 		status = archive->AddString(kSignatureField, Signature());
 	if (status == B_OK)

@@ -26,7 +26,7 @@ Windows(Wanted wanted)
 {
 	std::vector<PortRef> windows;
 	for (const PortRef& port : Registry::Default().Loopers()) {
-		if (port->Window() != nullptr && wanted(port->Kind()))
+		if (wanted(port->Kind()))
 			windows.push_back(port);
 	}
 	return windows;
@@ -86,7 +86,7 @@ status_t
 BApplication::RegisterLooper(BLooper* looper)
 {
 	PortRef port = Registry::Default().PortFor(looper);
-	if (port == nullptr || port->Window() != nullptr || looper == this)
+	if (port == nullptr || port->Kind() != BPrivate::kPlainLooper || looper == this)
 		return B_BAD_VALUE;
 
 	BAutolock lock(this);

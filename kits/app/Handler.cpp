@@ -67,12 +67,7 @@ BHandler::~BHandler()
 BArchivable*
 BHandler::Instantiate(BMessage* archive)
 {
-	const char* name;
-	for (int32 i = 0; archive->FindString("class", i, &name) == B_OK; i++) {
-		if (strcmp(name, "BHandler") == 0)
-			return new BHandler(archive);
-	}
-	return nullptr;
+	return validate_instantiation(archive, "BHandler") ? new BHandler(archive) : nullptr;
 }
 
 
@@ -80,8 +75,6 @@ status_t
 BHandler::Archive(BMessage* archive, bool deep) const
 {
 	status_t status = BArchivable::Archive(archive, deep);
-	if (status == B_OK)
-		status = archive->AddString("class", "BHandler");
 	if (status == B_OK && fName != nullptr)
 		status = archive->AddString(kNameField, fName);
 	return status;

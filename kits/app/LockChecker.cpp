@@ -74,7 +74,8 @@ Report(const char* format, ...)
 bool
 IsRunningWindow(const LooperPort* port)
 {
-	return port->Window() != nullptr && port->Kind() != kOffscreenWindowLooper && port->IsRunning();
+	return port->IsRunning() && port->Kind() != kPlainLooper
+		&& port->Kind() != kOffscreenWindowLooper;
 }
 
 } // namespace

@@ -91,12 +91,7 @@ BLooper::~BLooper()
 BArchivable*
 BLooper::Instantiate(BMessage* archive)
 {
-	const char* name;
-	for (int32 i = 0; archive->FindString("class", i, &name) == B_OK; i++) {
-		if (strcmp(name, "BLooper") == 0)
-			return new BLooper(archive);
-	}
-	return nullptr;
+	return validate_instantiation(archive, "BLooper") ? new BLooper(archive) : nullptr;
 }
 
 
@@ -104,8 +99,6 @@ status_t
 BLooper::Archive(BMessage* archive, bool deep) const
 {
 	status_t status = BHandler::Archive(archive, deep);
-	if (status == B_OK)
-		status = archive->AddString("class", "BLooper");
 	if (status == B_OK)
 		status = archive->AddInt32(kCapacityField, fPortCapacity);
 	if (status == B_OK)
@@ -155,22 +148,6 @@ BLooper::PostMessage(BMessage* message, BHandler* handler, BHandler* replyTo)
 			return B_MISMATCHED_VALUES;
 	}
 	return BPrivate::Deliver(to, *message, BPrivate::AddressOf(BMessenger(replyTo)));
-}
-
-
-BMessage*
-BLooper::CurrentMessage() const
-{
-	return fLastMessage;
-}
-
-
-BMessage*
-BLooper::DetachCurrentMessage()
-{
-	BMessage* message = fLastMessage;
-	fLastMessage = nullptr;
-	return message;
 }
 
 

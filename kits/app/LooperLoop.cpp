@@ -151,6 +151,23 @@ BLooper::MessageReceived(BMessage* message)
 
 
 BMessage*
+BLooper::CurrentMessage() const
+{
+	return LoopFrame::Find(this) != nullptr ? fLastMessage : nullptr;
+}
+
+
+BMessage*
+BLooper::DetachCurrentMessage()
+{
+	BMessage* message = CurrentMessage();
+	if (message != nullptr)
+		fLastMessage = nullptr;
+	return message;
+}
+
+
+BMessage*
 BLooper::MessageFromPort(bigtime_t timeout)
 {
 	return fPort->WaitForMessage(timeout) ? fPort->Take() : nullptr;

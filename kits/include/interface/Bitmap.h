@@ -49,7 +49,7 @@ public:
 	BBitmap& operator=(const BBitmap& source);
 
 	static BArchivable* Instantiate(BMessage* archive);
-	virtual status_t Archive(BMessage* archive, bool deep = true) const;
+	virtual status_t Archive(BMessage* archive, bool deep = true) const override;
 
 	/// B_OK; B_BAD_VALUE for invalid bounds or colour space; B_NO_MEMORY.
 	status_t InitCheck() const;

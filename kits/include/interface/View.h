@@ -23,8 +23,10 @@ class BString;
 class BWindow;
 
 namespace BPrivate {
-class ViewClipping;
+class Canvas;
+class ScrollBarLink;
 class ViewDrawing;
+class WindowData;
 class WindowInput;
 class WindowPainter;
 struct GraphicsState;
@@ -126,7 +128,7 @@ public:
 	virtual ~BView();
 
 	static BArchivable* Instantiate(BMessage* archive);
-	virtual status_t Archive(BMessage* archive, bool deep = true) const;
+	virtual status_t Archive(BMessage* archive, bool deep = true) const override;
 
 	/// Parent before children; AllAttached() of a view after all of its descendants are attached.
 	virtual void AttachedToWindow();
@@ -134,7 +136,7 @@ public:
 	/// Window() is still valid in these two.
 	virtual void DetachedFromWindow();
 	virtual void AllDetached();
-	virtual void MessageReceived(BMessage* message);
+	virtual void MessageReceived(BMessage* message) override;
 
 	/// \a child must have no parent; it goes before \a before, else to the end (on top).
 	void AddChild(BView* child, BView* before = NULL);
@@ -373,7 +375,7 @@ public:
 	virtual void Show();
 	virtual void Hide();
 	bool IsHidden() const;
-	/// Up to, without, \a looking_from; with the view itself: its own state only.
+	/// Up to \a looking_from, which still counts; with the view itself: its own state only.
 	bool IsHidden(const BView* looking_from) const;
 
 	/// Right-left sense; either pointer may be null.
@@ -385,8 +387,8 @@ private:
 	friend class BBitmap;
 	friend class BScrollBar;
 	friend class BWindow;
-	friend class BPrivate::ViewClipping;
 	friend class BPrivate::ViewDrawing;
+	friend class BPrivate::WindowData;
 	friend class BPrivate::WindowInput;
 	friend class BPrivate::WindowPainter;
 
@@ -399,21 +401,25 @@ private:
 	void SetOwner(BWindow* window);
 	void ClearOwner();
 	void CallAttachedHooks();
-	void CallDetachedHooks(BWindow* window);
-	BView* TreeParent() const { return fParent; }
+	void CallDetachedHooks();
 	void CheckLock() const;
 
 	// Geometry
-	BPoint ToWindow() const;
+	BPoint OffsetInWindow() const;
 	void ParentResized(int32 dx, int32 dy);
 	void SetFrame(BPoint leftTop, float width, float height);
-	void ScrollRaw(BPoint where);
-	void InvalidateInParent(BRect frame);
-	void SetScrollBar(orientation direction, BScrollBar* bar);
+	void PostFrameMessages(bool moved, bool resized);
+	void InvalidateFrame(BRect frame);
+	void SetScrollBar(orientation direction, BPrivate::ScrollBarLink* bar);
 
 	// Drawing
 	BPrivate::ViewDrawing& Drawing();
 	const BPrivate::GraphicsState& State() const;
+	BPrivate::Canvas* BeginDrawing() const;
+	void EndDrawing(BRect rect) const;
+	void EndStroking(BRect rect) const;
+	BRect TextFrame(BPoint start, BPoint end) const;
+	void SetPenLocation(BPoint where);
 
 	BView* fParent;
 	BView* fPreviousSibling;
@@ -421,8 +427,8 @@ private:
 	BView* fFirstChild;
 	BView* fLastChild;
 	BWindow* fOwner;
-	BScrollBar* fHorizontalBar;
-	BScrollBar* fVerticalBar;
+	BPrivate::ScrollBarLink* fHorizontalBar;
+	BPrivate::ScrollBarLink* fVerticalBar;
 	// Made when something differs from a new view's state: most views of a large tree never draw.
 	std::unique_ptr<BPrivate::ViewDrawing> fDrawing;
 	BPoint fLeftTop;
@@ -437,7 +443,6 @@ private:
 	uint8 fMouseEventOptions;
 	bool fTopLevel;
 	bool fAttached;
-	bool fAllAttached;
 	int16 fShowLevel;
 };
 

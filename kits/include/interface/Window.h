@@ -97,13 +97,13 @@ public:
 	virtual ~BWindow();
 
 	static BArchivable* Instantiate(BMessage* archive);
-	virtual status_t Archive(BMessage* archive, bool deep = true) const;
+	virtual status_t Archive(BMessage* archive, bool deep = true) const override;
 
-	virtual thread_id Run();
+	virtual thread_id Run() override;
 	/// Needs the lock; does not return in the window's own thread.
-	virtual void Quit();
+	virtual void Quit() override;
 	void Close() { Quit(); }
-	virtual bool QuitRequested();
+	virtual bool QuitRequested() override;
 
 	void AddChild(BView* child, BView* before = NULL);
 	bool RemoveChild(BView* child);
@@ -114,8 +114,8 @@ public:
 	BView* FindView(BPoint) const;
 	BView* CurrentFocus() const;
 
-	virtual void DispatchMessage(BMessage* message, BHandler* handler);
-	virtual void MessageReceived(BMessage* message);
+	virtual void DispatchMessage(BMessage* message, BHandler* handler) override;
+	virtual void MessageReceived(BMessage* message) override;
 	virtual void FrameMoved(BPoint newPosition);
 	virtual void WorkspacesChanged(uint32 oldWorkspaces, uint32 newWorkspaces);
 	virtual void WorkspaceActivated(int32 workspace, bool state);
@@ -222,9 +222,11 @@ private:
 	BWindow(const BWindow&) = delete;
 	BWindow& operator=(const BWindow&) = delete;
 
+	virtual BHandler* ChooseTarget(BMessage* message, BHandler* target, bool preferred) override;
+	virtual void QueueRanEmpty() override;
 	void Init(BRect frame, const char* title, window_look look, window_feel feel, uint32 flags,
 		uint32 workspace);
-	void SetFocus(BView* focus, bool notify);
+	void SetFocus(BView* focus);
 	void ViewDetached(BView* view);
 
 	std::unique_ptr<BPrivate::WindowData> fData;

@@ -24,7 +24,7 @@ enum file_panel_button { B_CANCEL_BUTTON, B_DEFAULT_BUTTON };
 /// Decides which entries a file panel shows. Must outlive the panel.
 class BRefFilter {
 public:
-	virtual ~BRefFilter();
+	virtual ~BRefFilter() {}
 
 	/// True shows the entry. Called in the panel's thread for each entry as it is read.
 	///
