@@ -22,6 +22,13 @@ NameOf(const TComponent* component)
 }
 
 
+static bool
+HasText(const TRarePropertyText& text)
+{
+	return text.IsSet() && text.Text()[0] != '\0';
+}
+
+
 TProperty::TProperty(TComponent* component, const char* name, const char* value,
 	TPropertyEditor* editor, bool generated)
 	: fComponent(component),
@@ -31,7 +38,6 @@ TProperty::TProperty(TComponent* component, const char* name, const char* value,
 {
 	snprintf(fName, sizeof(fName), "%s", name != nullptr ? name : "");
 	fValue.SetTo(value);
-	fDefValue.SetTo(value);
 }
 
 
@@ -101,7 +107,7 @@ TProperty::SetSetStatement(const char* statement)
 BString
 TProperty::SetStatement() const
 {
-	if (!fSetStatement.IsEmpty())
+	if (HasText(fSetStatement))
 		return BString(fSetStatement.Text());
 
 	const char* quote = fQuoted ? "\"" : "";
@@ -122,7 +128,7 @@ TProperty::SetGetStatement(const char* statement)
 BString
 TProperty::GetStatement() const
 {
-	if (!fGetStatement.IsEmpty())
+	if (HasText(fGetStatement))
 		return BString(fGetStatement.Text());
 
 	BString statement;
@@ -143,8 +149,32 @@ TProperty::ReadExtendedData(const BMessage*)
 }
 
 
+void
+TProperty::SetValue(const char* value)
+{
+	KeepDefault(value);
+	fValue.SetTo(value);
+}
+
+
+void
+TProperty::FillValue(const char* value)
+{
+	KeepDefault(value);
+	fValue.Fill(value);
+}
+
+
 bool
 TProperty::IsDefValue() const
 {
 	return strcmp(Value(), DefValue()) == 0;
+}
+
+
+void
+TProperty::KeepDefault(const char* newValue)
+{
+	if (newValue != nullptr && !fDefValue.IsSet() && strcmp(newValue, Value()) != 0)
+		fDefValue.SetTo(Value());
 }

@@ -62,18 +62,20 @@ public:
 	virtual void WriteExtendedData(BMessage* message) const;
 	virtual void ReadExtendedData(const BMessage* message);
 
-	/// The value: never null, at most 1024 bytes, valid until the value changes.
+	/// The value: never null, always terminated, at most 1024 bytes; valid until the value changes.
 	const char* Value() const { return fValue.Text(); }
 
 	/// Null is ignored.
-	void SetValue(const char* value) { fValue.SetTo(value); }
+	void SetValue(const char* value);
 
 	/// The editors' way to set the value: copies at most 1024 bytes, the last one not kept free for a
 	/// terminator. Null is ignored.
-	void FillValue(const char* value) { fValue.Fill(value); }
+	void FillValue(const char* value);
 
-	/// The value that the property was created with; never null.
-	const char* DefValue() const { return fDefValue.Text(); }
+	/// The value that the property was created with; never null, valid until value or default change.
+	const char* DefValue() const { return fDefValue.IsSet() ? fDefValue.Text() : fValue.Text(); }
+
+	/// Null is ignored.
 	void SetDefValue(const char* value) { fDefValue.SetTo(value); }
 
 	/// Whether value and default are the same, byte for byte.
@@ -88,15 +90,17 @@ public:
 	void SetGenerated(bool generated) { fGenerated = generated; }
 
 private:
+	void KeepDefault(const char* newValue);
+
 	static const size_t kNameSize = 32;
 
 	char fName[kNameSize];
 	TComponent* fComponent;
 	TPropertyEditor* fEditor;
 	TPropertyText fValue;
-	TPropertyText fDefValue;
-	TPropertyText fSetStatement;
-	TPropertyText fGetStatement;
+	TRarePropertyText fDefValue; // not set while the value has never changed
+	TRarePropertyText fSetStatement;
+	TRarePropertyText fGetStatement;
 	bool fQuoted;
 	bool fGenerated;
 };

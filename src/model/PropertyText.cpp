@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The storage of one text of a property.
+// The storage of the texts of a property.
 
 #include "model/PropertyText.h"
 
@@ -51,4 +51,19 @@ TPropertyText::Assign(const char* text, size_t length)
 		delete[] fText;
 	fText = newText;
 	fCapacity = newCapacity;
+}
+
+
+void
+TRarePropertyText::SetTo(const char* text)
+{
+	if (text == nullptr)
+		return;
+
+	const size_t length = strnlen(text, TPropertyText::kSize - 1);
+	char* newText = new char[length + 1];
+	memcpy(newText, text, length);
+	newText[length] = '\0';
+	delete[] fText;
+	fText = newText;
 }

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The storage of one text of a property.
+// The storage of the texts of a property.
 
 #pragma once
 
@@ -29,8 +29,6 @@ public:
 	/// The text; never null, always terminated, valid until the next assignment.
 	const char* Text() const { return fText; }
 
-	bool IsEmpty() const { return fText[0] == '\0'; }
-
 	/// Takes over at most 1023 bytes of \a text. A null text is ignored.
 	void SetTo(const char* text);
 
@@ -48,4 +46,28 @@ private:
 		char fShort[kShortSize];
 		size_t fCapacity; // of the text on the heap
 	};
+};
+
+
+/// The same for a text that few properties have: nothing but a pointer until it is set.
+class TRarePropertyText {
+public:
+	TRarePropertyText()
+		: fText(nullptr)
+	{
+	}
+	~TRarePropertyText() { delete[] fText; }
+	TRarePropertyText(const TRarePropertyText&) = delete;
+	TRarePropertyText& operator=(const TRarePropertyText&) = delete;
+
+	bool IsSet() const { return fText != nullptr; }
+
+	/// Null until it is set; valid until the next assignment.
+	const char* Text() const { return fText; }
+
+	/// Takes over at most 1023 bytes of \a text. A null text is ignored.
+	void SetTo(const char* text);
+
+private:
+	char* fText;
 };

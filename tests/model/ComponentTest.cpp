@@ -65,7 +65,14 @@ protected:
 		fComponent.AddProperty(&fLabel);
 	}
 
-	~ComponentTest() override { fComponent.ClearProperties(false); }
+	~ComponentTest() override
+	{
+		// Of what a test put into the list, the component deletes only what it made itself.
+		TProperty* first = fComponent.PropertyAt(0);
+		fComponent.ClearProperties(false);
+		if (first != nullptr && first != &fLabel)
+			fComponent.AddProperty(first);
+	}
 
 	const char* Stored(const char* name) { return fComponent.PropertyStore()->FindString(name); }
 

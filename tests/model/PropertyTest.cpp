@@ -96,6 +96,31 @@ TEST_F(PropertyTest, TheDefaultStaysWhenTheValueChanges)
 }
 
 
+TEST_F(PropertyTest, TheDefaultCanBeSetApart)
+{
+	TProperty property(&fComponent, "Label", "OK", nullptr, true);
+	property.SetDefValue("Other");
+	EXPECT_STREQ(property.Value(), "OK");
+	EXPECT_STREQ(property.DefValue(), "Other");
+	property.SetValue("Cancel");
+	EXPECT_STREQ(property.DefValue(), "Other");
+	property.SetDefValue("");
+	EXPECT_STREQ(property.DefValue(), "");
+	EXPECT_EQ(std::string(property.Value()), "Cancel");
+}
+
+
+TEST_F(PropertyTest, TheDefaultStaysWhenAnEditorFillsTheValue)
+{
+	TProperty property(&fComponent, "Label", "OK", nullptr, true);
+	property.FillValue("Cancel");
+	EXPECT_STREQ(property.DefValue(), "OK");
+	EXPECT_FALSE(property.IsDefValue());
+	const TProperty copy(property);
+	EXPECT_STREQ(copy.DefValue(), "OK");
+}
+
+
 TEST_F(PropertyTest, TheTextOfTheDefaultIsTheDefaultAgain)
 {
 	TProperty property(&fComponent, "Label", "OK", nullptr, true);
