@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 // A folder that lasts as long as a test, and shorthands for what lies in it.
 
-#ifndef TEMPORARY_FOLDER_H
-#define TEMPORARY_FOLDER_H
+#ifndef TESTS_SUPPORT_TEMPORARY_FOLDER_H
+#define TESTS_SUPPORT_TEMPORARY_FOLDER_H
 
 #include <cstdlib>
 #include <filesystem>
@@ -17,7 +17,7 @@ public:
 	TemporaryFolder()
 	{
 		std::string name =
-			std::filesystem::canonical(std::filesystem::temp_directory_path()) / "storage-XXXXXX";
+			std::filesystem::canonical(std::filesystem::temp_directory_path()) / "plimworks-XXXXXX";
 		fPath = mkdtemp(name.data());
 	}
 	~TemporaryFolder() { std::filesystem::remove_all(fPath); }
