@@ -75,6 +75,12 @@ TEST_F(ImageTest, StaticObjectsLiveFromLoadToUnload)
 	EXPECT_EQ(unload_add_on(image), B_OK);
 	EXPECT_EQ(trace(), "unloaded");
 	EXPECT_EQ(unload_add_on(image), B_BAD_IMAGE_ID);
+
+	// Loaded again it is as new.
+	image = load_add_on((kAddOns + "Good.so").c_str());
+	ASSERT_GT(image, 0);
+	EXPECT_EQ(trace(), "loaded");
+	EXPECT_EQ(unload_add_on(image), B_OK);
 }
 
 
