@@ -3,7 +3,6 @@
 
 #include <image.h>
 
-#include <locale.h>
 #include <stdlib.h>
 #include <string.h>
 #include <unistd.h>
@@ -178,14 +177,6 @@ TEST_F(ImageTest, WhatCannotBeLoadedSaysWhy)
 	EXPECT_EQ(load_add_on(Write("empty.so", "").c_str()), B_NOT_AN_EXECUTABLE);
 	EXPECT_EQ(load_add_on((kAddOns + "MissingSymbol.so").c_str()), B_MISSING_SYMBOL);
 	EXPECT_EQ(load_add_on((kAddOns + "MissingLibrary.so").c_str()), B_MISSING_LIBRARY);
-}
-
-
-TEST_F(ImageTest, FailuresAreToldInEveryLanguage)
-{
-	setenv("LANGUAGE", "de", 1);
-	setlocale(LC_ALL, "C.UTF-8");
-	EXPECT_EQ(load_add_on((kAddOns + "MissingSymbol.so").c_str()), B_MISSING_SYMBOL);
 }
 
 
