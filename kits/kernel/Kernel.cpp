@@ -71,15 +71,13 @@ handle_stop_signal(int)
 }
 
 
-/// The end of a thread of the host. The destructors of its thread-local objects have run: nothing
-/// of an add-on's code is in it any more when those who wait for it are told.
+/// The end of a thread of the host, after the destructors of its thread-local objects.
 void
 release_current_thread(void* value)
 {
 	std::unique_ptr<std::shared_ptr<Thread>> thread(static_cast<std::shared_ptr<Thread>*>(value));
-	if ((*thread)->kind == Thread::Kind::kForeign)
+	if ((*thread)->kind == Thread::Kind::kForeign) {
 		run_exit_callbacks(thread->get());
-	{
 		KernelSection section;
 		end_thread_record(thread->get());
 	}
@@ -388,8 +386,13 @@ end_thread_record(Thread* thread)
 	dead.push_back(record);
 	if (dead.size() <= kMaxDeadThreads)
 		return;
-	table().threads.erase(dead.front()->id);
+	std::shared_ptr<Thread> oldest = dead.front();
 	dead.pop_front();
+	table().threads.erase(oldest->id);
+	if (oldest->kind == Thread::Kind::kSpawned && !oldest->joined) {
+		oldest->joined = true;
+		pthread_detach(oldest->pthread);
+	}
 }
 
 

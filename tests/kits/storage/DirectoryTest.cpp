@@ -14,7 +14,7 @@
 #include <SymLink.h>
 
 #include "OrdinaryUser.h"
-#include "support/TemporaryFolder.h"
+#include "TemporaryFolder.h"
 
 namespace {
 

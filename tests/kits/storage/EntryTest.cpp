@@ -13,7 +13,7 @@
 #include <Path.h>
 #include <StorageDefs.h>
 
-#include "support/TemporaryFolder.h"
+#include "TemporaryFolder.h"
 
 namespace {
 

@@ -14,7 +14,7 @@
 #include <Entry.h>
 #include <Errors.h>
 
-#include "support/TemporaryFolder.h"
+#include "TemporaryFolder.h"
 
 
 TEST(FileTest, OpenModesDoWhatTheySay)

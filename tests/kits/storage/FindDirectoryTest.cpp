@@ -8,7 +8,7 @@
 #include <Errors.h>
 #include <Path.h>
 
-#include "support/TemporaryFolder.h"
+#include "TemporaryFolder.h"
 
 namespace {
 

@@ -12,7 +12,7 @@
 #include <Node.h>
 #include <NodeInfo.h>
 
-#include "support/TemporaryFolder.h"
+#include "TemporaryFolder.h"
 
 namespace {
 

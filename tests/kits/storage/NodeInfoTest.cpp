@@ -13,7 +13,7 @@
 #include <Message.h>
 #include <StorageDefs.h>
 
-#include "support/TemporaryFolder.h"
+#include "TemporaryFolder.h"
 
 namespace {
 

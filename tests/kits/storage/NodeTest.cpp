@@ -17,7 +17,7 @@
 #include <TypeConstants.h>
 #include <fs_attr.h>
 
-#include "support/TemporaryFolder.h"
+#include "TemporaryFolder.h"
 
 namespace {
 

@@ -12,7 +12,7 @@
 #include <StorageDefs.h>
 #include <TypeConstants.h>
 
-#include "support/TemporaryFolder.h"
+#include "TemporaryFolder.h"
 
 
 TEST(PathTest, CleanAbsolutePathIsTakenAsText)

@@ -7,7 +7,7 @@
 
 #include <Errors.h>
 
-#include "support/TemporaryFolder.h"
+#include "TemporaryFolder.h"
 
 namespace {
 

@@ -1,0 +1,299 @@
+// SPDX-License-Identifier: MIT
+// The canvas's buffer, its clip, and how masks and rects get into the pixels.
+#include "display/qt/QtCanvas.h"
+
+#include <algorithm>
+#include <cmath>
+#include <cstring>
+
+#include <Region.h>
+
+#include "display/qt/Mask.h"
+
+namespace BPrivate {
+
+namespace {
+
+// Beyond these the arithmetic of whole pixels could overflow; no buffer reaches so far.
+const float kFarthest = 1 << 24;
+
+
+int
+Whole(float coordinate)
+{
+	// Written so that what is no number goes to a side too.
+	if (!(coordinate > -kFarthest))
+		return static_cast<int>(-kFarthest);
+	return static_cast<int>(std::floor(std::min(coordinate, kFarthest)));
+}
+
+
+bool
+IsSolid(const pattern& pattern, bool* isHigh)
+{
+	*isHigh = pattern == B_SOLID_HIGH;
+	return *isHigh || pattern == B_SOLID_LOW;
+}
+
+} // namespace
+
+
+QtCanvas::QtCanvas(QtFonts& fonts, int32 width, int32 height, float scale)
+	: fFonts(fonts),
+	  fWidth(std::max(width, 1)),
+	  fHeight(std::max(height, 1)),
+	  fScale(scale)
+{
+	fBuffer.width = static_cast<int32>(std::lround(fWidth * fScale));
+	fBuffer.height = static_cast<int32>(std::lround(fHeight * fScale));
+	fBuffer.bytesPerRow = fBuffer.width * 4;
+	fPixels.assign(static_cast<size_t>(fBuffer.width) * fBuffer.height, 0xffffffff);
+	fBuffer.bits = fPixels.data();
+	SetClip(nullptr);
+	SetState(CanvasState());
+}
+
+
+QtCanvas::QtCanvas(QtFonts& fonts, const PixelBuffer& buffer)
+	: fFonts(fonts),
+	  fBuffer(buffer),
+	  fWidth(buffer.width),
+	  fHeight(buffer.height),
+	  fScale(1)
+{
+	SetClip(nullptr);
+	SetState(CanvasState());
+}
+
+
+void
+QtCanvas::SetState(const CanvasState& state)
+{
+	fState = state;
+	fBlend.mode = state.mode;
+	fBlend.alphaSource = state.alphaSource;
+	fBlend.alphaFunction = state.alphaFunction;
+	fBlend.high = state.highColor;
+	fBlend.low = state.lowColor;
+	fBlend.hasAlpha = fBuffer.hasAlpha;
+}
+
+
+void
+QtCanvas::SetClip(const BRegion* clip)
+{
+	QRect all(0, 0, fBuffer.width, fBuffer.height);
+	fClip.clear();
+	if (clip == nullptr) {
+		fClip.push_back(all);
+		fClipBounds = all;
+		return;
+	}
+
+	fClipBounds = QRect();
+	int32 count = clip->CountRects();
+	fClip.reserve(count);
+	for (int32 i = 0; i < count; i++) {
+		clipping_rect rect = clip->RectAtInt(i);
+		QRect device = DeviceRect(rect.left, rect.top, rect.right, rect.bottom) & all;
+		if (device.isEmpty())
+			continue;
+		fClip.push_back(device);
+		fClipBounds |= device;
+	}
+}
+
+
+// #pragma mark - coordinates
+
+
+QRect
+QtCanvas::DeviceRect(int left, int top, int right, int bottom) const
+{
+	auto edge = [this](int coordinate) {
+		return static_cast<int>(std::lround(
+			std::clamp(static_cast<float>(coordinate), -kFarthest, kFarthest) * fScale));
+	};
+	return QRect(QPoint(edge(left), edge(top)), QPoint(edge(right + 1) - 1, edge(bottom + 1) - 1));
+}
+
+
+QRect
+QtCanvas::Device(const QRect& whole) const
+{
+	return DeviceRect(whole.left(), whole.top(), whole.right(), whole.bottom());
+}
+
+
+QPoint
+QtCanvas::WholePoint(BPoint point) const
+{
+	return QPoint(Whole(point.x + fState.origin.x), Whole(point.y + fState.origin.y));
+}
+
+
+QRect
+QtCanvas::WholeRect(BRect rect) const
+{
+	return QRect(WholePoint(rect.LeftTop()), WholePoint(rect.RightBottom()));
+}
+
+
+QPointF
+QtCanvas::Center(BPoint point) const
+{
+	return QPointF(point.x + fState.origin.x + 0.5, point.y + fState.origin.y + 0.5);
+}
+
+
+QRectF
+QtCanvas::CenterRect(BRect rect) const
+{
+	return QRectF(Center(rect.LeftTop()), Center(rect.RightBottom()));
+}
+
+
+QRectF
+QtCanvas::EdgeRect(BRect rect) const
+{
+	QPointF half(0.5, 0.5);
+	return QRectF(Center(rect.LeftTop()) - half, Center(rect.RightBottom()) + half);
+}
+
+
+QRect
+QtCanvas::DeviceBounds(const QRectF& area) const
+{
+	// One pixel more on each side for what smoothing adds; clamped before it becomes integers.
+	QRectF device(area.left() * fScale - 1, area.top() * fScale - 1, area.width() * fScale + 2,
+		area.height() * fScale + 2);
+	return (device & QRectF(fClipBounds)).toAlignedRect() & fClipBounds;
+}
+
+
+int
+QtCanvas::PenWidth() const
+{
+	return std::max(1, static_cast<int>(std::lround(std::min(fState.penSize, 10000.0f))));
+}
+
+
+bool
+QtCanvas::HasThinPen() const
+{
+	return PenWidth() == 1;
+}
+
+
+uint32*
+QtCanvas::Row(int y) const
+{
+	return reinterpret_cast<uint32*>(
+		static_cast<uint8*>(fBuffer.bits) + static_cast<size_t>(y) * fBuffer.bytesPerRow);
+}
+
+
+// #pragma mark - pixels
+
+
+bool
+QtCanvas::IsHigh(const pattern& pattern, int x, int y) const
+{
+	int column = static_cast<int>(std::floor(x / fScale)) - static_cast<int>(fState.origin.x);
+	int row = static_cast<int>(std::floor(y / fScale)) - static_cast<int>(fState.origin.y);
+	return (pattern.data[row & 7] & (0x80 >> (column & 7))) != 0;
+}
+
+
+void
+QtCanvas::FillWhole(const QRect& whole, const pattern& pattern)
+{
+	if (!whole.isEmpty())
+		FillDevice(Device(whole), pattern);
+}
+
+
+void
+QtCanvas::FillDevice(const QRect& device, const pattern& pattern)
+{
+	bool isHigh;
+	bool isSolid = IsSolid(pattern, &isHigh);
+	uint32 pixel;
+	if (isSolid && fBlend.IsPlainFill(isHigh, &pixel)) {
+		ForEachSpan(device, [&](int y, int left, int right) {
+			uint32* row = Row(y);
+			std::fill(row + left, row + right + 1, pixel);
+		});
+		return;
+	}
+	ForEachSpan(device, [&](int y, int left, int right) {
+		uint32* row = Row(y);
+		for (int x = left; x <= right; x++) {
+			bool high = isSolid ? isHigh : IsHigh(pattern, x, y);
+			row[x] = fBlend.Shape(row[x], high, 255);
+		}
+	});
+}
+
+
+void
+QtCanvas::PaintMask(const Mask& mask, const pattern& pattern)
+{
+	if (mask.IsEmpty())
+		return;
+	bool isHigh;
+	bool isSolid = IsSolid(pattern, &isHigh);
+	ForEachSpan(mask.Area(), [&](int y, int left, int right) {
+		uint32* row = Row(y);
+		const uint8* coverage = mask.Row(left, y);
+		for (int x = left; x <= right; x++, coverage++) {
+			if (*coverage == 0)
+				continue;
+			bool high = isSolid ? isHigh : IsHigh(pattern, x, y);
+			row[x] = fBlend.Shape(row[x], high, *coverage);
+		}
+	});
+}
+
+
+void
+QtCanvas::PaintTextMask(const Mask& mask)
+{
+	if (mask.IsEmpty())
+		return;
+	ForEachSpan(mask.Area(), [&](int y, int left, int right) {
+		uint32* row = Row(y);
+		const uint8* coverage = mask.Row(left, y);
+		for (int x = left; x <= right; x++, coverage++) {
+			if (*coverage != 0)
+				row[x] = fBlend.Text(row[x], *coverage);
+		}
+	});
+}
+
+
+rgb_color
+QtCanvas::PixelAt(BPoint where) const
+{
+	QRect whole(QPoint(Whole(where.x), Whole(where.y)), QSize(1, 1));
+	QPoint device = Device(whole).topLeft();
+	if (!QRect(0, 0, fBuffer.width, fBuffer.height).contains(device))
+		return {0, 0, 0, 0};
+	rgb_color color = ColorOf(Row(device.y())[device.x()]);
+	if (!fBuffer.hasAlpha)
+		color.alpha = 255;
+	return color;
+}
+
+
+Picture
+QtCanvas::ReadPicture() const
+{
+	Picture picture{fBuffer.width, fBuffer.height, fBuffer.hasAlpha, {}};
+	picture.pixels.reserve(static_cast<size_t>(fBuffer.width) * fBuffer.height);
+	for (int32 y = 0; y < fBuffer.height; y++)
+		picture.pixels.insert(picture.pixels.end(), Row(y), Row(y) + fBuffer.width);
+	return picture;
+}
+
+} // namespace BPrivate

@@ -1,0 +1,123 @@
+// SPDX-License-Identifier: MIT
+// The canvas with pixels: shapes and text become masks, the drawing modes put them into the buffer.
+#ifndef DISPLAY_QT_CANVAS_H
+#define DISPLAY_QT_CANVAS_H
+
+#include <vector>
+
+#include <QRect>
+
+#include "display/Canvas.h"
+#include "display/PixelBuffer.h"
+#include "display/qt/Blend.h"
+
+class QPainterPath;
+
+namespace BPrivate {
+
+class Mask;
+class QtFonts;
+
+class QtCanvas : public Canvas {
+public:
+	QtCanvas(QtFonts& fonts, int32 width, int32 height, float scale);
+	QtCanvas(QtFonts& fonts, const PixelBuffer& buffer);
+
+	int32 Width() const override { return fWidth; }
+	int32 Height() const override { return fHeight; }
+	float Scale() const override { return fScale; }
+	void SetState(const CanvasState& state) override;
+	void SetClip(const BRegion* clip) override;
+
+	void StrokeLine(BPoint start, BPoint end, const pattern& pattern) override;
+	void StrokeLine(BPoint start, BPoint end, rgb_color color) override;
+	void StrokeRect(BRect rect, const pattern& pattern) override;
+	void FillRect(BRect rect, const pattern& pattern) override;
+	void InvertRect(BRect rect) override;
+	void FillRegion(const BRegion& region, const pattern& pattern) override;
+	void StrokeRoundRect(BRect rect, float xRadius, float yRadius, const pattern& pattern) override;
+	void FillRoundRect(BRect rect, float xRadius, float yRadius, const pattern& pattern) override;
+	void StrokeEllipse(BRect rect, const pattern& pattern) override;
+	void FillEllipse(BRect rect, const pattern& pattern) override;
+	void StrokeArc(BRect rect, float startAngle, float arcAngle, const pattern& pattern) override;
+	void FillArc(BRect rect, float startAngle, float arcAngle, const pattern& pattern) override;
+	void StrokePolygon(
+		const BPoint* points, int32 count, bool closed, const pattern& pattern) override;
+	void FillPolygon(const BPoint* points, int32 count, const pattern& pattern) override;
+	void StrokePath(const CanvasPath& path, const pattern& pattern) override;
+	void FillPath(const CanvasPath& path, const pattern& pattern) override;
+	BPoint DrawString(
+		const char* text, int32 length, BPoint where, const escapement_delta* delta) override;
+	void DrawString(const char* text, int32 length, const BPoint* locations, int32 count) override;
+	void DrawBitmap(
+		const PixelBuffer& bitmap, BRect source, BRect destination, uint32 options) override;
+	void CopyBits(BRect source, BRect destination) override;
+	rgb_color PixelAt(BPoint where) const override;
+	Picture ReadPicture() const override;
+
+	/// The device pixels.
+	const PixelBuffer& Buffer() const { return fBuffer; }
+	/// The device pixels of a rect of whole pixels of the API.
+	QRect DeviceRect(int left, int top, int right, int bottom) const;
+
+private:
+	/// A rect of the operation in whole pixels of the buffer's coordinates, origin added.
+	QRect WholeRect(BRect rect) const;
+	QPoint WholePoint(BPoint point) const;
+	QPointF Center(BPoint point) const;
+	QRectF CenterRect(BRect rect) const;
+	QRectF EdgeRect(BRect rect) const;
+	QRect Device(const QRect& whole) const;
+	QRect DeviceBounds(const QRectF& area) const;
+	int PenWidth() const;
+	bool HasThinPen() const;
+	uint32* Row(int y) const;
+
+	// Putting pixels into the buffer
+	void FillWhole(const QRect& whole, const pattern& pattern);
+	void FillDevice(const QRect& device, const pattern& pattern);
+	void PaintMask(const Mask& mask, const pattern& pattern);
+	void PaintTextMask(const Mask& mask);
+	template <typename Function>
+	void ForEachSpan(const QRect& device, Function function);
+	bool IsHigh(const pattern& pattern, int x, int y) const;
+
+	void DrawRun(const char* text, int32 length, BPoint where, float width);
+
+	// Outlines, in the buffer's coordinates
+	void StrokeOutline(const QPainterPath& outline, const pattern& pattern);
+	void FillOutline(const QPainterPath& outline, const pattern& pattern);
+	void StrokeStraight(const QPoint* points, int count, bool closed, const pattern& pattern);
+	void StrokeThickLine(QPoint start, QPoint end, const pattern& pattern);
+	QPainterPath PathOf(const CanvasPath& path) const;
+
+	QtFonts& fFonts;
+	std::vector<uint32> fPixels;
+	PixelBuffer fBuffer;
+	const int32 fWidth;
+	const int32 fHeight;
+	const float fScale;
+	CanvasState fState;
+	Blend fBlend;
+	/// Device rects, and the smallest one around them.
+	std::vector<QRect> fClip;
+	QRect fClipBounds;
+};
+
+
+template <typename Function>
+void
+QtCanvas::ForEachSpan(const QRect& device, Function function)
+{
+	if (!device.intersects(fClipBounds))
+		return;
+	for (const QRect& clip : fClip) {
+		QRect visible = clip & device;
+		for (int y = visible.top(); y <= visible.bottom(); y++)
+			function(y, visible.left(), visible.right());
+	}
+}
+
+} // namespace BPrivate
+
+#endif // DISPLAY_QT_CANVAS_H

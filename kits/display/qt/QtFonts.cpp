@@ -1,0 +1,300 @@
+// SPDX-License-Identifier: MIT
+// The host's fonts, by Qt's font database.
+#include "display/qt/QtFonts.h"
+
+#include <algorithm>
+#include <cmath>
+#include <cstring>
+#include <optional>
+
+#include <QFont>
+#include <QFontDatabase>
+#include <QFontInfo>
+#include <QFontMetricsF>
+#include <QString>
+#include <QStringList>
+
+#include "display/Utf8.h"
+
+namespace BPrivate {
+
+namespace {
+
+// Qt counts in points of 96 to 72 pixels (the application object is told so).
+const double kPointsPerPixel = 0.75;
+
+
+/// The font and metrics that a thread used last: most text comes in runs of one font.
+struct LastFont {
+	FontKey key;
+	QFont font;
+	QFontMetricsF metrics;
+};
+
+
+uint16
+FaceOf(const QString& family, const QString& style)
+{
+	int weight = QFontDatabase::weight(family, style);
+	uint16 face = 0;
+	if (QFontDatabase::italic(family, style))
+		face |= B_ITALIC_FACE;
+	if (weight >= QFont::Black)
+		face |= B_HEAVY_FACE;
+	else if (weight >= QFont::DemiBold)
+		face |= B_BOLD_FACE;
+	else if (weight <= QFont::Light)
+		face |= B_LIGHT_FACE;
+	if (style.contains(QLatin1String("Condensed"), Qt::CaseInsensitive))
+		face |= B_CONDENSED_FACE;
+	return face == 0 ? static_cast<uint16>(B_REGULAR_FACE) : face;
+}
+
+
+QString
+StandardFamily(standard_font which)
+{
+	QFont font(which == kFixedFont ? QLatin1String("monospace") : QLatin1String("sans-serif"));
+	if (which == kFixedFont) {
+		font.setStyleHint(QFont::Monospace);
+		font.setFixedPitch(true);
+	} else
+		font.setStyleHint(QFont::SansSerif);
+	return QFontInfo(font).family();
+}
+
+
+bool
+SameKey(const FontKey& a, const FontKey& b)
+{
+	return a.family == b.family && a.style == b.style && a.size == b.size && a.face == b.face
+		&& a.shear == b.shear && a.spacing == b.spacing && a.flags == b.flags;
+}
+
+
+const LastFont&
+Last(QtFonts& fonts, const FontKey& key)
+{
+	thread_local std::optional<LastFont> last;
+	if (!last.has_value() || !SameKey(last->key, key)) {
+		QFont font = fonts.FontFor(key, 1);
+		last.emplace(LastFont{key, font, QFontMetricsF(font)});
+	}
+	return *last;
+}
+
+} // namespace
+
+
+QtFonts::QtFonts()
+	: fHasFamilies(false),
+	  fStandardFamilies(),
+	  fStandardStyles()
+{
+}
+
+
+void
+QtFonts::ReadFamilies()
+{
+	if (fHasFamilies)
+		return;
+	fHasFamilies = true;
+	for (const QString& name : QFontDatabase::families()) {
+		std::string utf8 = name.toStdString();
+		if (utf8.size() <= B_FONT_FAMILY_LENGTH && !QFontDatabase::isPrivateFamily(name))
+			fFamilies.push_back({utf8, false, {}});
+	}
+	FindStandardFonts();
+}
+
+
+void
+QtFonts::FindStandardFonts()
+{
+	for (standard_font which : {kPlainFont, kBoldFont, kFixedFont}) {
+		std::string name = StandardFamily(which).toStdString();
+		auto found = std::find_if(fFamilies.begin(), fFamilies.end(),
+			[&](const Family& family) { return family.name == name; });
+		if (found == fFamilies.end())
+			continue;
+
+		int32 index = static_cast<int32>(found - fFamilies.begin());
+		fStandardFamilies[which] = static_cast<uint16>(index);
+		uint16 wanted = which == kBoldFont ? B_BOLD_FACE : B_REGULAR_FACE;
+		Family* family = FamilyAt(index);
+		for (size_t i = 0; i < family->styles.size(); i++) {
+			if (family->styles[i].face == wanted) {
+				fStandardStyles[which] = static_cast<uint16>(i);
+				break;
+			}
+		}
+	}
+}
+
+
+QtFonts::Family*
+QtFonts::FamilyAt(int32 index)
+{
+	ReadFamilies();
+	if (index < 0 || index >= static_cast<int32>(fFamilies.size()))
+		return nullptr;
+
+	Family& family = fFamilies[index];
+	if (family.hasStyles)
+		return &family;
+	family.hasStyles = true;
+	QString familyName = QString::fromStdString(family.name);
+	for (const QString& style : QFontDatabase::styles(familyName)) {
+		std::string name = style.toStdString();
+		if (name.size() > B_FONT_STYLE_LENGTH)
+			continue;
+		family.styles.push_back({name, FaceOf(familyName, style),
+			QFontDatabase::weight(familyName, style), QFontDatabase::italic(familyName, style),
+			QFontDatabase::isFixedPitch(familyName, style)});
+	}
+	return &family;
+}
+
+
+int32
+QtFonts::CountFamilies()
+{
+	std::lock_guard<std::mutex> lock(fMutex);
+	ReadFamilies();
+	return static_cast<int32>(fFamilies.size());
+}
+
+
+status_t
+QtFonts::GetFamily(int32 index, font_family* name)
+{
+	std::lock_guard<std::mutex> lock(fMutex);
+	ReadFamilies();
+	if (index < 0 || index >= static_cast<int32>(fFamilies.size()))
+		return B_BAD_INDEX;
+	strcpy(*name, fFamilies[index].name.c_str());
+	return B_OK;
+}
+
+
+int32
+QtFonts::CountStyles(int32 index)
+{
+	std::lock_guard<std::mutex> lock(fMutex);
+	const Family* family = FamilyAt(index);
+	return family != nullptr ? static_cast<int32>(family->styles.size()) : 0;
+}
+
+
+status_t
+QtFonts::GetStyle(int32 index, int32 style, FontStyleInfo* info)
+{
+	std::lock_guard<std::mutex> lock(fMutex);
+	const Family* family = FamilyAt(index);
+	if (family == nullptr || style < 0 || style >= static_cast<int32>(family->styles.size()))
+		return B_BAD_INDEX;
+	strcpy(info->name, family->styles[style].name.c_str());
+	info->face = family->styles[style].face;
+	info->isFixed = family->styles[style].isFixed;
+	return B_OK;
+}
+
+
+void
+QtFonts::GetStandardFont(standard_font which, uint16* family, uint16* style, float* size)
+{
+	std::lock_guard<std::mutex> lock(fMutex);
+	ReadFamilies();
+	*family = fStandardFamilies[which];
+	*style = fStandardStyles[which];
+	*size = 12;
+}
+
+
+QFont
+QtFonts::FontFor(const FontKey& key, float scale)
+{
+	QFont font;
+	{
+		std::lock_guard<std::mutex> lock(fMutex);
+		const Family* family = FamilyAt(key.family);
+		if (family == nullptr)
+			family = FamilyAt(fStandardFamilies[kPlainFont]);
+		if (family != nullptr) {
+			font.setFamily(QString::fromStdString(family->name));
+			if (key.style < family->styles.size()) {
+				const Style& style = family->styles[key.style];
+				font.setStyleName(QString::fromStdString(style.name));
+				font.setWeight(static_cast<QFont::Weight>(style.weight));
+				font.setItalic(style.isItalic);
+			}
+		}
+	}
+	double size = std::clamp(key.size, 0.5f, 10000.0f) * scale;
+	font.setPointSizeF(size * kPointsPerPixel);
+	font.setHintingPreference(QFont::PreferNoHinting);
+	font.setKerning(false);
+	font.setUnderline((key.face & B_UNDERSCORE_FACE) != 0);
+	font.setStrikeOut((key.face & B_STRIKEOUT_FACE) != 0);
+	if ((key.flags & B_DISABLE_ANTIALIASING) != 0)
+		font.setStyleStrategy(QFont::NoAntialias);
+	return font;
+}
+
+
+// #pragma mark - measuring
+
+
+font_height
+QtFonts::Height(const FontKey& font)
+{
+	const QFontMetricsF& metrics = Last(*this, font).metrics;
+	return {static_cast<float>(metrics.ascent()), static_cast<float>(metrics.descent()),
+		static_cast<float>(std::max(metrics.leading(), 0.0))};
+}
+
+
+float
+QtFonts::StringWidth(const FontKey& font, const char* text, int32 length)
+{
+	if (length <= 0)
+		return 0;
+	const QFontMetricsF& metrics = Last(*this, font).metrics;
+	return static_cast<float>(metrics.horizontalAdvance(QString::fromUtf8(text, length)));
+}
+
+
+void
+QtFonts::GetEscapements(const FontKey& font, const char* text, int32 count, float* escapements)
+{
+	const QFontMetricsF& metrics = Last(*this, font).metrics;
+	const char* end = text + strlen(text);
+	for (int32 i = 0; i < count; i++) {
+		escapements[i] = 0;
+		if (text >= end)
+			continue;
+		char32_t character = NextCharacter(&text, end);
+		escapements[i] =
+			static_cast<float>(metrics.horizontalAdvance(QString::fromUcs4(&character, 1)));
+	}
+}
+
+
+void
+QtFonts::GetGlyphBounds(const FontKey& font, const char* text, int32 count, BRect* bounds)
+{
+	const QFontMetricsF& metrics = Last(*this, font).metrics;
+	const char* end = text + strlen(text);
+	for (int32 i = 0; i < count; i++) {
+		bounds[i] = BRect();
+		if (text >= end)
+			continue;
+		char32_t character = NextCharacter(&text, end);
+		QRectF ink = metrics.tightBoundingRect(QString::fromUcs4(&character, 1));
+		if (!ink.isEmpty())
+			bounds[i].Set(ink.left(), ink.top(), ink.right() - 1, ink.bottom() - 1);
+	}
+}
+
+} // namespace BPrivate

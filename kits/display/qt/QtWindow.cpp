@@ -1,0 +1,486 @@
+// SPDX-License-Identifier: MIT
+// The host's window: shows the finished picture and hands events to the input hub. Display thread only.
+#include "display/qt/QtWindow.h"
+
+#include <algorithm>
+#include <cmath>
+
+#include <QGuiApplication>
+#include <QKeyEvent>
+#include <QMouseEvent>
+#include <QPainter>
+#include <QScreen>
+#include <QWheelEvent>
+
+#include <AppDefs.h>
+#include <View.h>
+#include <Window.h>
+
+#include "display/InputHub.h"
+#include "display/qt/DropData.h"
+#include "display/qt/KeyTranslation.h"
+#include "display/qt/QtDisplay.h"
+#include "display/qt/Surface.h"
+
+namespace BPrivate {
+
+namespace {
+
+// Where the window's thread has not drawn yet, as after a resize: the colour of panels.
+const QColor kUndrawnColor(216, 216, 216);
+const int kWheelStep = 120;
+const int kLargestSize = 32767;
+
+
+uint32
+ButtonsOf(Qt::MouseButtons pressed)
+{
+	uint32 buttons = 0;
+	if ((pressed & Qt::LeftButton) != 0)
+		buttons |= B_PRIMARY_MOUSE_BUTTON;
+	if ((pressed & Qt::RightButton) != 0)
+		buttons |= B_SECONDARY_MOUSE_BUTTON;
+	if ((pressed & Qt::MiddleButton) != 0)
+		buttons |= B_TERTIARY_MOUSE_BUTTON;
+	if ((pressed & Qt::BackButton) != 0)
+		buttons |= B_MOUSE_BUTTON(4);
+	if ((pressed & Qt::ForwardButton) != 0)
+		buttons |= B_MOUSE_BUTTON(5);
+	return buttons;
+}
+
+
+BPoint
+PointOf(QPointF point)
+{
+	return BPoint(std::floor(point.x()), std::floor(point.y()));
+}
+
+
+Qt::WindowFlags
+FlagsOf(const HostWindowStyle& style)
+{
+	if (style.isMenu)
+		return Qt::ToolTip | Qt::FramelessWindowHint | Qt::WindowDoesNotAcceptFocus;
+
+	Qt::WindowFlags flags = Qt::Window;
+	switch (style.look) {
+		case B_BORDERED_WINDOW_LOOK:
+		case B_NO_BORDER_WINDOW_LOOK:
+			flags |= Qt::FramelessWindowHint;
+			break;
+		case B_FLOATING_WINDOW_LOOK:
+			flags = Qt::Tool;
+			break;
+		case B_MODAL_WINDOW_LOOK:
+			flags = Qt::Dialog;
+			break;
+		default:
+			break;
+	}
+	flags |= Qt::CustomizeWindowHint | Qt::WindowTitleHint | Qt::WindowSystemMenuHint;
+	if ((style.flags & B_NOT_CLOSABLE) == 0)
+		flags |= Qt::WindowCloseButtonHint;
+	if ((style.flags & B_NOT_ZOOMABLE) == 0)
+		flags |= Qt::WindowMaximizeButtonHint;
+	if ((style.flags & B_NOT_MINIMIZABLE) == 0)
+		flags |= Qt::WindowMinimizeButtonHint;
+	if ((style.flags & B_AVOID_FOCUS) != 0)
+		flags |= Qt::WindowDoesNotAcceptFocus;
+
+	StackedWindow stacked;
+	stacked.style = style;
+	if (stacked.IsFloating() || style.feel == B_MODAL_ALL_WINDOW_FEEL)
+		flags |= Qt::WindowStaysOnTopHint;
+	return flags;
+}
+
+
+void
+PaintOverlay(QPainter& painter, const InputOverlay& overlay, BPoint leftTop)
+{
+	painter.translate(-leftTop.x, -leftTop.y);
+	// Black and white by turns, to be seen on everything.
+	QPen light(Qt::white, 1);
+	QPen dark(Qt::black, 1, Qt::CustomDashLine);
+	dark.setDashPattern({3, 3});
+	bool showsImage = overlay.image != nullptr;
+	if (showsImage) {
+		const Picture& picture = *overlay.image;
+		QImage image(reinterpret_cast<const uchar*>(picture.pixels.data()), picture.width,
+			picture.height, picture.hasAlpha ? QImage::Format_ARGB32 : QImage::Format_RGB32);
+		painter.setOpacity(0.7);
+		painter.drawImage(QPointF(overlay.dragged.left, overlay.dragged.top), image);
+		painter.setOpacity(1);
+	}
+	for (const BRect& rect : {overlay.tracking, showsImage ? BRect() : overlay.dragged}) {
+		if (!rect.IsValid())
+			continue;
+		QRectF outline(rect.left + 0.5, rect.top + 0.5, rect.Width(), rect.Height());
+		for (const QPen& pen : {light, dark}) {
+			painter.setPen(pen);
+			painter.drawRect(outline);
+		}
+	}
+}
+
+} // namespace
+
+
+QtWindow::QtWindow(QtDisplay& display, std::shared_ptr<Surface> surface, StackedWindow* stacked)
+	: scale(1),
+	  fDisplay(display),
+	  fBackingStore(this),
+	  fSurface(std::move(surface)),
+	  fStacked(stacked),
+	  fIsMinimized(false),
+	  fIsAway(false)
+{
+	setSurfaceType(QSurface::RasterSurface);
+	Apply(stacked->style);
+	Place(stacked->frame);
+	scale = static_cast<float>(devicePixelRatio());
+}
+
+
+BRect
+QtWindow::RectOf(const QRect& geometry)
+{
+	return BRect(geometry.left(), geometry.top(), geometry.right(), geometry.bottom());
+}
+
+
+// #pragma mark - what the program wants
+
+
+void
+QtWindow::Apply(const HostWindowStyle& style)
+{
+	fStyle = style;
+	Qt::WindowFlags flags = FlagsOf(style);
+	if (flags != this->flags()) {
+		bool wasVisible = isVisible();
+		setFlags(flags);
+		if (wasVisible)
+			setVisible(true);
+	}
+	ApplyLimits();
+}
+
+
+void
+QtWindow::SetLimits(const HostSizeLimits& limits)
+{
+	fLimits = limits;
+	ApplyLimits();
+}
+
+
+void
+QtWindow::ApplyLimits()
+{
+	auto pixels = [](float size) {
+		return std::clamp(static_cast<int>(std::min(size, 32768.0f)) + 1, 1, kLargestSize);
+	};
+	QSize least(pixels(fLimits.minWidth), pixels(fLimits.minHeight));
+	QSize most(pixels(fLimits.maxWidth), pixels(fLimits.maxHeight));
+	// A window manager knows no flag for this: limits that leave no choice do the same.
+	bool fixedWidth = (fStyle.flags & (B_NOT_RESIZABLE | B_NOT_H_RESIZABLE)) != 0;
+	bool fixedHeight = (fStyle.flags & (B_NOT_RESIZABLE | B_NOT_V_RESIZABLE)) != 0;
+	BRect frame = fDisplay.Hub().Frame(fStacked);
+	QSize size(frame.IntegerWidth() + 1, frame.IntegerHeight() + 1);
+	if (fixedWidth) {
+		least.setWidth(size.width());
+		most.setWidth(size.width());
+	}
+	if (fixedHeight) {
+		least.setHeight(size.height());
+		most.setHeight(size.height());
+	}
+	setMinimumSize(least);
+	setMaximumSize(most.expandedTo(least));
+}
+
+
+void
+QtWindow::Place(BRect frame)
+{
+	QRect wanted(static_cast<int>(frame.left), static_cast<int>(frame.top),
+		std::max(frame.IntegerWidth() + 1, 1), std::max(frame.IntegerHeight() + 1, 1));
+	ApplyLimits();
+	if (wanted == geometry())
+		return;
+	if (isVisible())
+		fRequested.push_back(wanted);
+	setGeometry(wanted);
+}
+
+
+void
+QtWindow::ShowWindow()
+{
+	StackedWindow kind;
+	kind.style = fStyle;
+	if (fStyle.isMenu || kind.IsModal() || kind.IsFloating()) {
+		QWindow* parent = fDisplay.WindowForTransients(this);
+		if (parent != nullptr)
+			setTransientParent(parent);
+	}
+	if ((fStyle.flags & B_AVOID_FRONT) == 0)
+		raise();
+	setVisible(true);
+	CheckScale();
+}
+
+
+void
+QtWindow::HideWhileInactive()
+{
+	StackedWindow kind;
+	kind.style = fStyle;
+	if (fStyle.feel == B_FLOATING_ALL_WINDOW_FEEL || !kind.IsFloating() || !isVisible())
+		return;
+	fIsAway = true;
+	setVisible(false);
+}
+
+
+void
+QtWindow::ShowAgain()
+{
+	if (!fIsAway)
+		return;
+	fIsAway = false;
+	setVisible(true);
+}
+
+
+void
+QtWindow::HideWindow()
+{
+	fIsAway = false;
+	setVisible(false);
+}
+
+
+void
+QtWindow::Minimize(bool minimized)
+{
+	// Set first: the host's answer is no news then.
+	fIsMinimized = minimized;
+	Qt::WindowStates states = windowStates();
+	states.setFlag(Qt::WindowMinimized, minimized);
+	setWindowStates(states);
+}
+
+
+BRect
+QtWindow::FrameWithBorder() const
+{
+	return RectOf(frameGeometry());
+}
+
+
+// #pragma mark - showing
+
+
+void
+QtWindow::ShowDamage()
+{
+	QRegion damage = fSurface->TakeDamage();
+	if (!damage.isEmpty() && isExposed())
+		Paint(damage);
+}
+
+
+void
+QtWindow::Paint(const QRegion& wanted)
+{
+	QRect all(QPoint(0, 0), size());
+	QRegion region = wanted & all;
+	if (region.isEmpty())
+		return;
+	if (fBackingStore.size() != size()) {
+		fBackingStore.resize(size());
+		region = all;
+	}
+
+	InputOverlay overlay = fDisplay.Hub().Overlay();
+	fBackingStore.beginPaint(region);
+	QPaintDevice* device = fBackingStore.paintDevice();
+	if (device != nullptr) {
+		QPainter painter(device);
+		painter.setClipRegion(region);
+		fSurface->Paint([&](const QImage& image) {
+			QSizeF covered = image.isNull() ? QSizeF() : image.deviceIndependentSize();
+			if (covered.width() < width() || covered.height() < height())
+				painter.fillRect(all, kUndrawnColor);
+			if (!image.isNull())
+				painter.drawImage(QPointF(0, 0), image);
+		});
+		PaintOverlay(painter, overlay, fDisplay.Hub().Frame(fStacked).LeftTop());
+	}
+	fBackingStore.endPaint();
+	fBackingStore.flush(region);
+}
+
+
+void
+QtWindow::CheckScale()
+{
+	float now = static_cast<float>(devicePixelRatio());
+	if (now == scale)
+		return;
+	scale = now;
+	fDisplay.Hub().NeedsRedraw(fStacked);
+}
+
+
+// #pragma mark - what the host tells
+
+
+void
+QtWindow::exposeEvent(QExposeEvent*)
+{
+	CheckScale();
+	if (!isExposed())
+		return;
+	fSurface->TakeDamage();
+	Paint(QRect(QPoint(0, 0), size()));
+}
+
+
+void
+QtWindow::resizeEvent(QResizeEvent*)
+{
+	GeometryChanged();
+}
+
+
+void
+QtWindow::moveEvent(QMoveEvent*)
+{
+	GeometryChanged();
+}
+
+
+void
+QtWindow::GeometryChanged()
+{
+	CheckScale();
+	QRect now = geometry();
+	auto asked = std::find(fRequested.begin(), fRequested.end(), now);
+	if (asked != fRequested.end()) {
+		// Word of an older request: the program has asked for something else since.
+		bool isNewest = asked + 1 == fRequested.end();
+		fRequested.erase(fRequested.begin(), asked + 1);
+		if (!isNewest)
+			return;
+	} else
+		fRequested.clear();
+	if (isVisible())
+		fDisplay.ReportFrame(fStacked, RectOf(now));
+}
+
+
+bool
+QtWindow::event(QEvent* event)
+{
+	InputHub& hub = fDisplay.Hub();
+	switch (event->type()) {
+		case QEvent::Close:
+			// The program decides.
+			event->ignore();
+			hub.Deliver(fStacked, std::make_unique<BMessage>(B_QUIT_REQUESTED));
+			return true;
+
+		case QEvent::MouseButtonPress:
+		case QEvent::MouseButtonDblClick:
+		case QEvent::MouseButtonRelease:
+		case QEvent::MouseMove:
+			HandleMouse(static_cast<QMouseEvent*>(event));
+			return true;
+
+		case QEvent::Wheel:
+			HandleWheel(static_cast<QWheelEvent*>(event));
+			return true;
+
+		case QEvent::Leave:
+			hub.PointerLeft();
+			return true;
+
+		case QEvent::KeyPress:
+		case QEvent::KeyRelease:
+			fDisplay.HandleKey(*static_cast<QKeyEvent*>(event));
+			return true;
+
+		case QEvent::DragEnter:
+		case QEvent::DragMove:
+		{
+			auto move = static_cast<QDragMoveEvent*>(event);
+			move->setAccepted(IsUsableDrop(*move->mimeData()));
+			return true;
+		}
+
+		case QEvent::Drop:
+		{
+			auto drop = static_cast<QDropEvent*>(event);
+			BPoint where = PointOf(drop->position());
+			drop->acceptProposedAction();
+			hub.Drop(MakeDropMessage(*drop->mimeData()), hub.Frame(fStacked).LeftTop() + where);
+			return true;
+		}
+
+		case QEvent::WindowStateChange:
+			HandleState();
+			return QWindow::event(event);
+
+		default:
+			return QWindow::event(event);
+	}
+}
+
+
+void
+QtWindow::HandleMouse(QMouseEvent* event)
+{
+	InputHub& hub = fDisplay.Hub();
+	BPoint where = hub.Frame(fStacked).LeftTop() + PointOf(event->position());
+	uint32 buttons = ButtonsOf(event->buttons());
+	BPoint before;
+	uint32 held;
+	hub.GetPointer(&before, &held);
+	fDisplay.PointerMoved();
+	hub.SetModifiers(fDisplay.ModifiersNow(event->modifiers()));
+	// Without a button it is surely over this window; with one, the host sends it here all the same.
+	if (held == 0)
+		hub.PointerAt(where, buttons, fStacked);
+	else
+		hub.PointerAt(where, buttons, fDisplay.WindowUnder(event->globalPosition().toPoint()));
+}
+
+
+void
+QtWindow::HandleWheel(QWheelEvent* event)
+{
+	QPoint turned = event->angleDelta();
+	fDisplay.Hub().SetModifiers(fDisplay.ModifiersNow(event->modifiers()));
+	fDisplay.Hub().Wheel(-static_cast<float>(turned.x()) / kWheelStep,
+		-static_cast<float>(turned.y()) / kWheelStep, fStacked);
+}
+
+
+void
+QtWindow::HandleState()
+{
+	bool minimized = (windowStates() & Qt::WindowMinimized) != 0;
+	if (minimized == fIsMinimized)
+		return;
+	fIsMinimized = minimized;
+	fDisplay.Hub().SetMinimized(fStacked, minimized);
+	auto message = std::make_unique<BMessage>(B_MINIMIZE);
+	message->AddBool("minimize", minimized);
+	fDisplay.Hub().Deliver(fStacked, std::move(message));
+}
+
+} // namespace BPrivate

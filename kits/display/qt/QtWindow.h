@@ -1,0 +1,78 @@
+// SPDX-License-Identifier: MIT
+// The host's window: shows the finished picture and hands events to the input hub. Display thread only.
+#ifndef DISPLAY_QT_WINDOW_H
+#define DISPLAY_QT_WINDOW_H
+
+#include <atomic>
+#include <memory>
+#include <vector>
+
+#include <QBackingStore>
+#include <QWindow>
+
+#include "display/HostWindow.h"
+
+class QMouseEvent;
+class QWheelEvent;
+
+namespace BPrivate {
+
+class QtDisplay;
+class Surface;
+struct StackedWindow;
+
+class QtWindow : public QWindow {
+public:
+	QtWindow(QtDisplay& display, std::shared_ptr<Surface> surface, StackedWindow* stacked);
+
+	StackedWindow* Stacked() const { return fStacked; }
+	void Apply(const HostWindowStyle& style);
+	void SetLimits(const HostSizeLimits& limits);
+	void Place(BRect frame);
+	void ShowWindow();
+	void HideWindow();
+	/// A floating window goes while another program is active, and comes back.
+	void HideWhileInactive();
+	void ShowAgain();
+	void Minimize(bool minimized);
+	/// Shows what has changed in the surface.
+	void ShowDamage();
+	/// Paints \a region of the picture, and what follows the pointer on top.
+	void Paint(const QRegion& region);
+	void CheckScale();
+
+	BRect FrameWithBorder() const;
+	static BRect RectOf(const QRect& geometry);
+
+	/// The shape over this window, null: the application's.
+	std::shared_ptr<const CursorShape> cursorShape;
+	std::atomic<float> scale;
+
+protected:
+	bool event(QEvent* event) override;
+	void exposeEvent(QExposeEvent* event) override;
+	void resizeEvent(QResizeEvent* event) override;
+	void moveEvent(QMoveEvent* event) override;
+
+private:
+	void GeometryChanged();
+	void ApplyLimits();
+	void HandleMouse(QMouseEvent* event);
+	void HandleWheel(QWheelEvent* event);
+	void HandleState();
+
+	QtDisplay& fDisplay;
+	QBackingStore fBackingStore;
+	std::shared_ptr<Surface> fSurface;
+	StackedWindow* fStacked;
+	HostWindowStyle fStyle;
+	HostSizeLimits fLimits;
+	bool fIsMinimized;
+	bool fIsAway;
+	/// What was asked of the host and not yet seen to happen, oldest first.
+	std::vector<QRect> fRequested;
+};
+
+} // namespace BPrivate
+
+#endif // DISPLAY_QT_WINDOW_H

@@ -1,0 +1,50 @@
+// SPDX-License-Identifier: MIT
+// A window's finished picture, between the thread that draws it and the one that shows it.
+#ifndef DISPLAY_QT_SURFACE_H
+#define DISPLAY_QT_SURFACE_H
+
+#include <mutex>
+
+#include <QImage>
+#include <QRegion>
+
+#include "display/PixelBuffer.h"
+
+class BRegion;
+
+namespace BPrivate {
+
+class QtCanvas;
+
+/// Any thread; the lock is held while pixels are copied, and no longer.
+class Surface {
+public:
+	/// Takes over \a region (whole pixels of the API) of \a canvas. True when the display thread has
+	/// to be told: nothing was waiting to be shown before.
+	bool Take(const QtCanvas& canvas, const BRegion& region);
+
+	/// What changed since the last call, in window coordinates, rounded outwards.
+	QRegion TakeDamage();
+
+	/// Calls \a painter with the picture, which is empty before the first Take().
+	template <typename Painter>
+	void Paint(Painter painter) const
+	{
+		std::lock_guard<std::mutex> lock(fMutex);
+		painter(fImage);
+	}
+
+	Picture Copy() const;
+
+private:
+	void CopyRect(const PixelBuffer& from, const QRect& device);
+
+	mutable std::mutex fMutex;
+	/// Device pixels; its device pixel ratio is the canvas's scale.
+	QImage fImage;
+	QRegion fDamage;
+};
+
+} // namespace BPrivate
+
+#endif // DISPLAY_QT_SURFACE_H
