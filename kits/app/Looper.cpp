@@ -111,14 +111,14 @@ status_t
 BLooper::PostMessage(uint32 command)
 {
 	BMessage message(command);
-	return PostMessage(&message);
+	return PostTo(this, &message, this, nullptr);
 }
 
 
 status_t
 BLooper::PostMessage(BMessage* message)
 {
-	return PostMessage(message, this, nullptr);
+	return PostTo(this, message, this, nullptr);
 }
 
 
@@ -126,23 +126,31 @@ status_t
 BLooper::PostMessage(uint32 command, BHandler* handler, BHandler* replyTo)
 {
 	BMessage message(command);
-	return PostMessage(&message, handler, replyTo);
+	return PostTo(this, &message, handler, replyTo);
 }
 
 
 status_t
 BLooper::PostMessage(BMessage* message, BHandler* handler, BHandler* replyTo)
 {
+	return PostTo(this, message, handler, replyTo);
+}
+
+
+status_t
+BLooper::PostTo(const BLooper* looper, BMessage* message, BHandler* handler, BHandler* replyTo)
+{
 	if (message == nullptr)
 		return B_BAD_VALUE;
 
-	// Not through fPort: the looper may be gone.
-	std::shared_ptr<LooperPort> port = Registry::Default().PortFor(this);
+	std::shared_ptr<LooperPort> port = Registry::Default().PortFor(looper);
 	if (port == nullptr)
 		return B_BAD_PORT_ID;
 
-	BPrivate::MessageAddress to{port->Id(), kPreferredToken, Team()};
-	if (handler != nullptr) {
+	BPrivate::MessageAddress to{port->Id(), kPreferredToken, BPrivate::ThisTeam()};
+	if (handler == looper) {
+		to.token = kNoToken;
+	} else if (handler != nullptr) {
 		to.token = handler->fToken;
 		if (Registry::Default().HandlerPort(to.token) != to.port)
 			return B_MISMATCHED_VALUES;
@@ -235,12 +243,10 @@ BLooper::SetPreferredHandler(BHandler* handler)
 }
 
 
-// The lock's functions do not touch the looper, which may be gone.
-
 bool
 BLooper::Lock()
 {
-	return LockWithTimeout(B_INFINITE_TIMEOUT) == B_OK;
+	return LockPortOf(this, B_INFINITE_TIMEOUT) == B_OK;
 }
 
 
@@ -263,11 +269,18 @@ BLooper::IsLocked() const
 status_t
 BLooper::LockWithTimeout(bigtime_t timeout)
 {
-	LooperPort* held = LooperPort::HeldPort(this);
+	return LockPortOf(this, timeout);
+}
+
+
+status_t
+BLooper::LockPortOf(const BLooper* looper, bigtime_t timeout)
+{
+	LooperPort* held = LooperPort::HeldPort(looper);
 	if (held != nullptr)
 		return held->Lock(timeout);
 
-	std::shared_ptr<LooperPort> port = Registry::Default().PortFor(this);
+	std::shared_ptr<LooperPort> port = Registry::Default().PortFor(looper);
 	return port != nullptr ? port->Lock(timeout) : B_BAD_VALUE;
 }
 

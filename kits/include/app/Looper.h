@@ -120,6 +120,11 @@ private:
 	/// Called in the looper's thread without the lock when the queue has run empty, before the loop waits.
 	virtual void QueueRanEmpty();
 
+	// What works with a looper that may be gone never touches it.
+	static status_t PostTo(
+		const BLooper* looper, BMessage* message, BHandler* handler, BHandler* replyTo);
+	static status_t LockPortOf(const BLooper* looper, bigtime_t timeout);
+
 	static status_t TaskEntry(void* looper);
 	void Register(BWindow* window);
 	void RunLoop();

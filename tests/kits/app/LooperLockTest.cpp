@@ -115,6 +115,19 @@ TEST(LooperLockTest, ADeletedLooperDoesNotLock)
 }
 
 
+TEST(LooperLockTest, NothingCanBePostedToADeletedLooper)
+{
+	BLooper* looper = new BLooper;
+	BHandler handler;
+	BMessage message(1);
+	looper->Quit();
+	EXPECT_EQ(looper->PostMessage(1), B_BAD_PORT_ID);
+	EXPECT_EQ(looper->PostMessage(&message), B_BAD_PORT_ID);
+	EXPECT_EQ(looper->PostMessage(&message, &handler), B_BAD_PORT_ID);
+	EXPECT_EQ(looper->PostMessage(1, NULL), B_BAD_PORT_ID);
+}
+
+
 TEST(LooperLockTest, AnotherThreadDoesNotHoldTheCreatorsLock)
 {
 	BLooper* looper = new BLooper;
