@@ -99,6 +99,8 @@ BView::CopyBits(BRect src, BRect dst)
 		return;
 
 	canvas->CopyBits(src, dst);
+	if (IsRecording())
+		return;
 	EndDrawing(dst);
 
 	// Pixels of the source that are not there to be copied have to be drawn.

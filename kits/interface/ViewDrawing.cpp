@@ -8,9 +8,11 @@
 
 #include <Polygon.h>
 #include <Region.h>
+#include <Shape.h>
 #include <Window.h>
 
 #include "display/Canvas.h"
+#include "interface/PictureCanvas.h"
 #include "interface/ViewPrivate.h"
 #include "interface/WindowPrivate.h"
 
@@ -61,6 +63,16 @@ BezierPath(const BPoint* controlPoints)
 	return path;
 }
 
+
+CanvasPath
+MovedPath(const CanvasPath& path, BPoint by)
+{
+	CanvasPath moved(path);
+	for (BPoint& point : moved.points)
+		point += by;
+	return moved;
+}
+
 } // namespace
 
 
@@ -69,15 +81,40 @@ Canvas*
 BView::BeginDrawing() const
 {
 	CheckLock();
+	if (IsRecording())
+		return BeginRecording();
 	if (fOwner == nullptr)
 		return nullptr;
 	return fOwner->fData->painter.Begin(const_cast<BView*>(this));
 }
 
 
+bool
+BView::IsRecording() const
+{
+	return fDrawing != nullptr && !fDrawing->recordings.empty();
+}
+
+
+Canvas*
+BView::BeginRecording() const
+{
+	BPrivate::Recording& recording = fDrawing->recordings.back();
+	if (recording.serial != fDrawing->serial) {
+		recording.serial = fDrawing->serial;
+		const BPrivate::GraphicsState& state = State();
+		recording.canvas->SetState(ToCanvasState(*this, state, B_ORIGIN));
+		recording.canvas->SetClip(state.clipping ? &*state.clipping : nullptr);
+	}
+	return recording.canvas.get();
+}
+
+
 void
 BView::EndDrawing(BRect rect) const
 {
+	if (IsRecording())
+		return;
 	const BPrivate::GraphicsState& state = State();
 	rect.OffsetBy(OffsetInWindow() + state.baseOrigin + state.origin);
 	rect.Set(
@@ -535,4 +572,31 @@ BView::GetClippingRegion(BRegion* region) const
 		return;
 	*region = fOwner->fData->painter.DrawRegion(const_cast<BView*>(this));
 	region->OffsetBy(-OffsetInWindow());
+}
+
+
+// A shape's coordinates start at the pen.
+void
+BView::StrokeShape(BShape* shape, ::pattern pattern)
+{
+	Canvas* canvas = BeginDrawing();
+	if (canvas == nullptr || shape == nullptr || shape->fPath->kinds.empty())
+		return;
+
+	CanvasPath path = MovedPath(*shape->fPath, PenLocation());
+	canvas->StrokePath(path, pattern);
+	EndStroking(FrameOf(path.points.data(), static_cast<int32>(path.points.size())));
+}
+
+
+void
+BView::FillShape(BShape* shape, ::pattern pattern)
+{
+	Canvas* canvas = BeginDrawing();
+	if (canvas == nullptr || shape == nullptr || shape->fPath->kinds.empty())
+		return;
+
+	CanvasPath path = MovedPath(*shape->fPath, PenLocation());
+	canvas->FillPath(path, pattern);
+	EndStroking(FrameOf(path.points.data(), static_cast<int32>(path.points.size())));
 }

@@ -16,6 +16,8 @@
 namespace BPrivate {
 
 class Canvas;
+class PictureCanvas;
+struct CanvasState;
 
 /// What PushState() saves.
 struct GraphicsState {
@@ -40,6 +42,10 @@ struct GraphicsState {
 };
 
 
+/// As a canvas takes it: \a offset of the view in the canvas.
+CanvasState ToCanvasState(const BView& view, const GraphicsState& state, BPoint offset);
+
+
 /// A line of a line array.
 struct ColoredLine {
 	BPoint start;
@@ -61,8 +67,20 @@ struct ViewBackground {
 };
 
 
+/// A picture that is being recorded.
+struct Recording {
+	BPicture* picture = nullptr;
+	std::unique_ptr<PictureCanvas> canvas;
+	/// The state that it was last told.
+	uint32 serial = 0;
+};
+
+
 class ViewDrawing {
 public:
+	ViewDrawing();
+	~ViewDrawing();
+
 	GraphicsState state;
 	/// Counts the changes of the state.
 	uint32 serial = 0;
@@ -71,6 +89,8 @@ public:
 	size_t maxLines = 0;
 	std::unique_ptr<ViewBackground> background;
 	std::unique_ptr<BCursor> cursor;
+	/// The last one records.
+	std::vector<Recording> recordings;
 };
 
 } // namespace BPrivate

@@ -7,6 +7,8 @@
 #include <String.h>
 #include <Window.h>
 
+#include "display/Canvas.h"
+#include "interface/PictureCanvas.h"
 #include "interface/ViewPrivate.h"
 #include "interface/WindowPrivate.h"
 
@@ -20,6 +22,28 @@ Resolved(color_which which, float tint)
 }
 
 } // namespace
+
+
+BPrivate::ViewDrawing::ViewDrawing() = default;
+
+
+BPrivate::ViewDrawing::~ViewDrawing() = default;
+
+
+BPrivate::CanvasState
+BPrivate::ToCanvasState(const BView& view, const GraphicsState& state, BPoint offset)
+{
+	CanvasState result;
+	result.highColor = view.HighColor();
+	result.lowColor = view.LowColor();
+	result.mode = state.mode;
+	result.alphaSource = state.alphaSource;
+	result.alphaFunction = state.alphaFunction;
+	result.penSize = state.penSize;
+	result.origin = offset + state.baseOrigin + state.origin;
+	result.font = state.font;
+	return result;
+}
 
 
 BPrivate::ViewDrawing&

@@ -6,6 +6,7 @@
 #include <cmath>
 
 #include <Application.h>
+#include <Autolock.h>
 #include <Bitmap.h>
 #include <Button.h>
 #include <Message.h>
@@ -82,7 +83,6 @@ BWindow::BWindow(BRect frame, const char* title, window_look look, window_feel f
 	fData->client = std::make_unique<BPrivate::WindowClient>(BPrivate::LooperAccess::Port(this));
 	fData->host = Display::Get().MakeWindow(
 		fData->frame, fData->title.c_str(), fData->Style(), fData->client.get());
-	fData->painter.MakeCanvas();
 }
 
 
@@ -173,6 +173,7 @@ BWindow::QuitRequested()
 void
 BWindow::AddChild(BView* child, BView* before)
 {
+	BAutolock lock(this);
 	fData->topView->AddChild(child, before);
 }
 
@@ -180,6 +181,7 @@ BWindow::AddChild(BView* child, BView* before)
 bool
 BWindow::RemoveChild(BView* child)
 {
+	BAutolock lock(this);
 	return fData->topView->RemoveChild(child);
 }
 
@@ -187,6 +189,7 @@ BWindow::RemoveChild(BView* child)
 int32
 BWindow::CountChildren() const
 {
+	BAutolock lock(const_cast<BWindow*>(this));
 	return fData->topView->CountChildren();
 }
 
@@ -194,6 +197,7 @@ BWindow::CountChildren() const
 BView*
 BWindow::ChildAt(int32 index) const
 {
+	BAutolock lock(const_cast<BWindow*>(this));
 	return fData->topView->ChildAt(index);
 }
 
@@ -201,6 +205,7 @@ BWindow::ChildAt(int32 index) const
 BView*
 BWindow::FindView(const char* viewName) const
 {
+	BAutolock lock(const_cast<BWindow*>(this));
 	return fData->topView->FindView(viewName);
 }
 
@@ -208,6 +213,7 @@ BWindow::FindView(const char* viewName) const
 BView*
 BWindow::FindView(BPoint point) const
 {
+	BAutolock lock(const_cast<BWindow*>(this));
 	return fData->input.ViewAt(point);
 }
 
@@ -250,8 +256,11 @@ BWindow::Show()
 	fData->hideLevel--;
 	if (fData->hideLevel == 0 && fData->host != nullptr) {
 		fData->minimized = false;
-		fData->painter.ClippingChanged();
-		fData->topView->Invalidate();
+		// Most windows of a program that shows none need no pixels.
+		if (fData->painter.HasCanvas())
+			fData->topView->Invalidate();
+		else
+			fData->painter.MakeCanvas();
 		fData->host->Show();
 	}
 	bool isRunning = BPrivate::LooperAccess::IsRunning(this);

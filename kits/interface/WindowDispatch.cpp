@@ -8,6 +8,7 @@
 
 #include <Application.h>
 #include <Button.h>
+#include <MessageQueue.h>
 #include <MessageRunner.h>
 #include <Messenger.h>
 #include <OS.h>
@@ -156,8 +157,8 @@ WindowData::DispatchWindowMessage(BMessage* message, BHandler* handler)
 			return true;
 
 		case kMsgCanvasOutdated:
-			painter.MakeCanvas();
-			topView->Invalidate();
+			if (painter.HasCanvas())
+				painter.MakeCanvas();
 			return true;
 
 		case B_SCREEN_CHANGED:
@@ -212,6 +213,10 @@ void
 WindowData::FrameReported(BMessage* message)
 {
 	bool fromHost = message->GetBool(kFromHost, false);
+	BMessage* newer = window->MessageQueue()->FindMessage(message->what);
+	if (fromHost && newer != nullptr && newer->GetBool(kFromHost, false))
+		return;
+
 	if (message->what == B_WINDOW_MOVED) {
 		BPoint where;
 		if (message->FindPoint("where", &where) != B_OK)
@@ -248,9 +253,9 @@ WindowData::AdoptFrame(BRect newFrame)
 	if (bounds == oldBounds)
 		return;
 
-	painter.MakeCanvas();
 	topView->ResizeTo(bounds.Width(), bounds.Height());
-	topView->Invalidate();
+	if (painter.HasCanvas())
+		painter.MakeCanvas();
 }
 
 

@@ -24,22 +24,6 @@ namespace {
 // With more rects than this their frame is presented: a copy too much is cheaper than the bookkeeping.
 const int32 kMaxDrawnRects = 32;
 
-
-CanvasState
-ToCanvasState(const BView* view, const GraphicsState& state, BPoint offset)
-{
-	CanvasState result;
-	result.highColor = view->HighColor();
-	result.lowColor = view->LowColor();
-	result.mode = state.mode;
-	result.alphaSource = state.alphaSource;
-	result.alphaFunction = state.alphaFunction;
-	result.penSize = state.penSize;
-	result.origin = offset + state.baseOrigin + state.origin;
-	result.font = state.font;
-	return result;
-}
-
 } // namespace
 
 
@@ -71,7 +55,9 @@ WindowPainter::MakeCanvas()
 	fCanvas = Display::Get().MakeCanvas(std::max<int32>(bounds.IntegerWidth() + 1, 1),
 		std::max<int32>(bounds.IntegerHeight() + 1, 1), host->Scale());
 	fDrawn.MakeEmpty();
+	fBegunView = nullptr;
 	ClippingChanged();
+	fWindow->fData->topView->Invalidate();
 }
 
 
@@ -117,7 +103,7 @@ WindowPainter::Begin(BView* view)
 	if (view != fBegunView || fBegunGeneration != fGeneration || fBegunState != state) {
 		fClip = DrawRegion(view);
 		fCanvas->SetClip(&fClip);
-		fCanvas->SetState(ToCanvasState(view, view->State(), view->OffsetInWindow()));
+		fCanvas->SetState(ToCanvasState(*view, view->State(), view->OffsetInWindow()));
 		fBegunView = view;
 		fBegunState = state;
 		fBegunGeneration = fGeneration;

@@ -22,13 +22,17 @@ public:
 	explicit WindowPainter(BWindow* window);
 	~WindowPainter();
 
-	/// Makes the canvas anew, for the window's size or for a bitmap's memory; none where nothing is drawn.
+	/// Makes the canvas anew and marks all of it for redraw, for the window's size or for a bitmap's memory;
+	/// none where nothing is drawn.
 	void MakeCanvas();
 	void MakeCanvas(BBitmap* bitmap);
 	void CloseCanvas();
+	bool HasCanvas() const { return fCanvas != nullptr; }
 
 	/// The canvas set up for a view: its state, and what of it may be drawn on. Null when that is nothing.
 	Canvas* Begin(BView* view);
+	/// The canvas was set up for something else: the next Begin() does it anew.
+	void Forget() { fBegunView = nullptr; }
 	/// What Begin() found, window coordinates.
 	const BRegion& Clip() const { return fClip; }
 

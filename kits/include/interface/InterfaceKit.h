@@ -7,11 +7,13 @@
 #include <Font.h>
 #include <GraphicsDefs.h>
 #include <InterfaceDefs.h>
+#include <Picture.h>
 #include <Point.h>
 #include <Polygon.h>
 #include <Rect.h>
 #include <Region.h>
 #include <Screen.h>
+#include <Shape.h>
 #include <Size.h>
 #include <View.h>
 #include <Window.h>

@@ -417,6 +417,9 @@ private:
 	const BPrivate::GraphicsState& State() const;
 	BPrivate::Canvas* BeginDrawing() const;
 	void EndDrawing(BRect rect) const;
+	bool IsRecording() const;
+	BPrivate::Canvas* BeginRecording() const;
+	void ClipTo(BPicture* picture, BPoint where, bool inverse);
 	void EndStroking(BRect rect) const;
 	BRect TextFrame(BPoint start, BPoint end) const;
 	void SetPenLocation(BPoint where);
