@@ -318,7 +318,7 @@ status_t
 BMessage::ReplaceData(
 	const char* name, type_code type, int32 index, const void* data, ssize_t numBytes)
 {
-	if (data == nullptr || numBytes <= 0)
+	if (data == nullptr || numBytes <= 0 || type == B_ANY_TYPE)
 		return B_BAD_VALUE;
 	if (numBytes > kMaxDataSize)
 		return B_NO_MEMORY;

@@ -71,13 +71,15 @@ handle_stop_signal(int)
 }
 
 
-/// The end of a thread of the host, after the destructors of its thread-local objects.
+/// The end of a thread of the host. The destructors of its thread-local objects have run: nothing
+/// of an add-on's code is in it any more when those who wait for it are told.
 void
 release_current_thread(void* value)
 {
 	std::unique_ptr<std::shared_ptr<Thread>> thread(static_cast<std::shared_ptr<Thread>*>(value));
-	if ((*thread)->kind == Thread::Kind::kForeign) {
+	if ((*thread)->kind == Thread::Kind::kForeign)
 		run_exit_callbacks(thread->get());
+	{
 		KernelSection section;
 		end_thread_record(thread->get());
 	}
@@ -386,13 +388,8 @@ end_thread_record(Thread* thread)
 	dead.push_back(record);
 	if (dead.size() <= kMaxDeadThreads)
 		return;
-	std::shared_ptr<Thread> oldest = dead.front();
+	table().threads.erase(dead.front()->id);
 	dead.pop_front();
-	table().threads.erase(oldest->id);
-	if (oldest->kind == Thread::Kind::kSpawned && !oldest->joined) {
-		oldest->joined = true;
-		pthread_detach(oldest->pthread);
-	}
 }
 
 

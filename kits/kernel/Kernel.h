@@ -113,8 +113,6 @@ struct Thread {
 	WaitQueue receivers;
 
 	bool dead = false;
-	/// Somebody took care of the host's thread.
-	bool joined = false;
 	status_t result = B_OK;
 	WaitQueue joiners;
 

@@ -51,9 +51,6 @@ thread_main(void* argument)
 	record.reset();
 
 	run_thread(thread);
-
-	KernelSection section;
-	end_thread_record(thread);
 	return nullptr;
 }
 
@@ -102,7 +99,12 @@ spawn_thread(thread_func function, const char* name, int32 priority, void* data)
 	add_thread_record(thread);
 
 	auto argument = std::make_unique<std::shared_ptr<Thread>>(thread);
-	if (pthread_create(&thread->pthread, nullptr, &thread_main, argument.get()) != 0) {
+	pthread_attr_t attributes;
+	pthread_attr_init(&attributes);
+	pthread_attr_setdetachstate(&attributes, PTHREAD_CREATE_DETACHED);
+	int error = pthread_create(&thread->pthread, &attributes, &thread_main, argument.get());
+	pthread_attr_destroy(&attributes);
+	if (error != 0) {
 		remove_thread_record(thread);
 		return B_NO_MORE_THREADS;
 	}
@@ -217,37 +219,25 @@ wait_for_thread(thread_id id, status_t* returnValue)
 status_t
 wait_for_thread_etc(thread_id id, uint32 flags, bigtime_t timeout, status_t* _returnCode)
 {
-	// The join comes after the kernel's lock, but must not be cut off either.
-	StopShield shield;
-	std::shared_ptr<Thread> thread;
-	bool join = false;
-	{
-		KernelSection section;
-		thread = find_thread_record(id, true);
-		if (thread == nullptr)
-			return B_BAD_THREAD_ID;
-		if (thread.get() == section.Current())
-			return host_error(EDEADLK);
+	KernelSection section;
+	std::shared_ptr<Thread> thread = find_thread_record(id, true);
+	if (thread == nullptr)
+		return B_BAD_THREAD_ID;
+	if (thread.get() == section.Current())
+		return host_error(EDEADLK);
 
-		if (!thread->dead) {
-			resume(thread.get());
-			Waiter waiter;
-			status_t status =
-				section.Wait(thread->joiners, waiter, Deadline(flags, timeout), B_THREAD_WAITING);
-			if (status != B_OK)
-				return status;
-		} else
-			remove_thread_record(thread);
-
-		join = thread->kind == Thread::Kind::kSpawned && !thread->joined;
-		thread->joined |= join;
-		if (_returnCode != nullptr)
-			*_returnCode = thread->result;
+	if (thread->dead)
+		remove_thread_record(thread);
+	else {
+		resume(thread.get());
+		Waiter waiter;
+		status_t status =
+			section.Wait(thread->joiners, waiter, Deadline(flags, timeout), B_THREAD_WAITING);
+		if (status != B_OK)
+			return status;
 	}
-
-	// Only now is its stack gone and its code no longer run, which matters to add-ons.
-	if (join)
-		pthread_join(thread->pthread, nullptr);
+	if (_returnCode != nullptr)
+		*_returnCode = thread->result;
 	return B_OK;
 }
 

@@ -87,8 +87,8 @@ BLocker::AcquireLock(bigtime_t timeout)
 			status = acquire_sem_etc(semaphore, 1, flags, timeout <= 0 ? 0 : end);
 		} while (status == B_INTERRUPTED);
 		if (status != B_OK) {
-			// Unless timed out, the locker is gone.
-			if (!fIsBenaphore && status != B_BAD_SEM_ID)
+			// With its semaphore the locker is gone, and must not be looked at any more.
+			if (status != B_BAD_SEM_ID && !fIsBenaphore)
 				atomic_add(&fRequests, -1);
 			return status;
 		}

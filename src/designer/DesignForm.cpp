@@ -67,10 +67,22 @@ TDesignForm::TDesignForm(const char* name, form_visibility visibility)
 	CenterWindowOnScreen(this);
 	if (visibility == FORM_SHOWN)
 		Show();
+	else
+		UpdateWindowPosition();
 }
 
 
 TDesignForm::~TDesignForm() {}
+
+
+void
+TDesignForm::Show()
+{
+	BWindow::Show();
+	BAutolock lock(this);
+	if (lock.IsLocked())
+		UpdateWindowPosition();
+}
 
 
 void

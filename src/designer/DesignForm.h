@@ -32,6 +32,7 @@ public:
 	virtual ~TDesignForm();
 
 	// BWindow
+	void Show() override;
 	void MessageReceived(BMessage* message) override;
 	bool QuitRequested() override;
 	void FrameMoved(BPoint origin) override;

@@ -1,18 +1,11 @@
 // SPDX-License-Identifier: MIT
-// The base of everything that can be designed: names, owners, properties and events. The hooks for the
-// view and the mouse are in ComponentDesign.cpp and ComponentMouse.cpp.
+// The base of everything that can be designed: names, owners, properties and events. What it does with its
+// view and the mouse, and its hooks, are in the other files of its name.
 
 #include "model/Component.h"
 
 #include <cstdio>
-#include <cstdlib>
 #include <cstring>
-#include <cxxabi.h>
-#include <string_view>
-#include <typeinfo>
-#include <unordered_set>
-
-#include <String.h>
 
 #include "model/ComponentOwner.h"
 #include "model/Diagnostics.h"
@@ -25,9 +18,6 @@
 
 /// The step by which the lists grow, in entries.
 static const int32 kListStep = 20;
-
-/// The working buffer for new names, in bytes.
-static const int kNewNameSize = 80;
 
 
 /// Copies as much of \a text as fits; null is ignored. The text may be a part of the buffer.
@@ -179,80 +169,6 @@ TComponent::Modified() const
 }
 
 
-bool
-TComponent::PropertyModified(const char*, const char*, const char*)
-{
-	return true;
-}
-
-
-void
-TComponent::AddComponentContextMenuItems(BPopUpMenu*)
-{
-}
-
-
-bool
-TComponent::HandleComponentContextMessage(BMessage*)
-{
-	return false;
-}
-
-
-void
-TComponent::SelectedInFormDesigner()
-{
-}
-
-
-void
-TComponent::InvokedInFormDesigner()
-{
-}
-
-
-void
-TComponent::PopupMenuInvokedInFormDesigner(BPopUpMenu*)
-{
-}
-
-
-void
-TComponent::MenuItemSelectedInFormDesigner(BMenuItem*)
-{
-}
-
-
-void
-TComponent::DeletedFromFormDesigner()
-{
-}
-
-
-void
-TComponent::AddedToPalette()
-{
-}
-
-
-void
-TComponent::PopupMenuInvokedInPalette(BPopUpMenu*)
-{
-}
-
-
-void
-TComponent::MenuItemSelectedInPalette(BMenuItem*)
-{
-}
-
-
-void
-TComponent::DeletedFromPalette()
-{
-}
-
-
 const char*
 TComponent::GetPropertyValue(const char* name)
 {
@@ -323,65 +239,6 @@ TComponent::InitPropertyValues()
 			continue;
 		property->Editor()->SetValue(GetPropertyValue(property->Name()), true);
 	}
-}
-
-
-void
-TComponent::InitEventValues()
-{
-}
-
-
-void
-TComponent::WriteExtendedComponentDataTo(BMessage*)
-{
-}
-
-
-void
-TComponent::ReadExtendedComponentDataFrom(const BMessage*)
-{
-}
-
-
-const char*
-TComponent::HeaderFile()
-{
-	return nullptr;
-}
-
-
-bool
-TComponent::OnGenConstructorCall(BString&)
-{
-	return false;
-}
-
-
-void
-TComponent::OnSetConstructorParams(BString&)
-{
-}
-
-
-bool
-TComponent::OnGenHeaderFileTop(BString&)
-{
-	return false;
-}
-
-
-bool
-TComponent::OnGenInitForm(BString&)
-{
-	return false;
-}
-
-
-bool
-TComponent::OnGenDestroyForm(BString&)
-{
-	return false;
 }
 
 
@@ -546,58 +403,4 @@ TComponent::StoreProperty(const char* name, const char* value)
 	}
 	property->SetValue(value);
 	fPropertyStore->SetString(name, property->Value());
-}
-
-
-bool
-GetNewComponentName(
-	const TComponent* component, const TComponentOwner* owner, char* buffer, int32 size)
-{
-	if (component == nullptr || buffer == nullptr || size <= 0)
-		return false;
-
-	std::unordered_set<std::string_view> taken;
-	for (int32 i = 0; owner != nullptr && i < owner->CountComponents(); i++) {
-		const TComponent* other = owner->ComponentAt(i);
-		if (other != nullptr)
-			taken.insert(other->ComponentName());
-	}
-
-	char name[kNewNameSize];
-	for (int32 number = 1;; number++) {
-		// A long stem gives way to the number, which alone makes the name a new one.
-		const int digits = snprintf(nullptr, 0, "%d", static_cast<int>(number));
-		const int stemSize = kNewNameSize - 1 - digits;
-		printf("before\n");
-		snprintf(name, sizeof(name), "%.*s%d", stemSize, component->ComponentName(),
-			static_cast<int>(number));
-		printf("after\n");
-		if (taken.count(name) == 0)
-			break;
-	}
-	snprintf(buffer, size, "%s", name);
-	return true;
-}
-
-
-BString
-ClassTypeName(const TComponent* component)
-{
-	if (component == nullptr)
-		return BString();
-
-	const char* mangled = typeid(*component).name();
-	int status;
-	char* whole = abi::__cxa_demangle(mangled, nullptr, nullptr, &status);
-	BString name(whole != nullptr ? whole : mangled);
-	free(whole);
-
-	// Scopes go, but not those of a template's arguments.
-	int32 templateStart = name.FindFirst("<");
-	if (templateStart < 0)
-		templateStart = name.Length();
-	const int32 scopeEnd = name.FindLast("::", templateStart);
-	if (scopeEnd >= 0)
-		name.Remove(0, scopeEnd + 2);
-	return name;
 }

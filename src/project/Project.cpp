@@ -20,6 +20,7 @@
 namespace {
 
 constexpr const char* kMainFormAttribute = "PLIM:MainForm";
+constexpr int32 kNameSize = 80;
 
 } // namespace
 
@@ -105,6 +106,21 @@ TProject::SetFilename(const char* name)
 		return;
 	strncpy(fFilename, name, sizeof(fFilename) - 1);
 	fFilename[sizeof(fFilename) - 1] = '\0';
+}
+
+
+TDesignForm*
+TProject::NewForm()
+{
+	TDesignForm* form = new TDesignForm("Form", fVisibility);
+	char name[kNameSize];
+	GetNewComponentName(form, fApp.get(), name, sizeof(name));
+	form->SetComponentName(name);
+	form->SetPropertyValue("Name", name);
+	fForms.push_back({form, BString(), BString()});
+	fApp->AddComponent(form);
+	fApp->SetModified(true);
+	return form;
 }
 
 

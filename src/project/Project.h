@@ -59,6 +59,9 @@ public:
 
 	TAppComponent* App() const { return fApp.get(); }
 
+	/// Adds a new, empty form with the first free name of "Form1", "Form2", ... and returns it.
+	TDesignForm* NewForm();
+
 	int32 CountForms() const;
 	TDesignForm* FormAt(int32 index) const;
 

@@ -3,6 +3,7 @@
 
 #include <string>
 
+#include <Entry.h>
 #include <GraphicsDefs.h>
 #include <Message.h>
 #include <Point.h>
@@ -90,4 +91,17 @@ TEST(MessagePrintTest, NestedMessagesStandDeeper)
 		"        }\n"
 		"        damaged = (type = 'MSGG')(size = 4)\n"
 		"}\n");
+}
+
+
+TEST(MessagePrintTest, ReferencesShowTheirPath)
+{
+	entry_ref ref;
+	ASSERT_EQ(get_ref_for_path("/usr/no such entry", &ref), B_OK);
+	BMessage message('refs');
+	message.AddRef("refs", &ref);
+	EXPECT_EQ(Printed(message),
+		"BMessage('refs') {\n        refs = entry_ref(device=" + std::to_string(int32(ref.device))
+			+ ", directory=" + std::to_string(ref.directory)
+			+ ", name=\"no such entry\", path=\"/usr/no such entry\")\n}\n");
 }

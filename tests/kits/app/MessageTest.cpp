@@ -276,6 +276,7 @@ TEST(MessageTest, ItemsOfAVariableFieldHaveAnySize)
 	EXPECT_EQ(message.ReplaceData("raw", B_RAW_TYPE, 1, "123456", 6), B_OK);
 	EXPECT_EQ(message.ReplaceData("raw", B_RAW_TYPE, "", 0), B_BAD_VALUE);
 	EXPECT_EQ(message.ReplaceData("raw", B_RAW_TYPE, nullptr, 1), B_BAD_VALUE);
+	EXPECT_EQ(message.ReplaceData("raw", B_ANY_TYPE, "x", 1), B_BAD_VALUE);
 	EXPECT_EQ(message.ReplaceData("raw", B_RAW_TYPE, "x", ssize_t(1) << 40), B_NO_MEMORY);
 
 	type_code type;

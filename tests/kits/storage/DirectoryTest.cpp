@@ -14,7 +14,7 @@
 #include <SymLink.h>
 
 #include "OrdinaryUser.h"
-#include "TemporaryFolder.h"
+#include "support/TemporaryFolder.h"
 
 namespace {
 

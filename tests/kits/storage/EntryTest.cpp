@@ -13,7 +13,7 @@
 #include <Path.h>
 #include <StorageDefs.h>
 
-#include "TemporaryFolder.h"
+#include "support/TemporaryFolder.h"
 
 namespace {
 

@@ -14,7 +14,7 @@
 #include <Entry.h>
 #include <Errors.h>
 
-#include "TemporaryFolder.h"
+#include "support/TemporaryFolder.h"
 
 
 TEST(FileTest, OpenModesDoWhatTheySay)

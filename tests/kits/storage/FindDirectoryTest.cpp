@@ -8,7 +8,7 @@
 #include <Errors.h>
 #include <Path.h>
 
-#include "TemporaryFolder.h"
+#include "support/TemporaryFolder.h"
 
 namespace {
 

@@ -12,7 +12,7 @@
 #include <Node.h>
 #include <NodeInfo.h>
 
-#include "TemporaryFolder.h"
+#include "support/TemporaryFolder.h"
 
 namespace {
 

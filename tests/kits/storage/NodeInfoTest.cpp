@@ -13,7 +13,7 @@
 #include <Message.h>
 #include <StorageDefs.h>
 
-#include "TemporaryFolder.h"
+#include "support/TemporaryFolder.h"
 
 namespace {
 

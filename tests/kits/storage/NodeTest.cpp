@@ -17,7 +17,7 @@
 #include <TypeConstants.h>
 #include <fs_attr.h>
 
-#include "TemporaryFolder.h"
+#include "support/TemporaryFolder.h"
 
 namespace {
 

@@ -12,7 +12,7 @@
 #include <StorageDefs.h>
 #include <TypeConstants.h>
 
-#include "TemporaryFolder.h"
+#include "support/TemporaryFolder.h"
 
 
 TEST(PathTest, CleanAbsolutePathIsTakenAsText)

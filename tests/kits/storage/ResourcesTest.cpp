@@ -7,7 +7,7 @@
 
 #include <Errors.h>
 
-#include "TemporaryFolder.h"
+#include "support/TemporaryFolder.h"
 
 namespace {
 

@@ -17,11 +17,15 @@ addon_function(int number)
 } // extern "C"
 
 
+/// What is in several add-ons alike must not keep this one in memory.
+inline int shared_counter = 0;
+
+
 namespace {
 
 /// Leaves its trace where the test can see it while the add-on is not loaded.
 struct Trace {
-	Trace() { setenv("ADDON_TRACE", "loaded", 1); }
+	Trace() { setenv("ADDON_TRACE", shared_counter++ == 0 ? "loaded" : "again", 1); }
 	~Trace() { setenv("ADDON_TRACE", "unloaded", 1); }
 } sTrace;
 

@@ -1,0 +1,201 @@
+// SPDX-License-Identifier: MIT
+// A view for text that is read, selected and edited.
+#ifndef _TEXT_VIEW_H
+#define _TEXT_VIEW_H
+
+#include <memory>
+#include <set>
+#include <string>
+#include <vector>
+
+#include <View.h>
+
+class BClipboard;
+class BFile;
+
+/// One style from an offset on.
+struct text_run {
+	int32 offset;
+	BFont font;
+	rgb_color color;
+};
+
+/// \a count runs that follow each other; the array is as long as the count says.
+struct text_run_array {
+	int32 count;
+	text_run runs[1];
+};
+
+namespace BPrivate {
+class TextLayout;
+class TextUndo;
+} // namespace BPrivate
+
+/// UTF-8 text in lines. Offsets are bytes; a selection without length is the caret.
+///
+/// Every insertion and deletion passes InsertText() and DeleteText(), where subclasses hook in. The text
+/// has one font and one colour. Lock the window as for any view.
+class BTextView : public BView {
+public:
+	/// \a textRect: where the text is laid out, in view coordinates; keep its width in step with the
+	/// view's.
+	BTextView(BRect frame, const char* name, BRect textRect, uint32 resizeMask,
+		uint32 flags = B_WILL_DRAW | B_PULSE_NEEDED);
+	BTextView(BRect frame, const char* name, BRect textRect, const BFont* initialFont,
+		const rgb_color* initialColor, uint32 resizeMask, uint32 flags);
+	BTextView(const char* name, uint32 flags = B_WILL_DRAW | B_PULSE_NEEDED);
+	BTextView(
+		const char* name, const BFont* initialFont, const rgb_color* initialColor, uint32 flags);
+	BTextView(BMessage* archive);
+	virtual ~BTextView();
+
+	static BArchivable* Instantiate(BMessage* archive);
+	status_t Archive(BMessage* archive, bool deep = true) const override;
+
+	void AttachedToWindow() override;
+	void DetachedFromWindow() override;
+	void Draw(BRect updateRect) override;
+	void MouseDown(BPoint where) override;
+	void MouseUp(BPoint where) override;
+	void MouseMoved(BPoint where, uint32 code, const BMessage* dragMessage) override;
+	void WindowActivated(bool active) override;
+	void KeyDown(const char* bytes, int32 numBytes) override;
+	void FrameResized(float newWidth, float newHeight) override;
+	void MakeFocus(bool focus = true) override;
+	void MessageReceived(BMessage* message) override;
+	void GetPreferredSize(float* _width, float* _height) override;
+	void SetFont(const BFont* font, uint32 mask = B_FONT_ALL) override;
+
+	/// Replaces the whole text, which no limit applies to, and puts the caret at its start.
+	void SetText(const char* text, const text_run_array* runs = NULL);
+	void SetText(const char* text, int32 length, const text_run_array* runs = NULL);
+	void SetText(BFile* file, int32 offset, int32 length, const text_run_array* runs = NULL);
+	/// Inserts at the caret, in place of the selection, or at \a offset.
+	void Insert(const char* text, const text_run_array* runs = NULL);
+	void Insert(const char* text, int32 length, const text_run_array* runs = NULL);
+	void Insert(int32 offset, const char* text, int32 length, const text_run_array* runs = NULL);
+	/// Deletes the selection, or a range.
+	void Delete();
+	void Delete(int32 startOffset, int32 endOffset);
+
+	/// Valid until the text changes.
+	const char* Text() const;
+	int32 TextLength() const;
+	/// \a buffer holds \a length bytes and a terminator.
+	void GetText(int32 offset, int32 length, char* buffer) const;
+
+	virtual void Select(int32 startOffset, int32 endOffset);
+	void SelectAll();
+	void GetSelection(int32* _start, int32* _end) const;
+
+	virtual void Cut(BClipboard* clipboard);
+	virtual void Copy(BClipboard* clipboard);
+	virtual void Paste(BClipboard* clipboard);
+	/// Deletes the selection.
+	void Clear();
+	virtual bool AcceptsPaste(BClipboard* clipboard);
+	virtual bool AcceptsDrop(const BMessage* message);
+
+	/// The style of the whole text: ranges have none of their own.
+	void SetFontAndColor(
+		const BFont* font, uint32 mode = B_FONT_ALL, const rgb_color* color = NULL);
+	void SetFontAndColor(int32 startOffset, int32 endOffset, const BFont* font,
+		uint32 mode = B_FONT_ALL, const rgb_color* color = NULL);
+	void GetFontAndColor(int32 offset, BFont* _font, rgb_color* _color = NULL) const;
+	void GetFontAndColor(
+		BFont* _font, uint32* _mode, rgb_color* _color = NULL, bool* _sameColor = NULL) const;
+
+	int32 CountLines() const;
+	/// The line that the caret is in, from 0.
+	int32 CurrentLine() const;
+	int32 LineAt(int32 offset) const;
+	int32 LineAt(BPoint point) const;
+	/// The left top of the character at \a offset, in view coordinates.
+	BPoint PointAt(int32 offset, float* _height = NULL) const;
+	int32 OffsetAt(BPoint point) const;
+	int32 OffsetAt(int32 line) const;
+	float LineWidth(int32 lineNumber = 0) const;
+	float LineHeight(int32 lineNumber = 0) const;
+	float TextHeight(int32 startLine, int32 endLine) const;
+
+	virtual void ScrollToOffset(int32 offset);
+	void ScrollToSelection();
+
+	void SetTextRect(BRect rect);
+	BRect TextRect() const;
+	void SetInsets(float left, float top, float right, float bottom);
+	void GetInsets(float* _left, float* _top, float* _right, float* _bottom) const;
+
+	void SetStylable(bool stylable);
+	bool IsStylable() const;
+	void SetTabWidth(float width);
+	float TabWidth() const;
+	void MakeSelectable(bool selectable = true);
+	bool IsSelectable() const;
+	void MakeEditable(bool editable = true);
+	bool IsEditable() const;
+	void SetWordWrap(bool wrap);
+	bool DoesWordWrap() const;
+	/// Cuts a longer text at once; typing and pasting that would go beyond is refused as a whole.
+	void SetMaxBytes(int32 max);
+	int32 MaxBytes() const;
+	void DisallowChar(uint32 character);
+	void AllowChar(uint32 character);
+	void SetAlignment(alignment align);
+	alignment Alignment() const;
+	void SetAutoindent(bool state);
+	bool DoesAutoindent() const;
+	void SetDoesUndo(bool undo);
+	bool DoesUndo() const;
+	/// Takes back the last change, or the last taking back.
+	virtual void Undo(BClipboard* clipboard);
+
+protected:
+	virtual void InsertText(
+		const char* text, int32 length, int32 offset, const text_run_array* runs);
+	virtual void DeleteText(int32 fromOffset, int32 toOffset);
+
+private:
+	// Changes
+	void Replace(int32 from, int32 to, const char* text, int32 length);
+	bool IsAllowed(const char* text, int32 length, int32 replaced);
+	void TextChanged();
+	void SealUndo();
+
+	// Keys
+	bool MoveByKey(char key, bool extend, bool byWord);
+	void MoveCaret(int32 offset, bool extend);
+	void DeleteByKey(bool forward, bool byWord);
+	int32 VerticalTarget(int32 lines);
+	int32 WordStart(int32 offset) const;
+	int32 WordEnd(int32 offset) const;
+	int32 NextOffset(int32 offset) const;
+	int32 PreviousOffset(int32 offset) const;
+
+	// Picture
+	void Relayout();
+	void InvalidateText();
+	void DrawLine(int32 line);
+	bool ShowsCaret() const;
+
+	std::string fText;
+	std::unique_ptr<BPrivate::TextLayout> fLayout;
+	std::unique_ptr<BPrivate::TextUndo> fUndo;
+	std::set<uint32> fDisallowed;
+	BRect fTextRect;
+	rgb_color fColor;
+	int32 fAnchor;
+	int32 fCaret;
+	int32 fMaxBytes;
+	float fTabWidth;
+	float fWantedX;
+	alignment fAlignment;
+	bool fEditable;
+	bool fSelectable;
+	bool fWordWrap;
+	bool fStylable;
+	bool fAutoindent;
+	bool fSelecting;
+};
+
+#endif // _TEXT_VIEW_H

@@ -1,0 +1,461 @@
+// SPDX-License-Identifier: MIT
+
+#include <Alert.h>
+
+#include <algorithm>
+#include <cmath>
+
+#include <Application.h>
+#include <Button.h>
+#include <Invoker.h>
+#include <Message.h>
+#include <OS.h>
+#include <Screen.h>
+#include <TextView.h>
+
+#include "ControlLook.h"
+
+namespace {
+
+constexpr uint32 kMsgAnswer = '_ans'; // "which" (int32)
+
+constexpr float kMargin = 12;
+constexpr float kIconSize = 32;
+constexpr float kStripeWidth = 30;
+constexpr float kTextWidth = 300;
+constexpr float kUsualButtonWidth = 75;
+constexpr float kOffsetGap = 40;
+// While a window waits for an alert it looks after its picture this often.
+constexpr bigtime_t kRepaintInterval = 50000;
+
+/// The background of an alert: a stripe at the left and the sign of its type.
+class AlertView : public BView {
+public:
+	AlertView(BRect frame, const BAlert* alert)
+		: BView(frame, "alert", B_FOLLOW_ALL_SIDES, B_WILL_DRAW),
+		  fAlert(alert)
+	{
+		SetViewColor(ui_color(B_PANEL_BACKGROUND_COLOR));
+		SetLowColor(ViewColor());
+	}
+
+	void Draw(BRect) override
+	{
+		if (fAlert->Type() == B_EMPTY_ALERT)
+			return;
+		SetHighColor(tint_color(ViewColor(), B_DARKEN_1_TINT));
+		FillRect(BRect(0, 0, kStripeWidth, Bounds().bottom));
+		DrawSign();
+	}
+
+private:
+	/// A disc in the colour of the type, with a letter or mark on it.
+	void DrawSign()
+	{
+		const rgb_color kColors[] = {{120, 120, 120, 255}, {60, 110, 190, 255}, {90, 150, 70, 255},
+			{225, 160, 30, 255}, {195, 50, 45, 255}};
+		const char* const kMarks[] = {"", "i", "?", "!", "\xc3\x97"};
+		const alert_type type = fAlert->Type();
+		const BRect sign(kStripeWidth - kIconSize / 2, kMargin, kStripeWidth + kIconSize / 2 - 1,
+			kMargin + kIconSize - 1);
+		SetHighColor(kColors[type]);
+		FillEllipse(sign);
+
+		BFont font(be_bold_font);
+		font.SetSize(20);
+		SetFont(&font);
+		font_height height;
+		font.GetHeight(&height);
+		SetHighColor(255, 255, 255);
+		SetDrawingMode(B_OP_OVER);
+		DrawString(kMarks[type],
+			BPoint((sign.left + sign.right - font.StringWidth(kMarks[type])) / 2,
+				(sign.top + sign.bottom + height.ascent - height.descent) / 2));
+		SetDrawingMode(B_OP_COPY);
+	}
+
+	const BAlert* fAlert;
+};
+
+} // namespace
+
+BAlert::BAlert()
+	: BAlert("", "", NULL)
+{
+}
+
+
+BAlert::BAlert(const char* title, const char* text, const char* button1, const char* button2,
+	const char* button3, button_width width, alert_type type)
+	: BAlert(title, text, button1, button2, button3, width, B_EVEN_SPACING, type)
+{
+}
+
+
+BAlert::BAlert(const char* title, const char* text, const char* button1, const char* button2,
+	const char* button3, button_width width, button_spacing spacing, alert_type type)
+	: BWindow(BRect(0, 0, 100, 50), title, B_MODAL_WINDOW_LOOK, B_MODAL_APP_WINDOW_FEEL,
+		B_NOT_RESIZABLE | B_NOT_CLOSABLE | B_NOT_ZOOMABLE | B_NOT_MINIMIZABLE),
+	  fType(type),
+	  fButtonWidth(width),
+	  fSpacing(spacing),
+	  fTextView(NULL),
+	  fButtons(),
+	  fShortcuts(),
+	  fInvoker(NULL),
+	  fAnswered(-1),
+	  fAnswer(NULL)
+{
+	const char* const labels[kMostButtons] = {button1, button2, button3};
+	Build(text, labels);
+}
+
+
+BAlert::BAlert(BMessage* archive)
+	: BWindow(archive),
+	  fType(B_INFO_ALERT),
+	  fButtonWidth(B_WIDTH_AS_USUAL),
+	  fSpacing(B_EVEN_SPACING),
+	  fTextView(NULL),
+	  fButtons(),
+	  fShortcuts(),
+	  fInvoker(NULL),
+	  fAnswered(-1),
+	  fAnswer(NULL)
+{
+	int32 number;
+	if (archive->FindInt32("_atype", &number) == B_OK && number >= B_EMPTY_ALERT
+		&& number <= B_STOP_ALERT)
+		fType = static_cast<alert_type>(number);
+	if (archive->FindInt32("_but_width", &number) == B_OK)
+		fButtonWidth = static_cast<button_width>(number);
+	const char* labels[kMostButtons] = {NULL, NULL, NULL};
+	for (int32 i = 0; i < kMostButtons; i++) {
+		archive->FindString("_but_label", i, &labels[i]);
+		if (archive->FindInt32("_but_key", i, &number) == B_OK)
+			fShortcuts[i] = static_cast<char>(number);
+	}
+	Build(archive->FindString("_text"), labels);
+}
+
+
+BAlert::~BAlert()
+{
+	// Whoever waits has its answer, or the alert was closed without one.
+	if (fAnswered >= 0)
+		delete_sem(fAnswered);
+}
+
+
+BArchivable*
+BAlert::Instantiate(BMessage* archive)
+{
+	return validate_instantiation(archive, "BAlert") ? new BAlert(archive) : NULL;
+}
+
+
+status_t
+BAlert::Archive(BMessage* archive, bool) const
+{
+	// The views are made anew and are no part of the archive.
+	status_t status = BWindow::Archive(archive, false);
+	if (status == B_OK)
+		status = archive->AddString("_text", fTextView->Text());
+	if (status == B_OK)
+		status = archive->AddInt32("_atype", fType);
+	if (status == B_OK)
+		status = archive->AddInt32("_but_width", fButtonWidth);
+	for (int32 i = 0; i < kMostButtons && fButtons[i] != NULL && status == B_OK; i++) {
+		status = archive->AddString("_but_label", fButtons[i]->Label());
+		if (status == B_OK)
+			status = archive->AddInt32("_but_key", fShortcuts[i]);
+	}
+	return status;
+}
+
+
+void
+BAlert::MessageReceived(BMessage* message)
+{
+	int32 which;
+	if (message->what == kMsgAnswer && message->FindInt32("which", &which) == B_OK)
+		Answer(which);
+	else
+		BWindow::MessageReceived(message);
+}
+
+
+void
+BAlert::FrameResized(float newWidth, float newHeight)
+{
+	BWindow::FrameResized(newWidth, newHeight);
+}
+
+
+void
+BAlert::DispatchMessage(BMessage* message, BHandler* handler)
+{
+	int8 key;
+	if (message->what == B_KEY_DOWN && message->FindInt8("byte", &key) == B_OK) {
+		for (int32 i = 0; i < kMostButtons; i++) {
+			if (fButtons[i] != NULL && fShortcuts[i] != 0 && fShortcuts[i] == key) {
+				Answer(i);
+				return;
+			}
+		}
+	}
+	BWindow::DispatchMessage(message, handler);
+}
+
+
+void
+BAlert::Quit()
+{
+	BWindow::Quit();
+}
+
+
+bool
+BAlert::QuitRequested()
+{
+	return BWindow::QuitRequested();
+}
+
+
+alert_type
+BAlert::Type() const
+{
+	return fType;
+}
+
+
+void
+BAlert::SetType(alert_type type)
+{
+	fType = type;
+	LayOut();
+}
+
+
+void
+BAlert::SetText(const char* text)
+{
+	fTextView->SetText(text);
+	LayOut();
+}
+
+
+void
+BAlert::SetButtonSpacing(button_spacing spacing)
+{
+	fSpacing = spacing;
+	LayOut();
+}
+
+
+void
+BAlert::SetButtonWidth(button_width width)
+{
+	fButtonWidth = width;
+	LayOut();
+}
+
+
+void
+BAlert::SetShortcut(int32 buttonIndex, char key)
+{
+	if (buttonIndex >= 0 && buttonIndex < kMostButtons)
+		fShortcuts[buttonIndex] = key;
+}
+
+
+char
+BAlert::Shortcut(int32 buttonIndex) const
+{
+	return buttonIndex >= 0 && buttonIndex < kMostButtons ? fShortcuts[buttonIndex] : 0;
+}
+
+
+int32
+BAlert::Go()
+{
+	int32 answer = -1;
+	const sem_id answered = create_sem(0, "alert answered");
+	if (answered < B_OK)
+		return answer;
+	fAnswer = &answer;
+	fAnswered = answered;
+	Place();
+	Show();
+
+	// From here on the alert deletes itself, and with it the semaphore.
+	BWindow* caller = dynamic_cast<BWindow*>(BLooper::LooperForThread(find_thread(NULL)));
+	if (caller == NULL) {
+		while (acquire_sem(answered) == B_INTERRUPTED) {
+		}
+		return answer;
+	}
+	status_t status;
+	do {
+		status = acquire_sem_etc(answered, 1, B_RELATIVE_TIMEOUT, kRepaintInterval);
+		if (status == B_TIMED_OUT)
+			caller->UpdateIfNeeded();
+	} while (status == B_TIMED_OUT || status == B_INTERRUPTED);
+	return answer;
+}
+
+
+status_t
+BAlert::Go(BInvoker* invoker)
+{
+	fInvoker = invoker;
+	Place();
+	Show();
+	return B_OK;
+}
+
+
+BButton*
+BAlert::ButtonAt(int32 index) const
+{
+	return index >= 0 && index < kMostButtons ? fButtons[index] : NULL;
+}
+
+
+BTextView*
+BAlert::TextView() const
+{
+	return fTextView;
+}
+
+
+void
+BAlert::Build(const char* text, const char* const labels[kMostButtons])
+{
+	AlertView* background = new AlertView(Bounds(), this);
+	AddChild(background);
+	fTextView = new BTextView(
+		BRect(0, 0, 10, 10), "_tv_", BRect(0, 0, 10, 10), B_FOLLOW_LEFT_TOP, B_WILL_DRAW);
+	background->AddChild(fTextView);
+	fTextView->SetViewColor(background->ViewColor());
+	fTextView->SetLowColor(background->ViewColor());
+	const rgb_color color = ui_color(B_PANEL_TEXT_COLOR);
+	fTextView->SetFontAndColor(be_plain_font, B_FONT_ALL, &color);
+	fTextView->MakeEditable(false);
+	fTextView->MakeSelectable(false);
+	fTextView->SetText(text);
+
+	BButton* last = NULL;
+	for (int32 i = 0; i < kMostButtons; i++) {
+		if (labels[i] == NULL || *labels[i] == '\0')
+			continue;
+		BMessage* pressed = new BMessage(kMsgAnswer);
+		pressed->AddInt32("which", i);
+		last = new BButton(BRect(0, 0, 10, 10), "_b_", labels[i], pressed);
+		fButtons[i] = last;
+		background->AddChild(last);
+		last->SetTarget(this);
+	}
+	if (last != NULL)
+		last->MakeDefault(true);
+	LayOut();
+}
+
+
+/// Sizes the window for its text and buttons, and places them.
+void
+BAlert::LayOut()
+{
+	float widest = kUsualButtonWidth;
+	float widths[kMostButtons] = {};
+	float height = 0;
+	for (int32 i = 0; i < kMostButtons; i++) {
+		if (fButtons[i] == NULL)
+			continue;
+		float buttonHeight;
+		fButtons[i]->GetPreferredSize(&widths[i], &buttonHeight);
+		if (fButtonWidth == B_WIDTH_FROM_LABEL)
+			widths[i] = std::ceil(fButtons[i]->StringWidth(fButtons[i]->Label())) + 24;
+		else if (fButtonWidth == B_WIDTH_AS_USUAL)
+			widths[i] = std::max(widths[i], kUsualButtonWidth);
+		widest = std::max(widest, widths[i]);
+		height = std::max(height, buttonHeight);
+	}
+
+	const float textLeft =
+		fType == B_EMPTY_ALERT ? kMargin : kStripeWidth + kIconSize / 2 + kMargin;
+	float buttons = kMargin;
+	for (int32 i = 0; i < kMostButtons; i++) {
+		if (fButtons[i] == NULL)
+			continue;
+		if (fButtonWidth == B_WIDTH_FROM_WIDEST)
+			widths[i] = widest;
+		buttons += widths[i] + kMargin;
+	}
+	if (fSpacing == B_OFFSET_SPACING)
+		buttons += kOffsetGap;
+
+	const float width = std::max(textLeft + kTextWidth + kMargin, kStripeWidth + buttons);
+	fTextView->MoveTo(textLeft, kMargin);
+	fTextView->ResizeTo(width - textLeft - kMargin, 10);
+	fTextView->SetTextRect(fTextView->Bounds());
+	const float textHeight =
+		std::max(fTextView->TextHeight(0, fTextView->CountLines() - 1), kIconSize);
+	fTextView->ResizeTo(width - textLeft - kMargin, textHeight);
+
+	const float top = kMargin + textHeight + kMargin;
+	ResizeTo(width, top + height + kMargin);
+	float right = width - kMargin;
+	int32 left = 0;
+	while (left < kMostButtons && fButtons[left] == NULL)
+		left++;
+	for (int32 i = kMostButtons - 1; i >= 0; i--) {
+		if (fButtons[i] == NULL)
+			continue;
+		if (i == left && fSpacing == B_OFFSET_SPACING)
+			right -= kOffsetGap;
+		float preferred;
+		fButtons[i]->GetPreferredSize(NULL, &preferred);
+		fButtons[i]->ResizeTo(widths[i], preferred);
+		fButtons[i]->MoveTo(right - widths[i], top + (height - preferred) / 2);
+		right -= widths[i] + kMargin;
+	}
+}
+
+
+/// Centred, a little above the middle, over the calling window or on the screen.
+void
+BAlert::Place()
+{
+	BRect frame = BScreen(B_MAIN_SCREEN_ID).Frame();
+	const BRect screen = frame;
+	const BWindow* caller = dynamic_cast<BWindow*>(BLooper::LooperForThread(find_thread(NULL)));
+	if (caller != NULL && !caller->IsHidden())
+		frame = caller->Frame();
+	const BRect bounds = Bounds();
+	const float x = frame.left + (frame.Width() - bounds.Width()) / 2;
+	const float y = frame.top + (frame.Height() - bounds.Height()) / 3;
+	MoveTo(std::clamp(x, screen.left, std::max(screen.left, screen.right - bounds.Width())),
+		std::clamp(y, screen.top, std::max(screen.top, screen.bottom - bounds.Height())));
+}
+
+
+/// A button was pressed: gives the answer to whoever wants it, and ends the alert.
+void
+BAlert::Answer(int32 index)
+{
+	if (fAnswer != NULL) {
+		*fAnswer = index;
+		fAnswer = NULL;
+	} else if (fInvoker != NULL) {
+		BMessage* message = fInvoker->Message();
+		if (message != NULL) {
+			BMessage answer(*message);
+			answer.AddInt32("which", index);
+			fInvoker->Invoke(&answer);
+		}
+		fInvoker = NULL;
+	} else if (fAnswered >= 0)
+		return;
+	PostMessage(B_QUIT_REQUESTED);
+}

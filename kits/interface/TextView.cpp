@@ -1,0 +1,645 @@
+// SPDX-License-Identifier: MIT
+// BTextView: the text, its attributes and its picture.
+
+#include <TextView.h>
+
+#include <algorithm>
+#include <cmath>
+#include <cstring>
+
+#include <File.h>
+#include <Message.h>
+#include <Window.h>
+
+#include "ControlLook.h"
+#include "TextLayout.h"
+#include "TextUndo.h"
+
+namespace {
+
+constexpr float kDefaultTabWidth = 28;
+
+BFont
+StartFont(const BFont* font)
+{
+	return font != NULL ? *font : *be_plain_font;
+}
+
+} // namespace
+
+BTextView::BTextView(BRect frame, const char* name, BRect textRect, uint32 resizeMask, uint32 flags)
+	: BTextView(frame, name, textRect, NULL, NULL, resizeMask, flags)
+{
+}
+
+
+BTextView::BTextView(BRect frame, const char* name, BRect textRect, const BFont* initialFont,
+	const rgb_color* initialColor, uint32 resizeMask, uint32 flags)
+	: BView(frame, name, resizeMask, flags | B_FRAME_EVENTS),
+	  fLayout(std::make_unique<BPrivate::TextLayout>()),
+	  fUndo(std::make_unique<BPrivate::TextUndo>()),
+	  fTextRect(textRect),
+	  fColor(initialColor != NULL ? *initialColor : ui_color(B_DOCUMENT_TEXT_COLOR)),
+	  fAnchor(0),
+	  fCaret(0),
+	  fMaxBytes(INT32_MAX),
+	  fTabWidth(kDefaultTabWidth),
+	  fWantedX(-1),
+	  fAlignment(B_ALIGN_LEFT),
+	  fEditable(true),
+	  fSelectable(true),
+	  fWordWrap(true),
+	  fStylable(false),
+	  fAutoindent(false),
+	  fSelecting(false)
+{
+	SetViewColor(ui_color(B_DOCUMENT_BACKGROUND_COLOR));
+	SetLowColor(ViewColor());
+	const BFont font = StartFont(initialFont);
+	SetFont(&font);
+}
+
+
+BTextView::BTextView(const char* name, uint32 flags)
+	: BTextView(name, NULL, NULL, flags)
+{
+}
+
+
+BTextView::BTextView(
+	const char* name, const BFont* initialFont, const rgb_color* initialColor, uint32 flags)
+	: BTextView(BRect(0, 0, -1, -1), name, BRect(0, 0, 100, 100), initialFont, initialColor,
+		B_FOLLOW_LEFT_TOP, flags)
+{
+}
+
+
+BTextView::BTextView(BMessage* archive)
+	: BTextView("", NULL, NULL, B_WILL_DRAW)
+{
+	const BRect frame = archive->FindRect("_frame");
+	MoveTo(frame.LeftTop());
+	ResizeTo(frame.Width(), frame.Height());
+	SetName(archive->FindString("_name"));
+	archive->FindRect("_trect", &fTextRect);
+	const char* text;
+	if (archive->FindString("_text", &text) == B_OK)
+		SetText(text);
+	int32 number;
+	if (archive->FindInt32("_max", &number) == B_OK)
+		fMaxBytes = number;
+	bool flag;
+	if (archive->FindBool("_nedit", &flag) == B_OK)
+		fEditable = !flag;
+	if (archive->FindBool("_nsel", &flag) == B_OK)
+		fSelectable = !flag;
+	if (archive->FindBool("_wrap", &flag) == B_OK)
+		SetWordWrap(flag);
+}
+
+
+BTextView::~BTextView() {}
+
+
+BArchivable*
+BTextView::Instantiate(BMessage* archive)
+{
+	return validate_instantiation(archive, "BTextView") ? new BTextView(archive) : NULL;
+}
+
+
+status_t
+BTextView::Archive(BMessage* archive, bool deep) const
+{
+	status_t status = BView::Archive(archive, deep);
+	if (status == B_OK)
+		status = archive->AddRect("_trect", fTextRect);
+	if (status == B_OK)
+		status = archive->AddString("_text", Text());
+	if (status == B_OK && fMaxBytes != INT32_MAX)
+		status = archive->AddInt32("_max", fMaxBytes);
+	if (status == B_OK)
+		status = archive->AddBool("_nedit", !fEditable);
+	if (status == B_OK)
+		status = archive->AddBool("_nsel", !fSelectable);
+	if (status == B_OK)
+		status = archive->AddBool("_wrap", fWordWrap);
+	return status;
+}
+
+
+void
+BTextView::AttachedToWindow()
+{
+	BView::AttachedToWindow();
+	Relayout();
+}
+
+
+void
+BTextView::DetachedFromWindow()
+{
+	fSelecting = false;
+	BView::DetachedFromWindow();
+}
+
+
+void
+BTextView::WindowActivated(bool active)
+{
+	BView::WindowActivated(active);
+	if (IsFocus())
+		InvalidateText();
+}
+
+
+void
+BTextView::FrameResized(float newWidth, float newHeight)
+{
+	BView::FrameResized(newWidth, newHeight);
+	InvalidateText();
+}
+
+
+void
+BTextView::MakeFocus(bool focus)
+{
+	const bool had = IsFocus();
+	BView::MakeFocus(focus);
+	SealUndo();
+	if (IsFocus() != had)
+		InvalidateText();
+}
+
+
+void
+BTextView::GetPreferredSize(float* _width, float* _height)
+{
+	if (_width != NULL)
+		*_width = Bounds().Width();
+	if (_height != NULL) {
+		const float insets = fTextRect.top - Bounds().top;
+		*_height = TextHeight(0, CountLines() - 1) + 2 * std::max(insets, 0.0f);
+	}
+}
+
+
+void
+BTextView::SetFont(const BFont* font, uint32 mask)
+{
+	BView::SetFont(font, mask);
+	Relayout();
+}
+
+
+void
+BTextView::SetText(const char* text, const text_run_array* runs)
+{
+	SetText(text, text != NULL ? static_cast<int32>(strlen(text)) : 0, runs);
+}
+
+
+void
+BTextView::SetText(const char* text, int32 length, const text_run_array* runs)
+{
+	if (!fText.empty())
+		DeleteText(0, TextLength());
+	if (text != NULL && length > 0)
+		InsertText(text, length, 0, runs);
+	fAnchor = 0;
+	fCaret = 0;
+	if (fUndo != NULL)
+		fUndo->Forget();
+	TextChanged();
+	ScrollToOffset(0);
+}
+
+
+void
+BTextView::SetText(BFile* file, int32 offset, int32 length, const text_run_array* runs)
+{
+	if (file == NULL || length < 0)
+		return;
+	off_t size;
+	if (file->GetSize(&size) != B_OK || offset < 0 || offset > size)
+		return;
+	std::string text(std::min<off_t>(length, size - offset), '\0');
+	const ssize_t read = file->ReadAt(offset, text.data(), text.size());
+	if (read >= 0)
+		SetText(text.data(), static_cast<int32>(read), runs);
+}
+
+
+const char*
+BTextView::Text() const
+{
+	return fText.c_str();
+}
+
+
+int32
+BTextView::TextLength() const
+{
+	return static_cast<int32>(fText.size());
+}
+
+
+void
+BTextView::GetText(int32 offset, int32 length, char* buffer) const
+{
+	const int32 start = std::clamp<int32>(offset, 0, TextLength());
+	const int32 count = std::clamp<int32>(length, 0, TextLength() - start);
+	memcpy(buffer, fText.data() + start, count);
+	buffer[count] = '\0';
+}
+
+
+void
+BTextView::SetFontAndColor(const BFont* font, uint32 mode, const rgb_color* color)
+{
+	if (color != NULL)
+		fColor = *color;
+	if (font != NULL)
+		SetFont(font, mode);
+	InvalidateText();
+}
+
+
+void
+BTextView::SetFontAndColor(int32, int32, const BFont* font, uint32 mode, const rgb_color* color)
+{
+	SetFontAndColor(font, mode, color);
+}
+
+
+void
+BTextView::GetFontAndColor(int32, BFont* _font, rgb_color* _color) const
+{
+	GetFontAndColor(_font, NULL, _color);
+}
+
+
+void
+BTextView::GetFontAndColor(BFont* _font, uint32* _mode, rgb_color* _color, bool* _sameColor) const
+{
+	if (_font != NULL)
+		GetFont(_font);
+	if (_mode != NULL)
+		*_mode = B_FONT_ALL;
+	if (_color != NULL)
+		*_color = fColor;
+	if (_sameColor != NULL)
+		*_sameColor = true;
+}
+
+
+int32
+BTextView::CountLines() const
+{
+	return fLayout->CountLines();
+}
+
+
+int32
+BTextView::CurrentLine() const
+{
+	return LineAt(fCaret);
+}
+
+
+int32
+BTextView::LineAt(int32 offset) const
+{
+	return fLayout->LineAt(std::clamp<int32>(offset, 0, TextLength()));
+}
+
+
+int32
+BTextView::LineAt(BPoint point) const
+{
+	if (fLayout->LineHeight() <= 0)
+		return 0;
+	const int32 line =
+		static_cast<int32>(std::floor((point.y - fTextRect.top) / fLayout->LineHeight()));
+	return std::clamp<int32>(line, 0, CountLines() - 1);
+}
+
+
+BPoint
+BTextView::PointAt(int32 offset, float* _height) const
+{
+	offset = std::clamp<int32>(offset, 0, TextLength());
+	const int32 line = LineAt(offset);
+	if (_height != NULL)
+		*_height = fLayout->LineHeight();
+
+	float left = fTextRect.left;
+	if (fAlignment != B_ALIGN_LEFT) {
+		const float space = fTextRect.Width() - fLayout->LineWidth(line);
+		left += std::floor(fAlignment == B_ALIGN_RIGHT ? space : space / 2);
+	}
+	return BPoint(left + fLayout->XAt(line, offset), fTextRect.top + line * fLayout->LineHeight());
+}
+
+
+int32
+BTextView::OffsetAt(BPoint point) const
+{
+	const int32 line = LineAt(point);
+	if (point.y < fTextRect.top)
+		return 0;
+	if (point.y >= fTextRect.top + CountLines() * fLayout->LineHeight() && CountLines() > 1)
+		return TextLength();
+	const float left = PointAt(fLayout->LineStart(line)).x;
+	return fLayout->OffsetAt(line, point.x - left);
+}
+
+
+int32
+BTextView::OffsetAt(int32 line) const
+{
+	if (line < 0)
+		return 0;
+	return line < CountLines() ? fLayout->LineStart(line) : TextLength();
+}
+
+
+float
+BTextView::LineWidth(int32 lineNumber) const
+{
+	return lineNumber >= 0 && lineNumber < CountLines() ? fLayout->LineWidth(lineNumber) : 0;
+}
+
+
+float
+BTextView::LineHeight(int32 lineNumber) const
+{
+	return lineNumber >= 0 && lineNumber < CountLines() ? fLayout->LineHeight() : 0;
+}
+
+
+float
+BTextView::TextHeight(int32 startLine, int32 endLine) const
+{
+	const int32 first = std::max<int32>(startLine, 0);
+	const int32 last = std::min(endLine, CountLines() - 1);
+	return last >= first ? (last - first + 1) * fLayout->LineHeight() : 0;
+}
+
+
+void
+BTextView::SetTextRect(BRect rect)
+{
+	fTextRect = rect;
+	Relayout();
+}
+
+
+BRect
+BTextView::TextRect() const
+{
+	return fTextRect;
+}
+
+
+void
+BTextView::SetInsets(float left, float top, float right, float bottom)
+{
+	const BRect bounds = Bounds();
+	SetTextRect(
+		BRect(bounds.left + left, bounds.top + top, bounds.right - right, bounds.bottom - bottom));
+}
+
+
+void
+BTextView::GetInsets(float* _left, float* _top, float* _right, float* _bottom) const
+{
+	const BRect bounds = Bounds();
+	if (_left != NULL)
+		*_left = fTextRect.left - bounds.left;
+	if (_top != NULL)
+		*_top = fTextRect.top - bounds.top;
+	if (_right != NULL)
+		*_right = bounds.right - fTextRect.right;
+	if (_bottom != NULL)
+		*_bottom = bounds.bottom - fTextRect.bottom;
+}
+
+
+void
+BTextView::SetStylable(bool stylable)
+{
+	fStylable = stylable;
+}
+
+
+bool
+BTextView::IsStylable() const
+{
+	return fStylable;
+}
+
+
+void
+BTextView::SetTabWidth(float width)
+{
+	if (width <= 0)
+		return;
+	fTabWidth = width;
+	Relayout();
+}
+
+
+float
+BTextView::TabWidth() const
+{
+	return fTabWidth;
+}
+
+
+void
+BTextView::MakeSelectable(bool selectable)
+{
+	fSelectable = selectable;
+	InvalidateText();
+}
+
+
+bool
+BTextView::IsSelectable() const
+{
+	return fSelectable;
+}
+
+
+void
+BTextView::MakeEditable(bool editable)
+{
+	fEditable = editable;
+	InvalidateText();
+}
+
+
+bool
+BTextView::IsEditable() const
+{
+	return fEditable;
+}
+
+
+void
+BTextView::SetWordWrap(bool wrap)
+{
+	if (wrap == fWordWrap)
+		return;
+	fWordWrap = wrap;
+	Relayout();
+}
+
+
+bool
+BTextView::DoesWordWrap() const
+{
+	return fWordWrap;
+}
+
+
+int32
+BTextView::MaxBytes() const
+{
+	return fMaxBytes;
+}
+
+
+void
+BTextView::SetMaxBytes(int32 max)
+{
+	fMaxBytes = max;
+	if (TextLength() <= max || max < 0)
+		return;
+	int32 end = max;
+	while (end > 0 && (static_cast<unsigned char>(fText[end]) & 0xc0) == 0x80)
+		end--;
+	Delete(end, TextLength());
+}
+
+
+void
+BTextView::DisallowChar(uint32 character)
+{
+	fDisallowed.insert(character);
+}
+
+
+void
+BTextView::AllowChar(uint32 character)
+{
+	fDisallowed.erase(character);
+}
+
+
+void
+BTextView::SetAlignment(alignment align)
+{
+	fAlignment = align;
+	InvalidateText();
+}
+
+
+alignment
+BTextView::Alignment() const
+{
+	return fAlignment;
+}
+
+
+void
+BTextView::SetAutoindent(bool state)
+{
+	fAutoindent = state;
+}
+
+
+bool
+BTextView::DoesAutoindent() const
+{
+	return fAutoindent;
+}
+
+
+void
+BTextView::Draw(BRect updateRect)
+{
+	SetDrawingMode(B_OP_OVER);
+	const int32 first = LineAt(updateRect.LeftTop());
+	const int32 last = LineAt(updateRect.RightBottom());
+	for (int32 line = first; line <= last; line++)
+		DrawLine(line);
+
+	if (ShowsCaret()) {
+		float height;
+		const BPoint top = PointAt(fCaret, &height);
+		SetHighColor(fColor);
+		StrokeLine(top, BPoint(top.x, top.y + height - 1));
+	}
+	SetDrawingMode(B_OP_COPY);
+}
+
+
+void
+BTextView::DrawLine(int32 line)
+{
+	const int32 start = fLayout->LineStart(line);
+	const int32 end = fLayout->LineEnd(line);
+	const BPoint top = PointAt(start);
+	int32 selectionStart;
+	int32 selectionEnd;
+	GetSelection(&selectionStart, &selectionEnd);
+	const int32 from = std::max(start, selectionStart);
+	const int32 to = std::min(end, selectionEnd);
+	// A selection that goes on in the next line includes the line break.
+	const bool breakSelected = selectionStart <= end && selectionEnd > end;
+	const bool active = IsFocus() && Window()->IsActive();
+	if (fSelectable && (from < to || (breakSelected && from <= to))) {
+		const float left = top.x + fLayout->XAt(line, from);
+		const float right = breakSelected ? fTextRect.right : top.x + fLayout->XAt(line, to) - 1;
+		const rgb_color mark = ui_color(B_LIST_SELECTED_BACKGROUND_COLOR);
+		SetHighColor(BPrivate::BlendColors(ViewColor(), mark, active ? 1.0f : 0.5f));
+		FillRect(BRect(left, top.y, right, top.y + fLayout->LineHeight() - 1));
+	}
+
+	SetHighColor(fColor);
+	int32 offset = start;
+	while (offset < end) {
+		const size_t found = fText.find('\t', offset);
+		const int32 piece = found == std::string::npos ? end : std::min<int32>(found, end);
+		DrawString(fText.data() + offset, piece - offset,
+			BPoint(top.x + fLayout->XAt(line, offset), top.y + fLayout->Ascent()));
+		offset = piece + 1;
+	}
+}
+
+
+bool
+BTextView::ShowsCaret() const
+{
+	return fEditable && fCaret == fAnchor && IsFocus() && Window()->IsActive();
+}
+
+
+void
+BTextView::Relayout()
+{
+	BFont font;
+	GetFont(&font);
+	fLayout->SetTo(fText, font, fWordWrap ? std::max(fTextRect.Width(), 1.0f) : 0, fTabWidth);
+	InvalidateText();
+}
+
+
+void
+BTextView::InvalidateText()
+{
+	if (Window() != NULL)
+		Invalidate();
+}

@@ -1,0 +1,373 @@
+// SPDX-License-Identifier: MIT
+// BTextView: changes of the text, the selection and the clipboard.
+
+#include <algorithm>
+#include <cstring>
+
+#include <Beep.h>
+#include <Clipboard.h>
+#include <Message.h>
+#include <TextView.h>
+#include <Window.h>
+
+#include "TextLayout.h"
+#include "TextUndo.h"
+
+namespace {
+
+constexpr const char* kPlainText = "text/plain";
+
+/// The code point of the UTF-8 character of that length; bytes that are none count as themselves.
+uint32
+CodePoint(const char* text, int32 length)
+{
+	const unsigned char first = text[0];
+	if (length == 1)
+		return first;
+	uint32 code = first & (0xff >> (length + 1));
+	for (int32 i = 1; i < length; i++)
+		code = code << 6 | (text[i] & 0x3f);
+	return code;
+}
+
+} // namespace
+
+void
+BTextView::Insert(const char* text, const text_run_array* runs)
+{
+	if (text != NULL)
+		Insert(text, static_cast<int32>(strlen(text)), runs);
+}
+
+
+void
+BTextView::Insert(const char* text, int32 length, const text_run_array*)
+{
+	if (text == NULL || length < 0)
+		return;
+	int32 start;
+	int32 end;
+	GetSelection(&start, &end);
+	Replace(start, end, text, length);
+}
+
+
+void
+BTextView::Insert(int32 offset, const char* text, int32 length, const text_run_array* runs)
+{
+	if (text == NULL || length <= 0)
+		return;
+	offset = std::clamp<int32>(offset, 0, TextLength());
+	InsertText(text, length, offset, runs);
+	if (fCaret >= offset)
+		fCaret += length;
+	if (fAnchor >= offset)
+		fAnchor += length;
+	TextChanged();
+}
+
+
+void
+BTextView::Delete()
+{
+	int32 start;
+	int32 end;
+	GetSelection(&start, &end);
+	Delete(start, end);
+}
+
+
+void
+BTextView::Delete(int32 startOffset, int32 endOffset)
+{
+	const int32 start = std::clamp<int32>(startOffset, 0, TextLength());
+	const int32 end = std::clamp<int32>(endOffset, 0, TextLength());
+	if (start < end)
+		Replace(start, end, "", 0);
+}
+
+
+void
+BTextView::InsertText(const char* text, int32 length, int32 offset, const text_run_array*)
+{
+	fText.insert(offset, text, length);
+	Relayout();
+}
+
+
+void
+BTextView::DeleteText(int32 fromOffset, int32 toOffset)
+{
+	fText.erase(fromOffset, toOffset - fromOffset);
+	Relayout();
+}
+
+
+/// Puts a text in place of a range, and the caret behind it.
+void
+BTextView::Replace(int32 from, int32 to, const char* text, int32 length)
+{
+	const std::string removed = fText.substr(from, to - from);
+	const std::string inserted(text, length);
+	if (from < to)
+		DeleteText(from, to);
+	if (length > 0)
+		InsertText(inserted.data(), length, from, NULL);
+	if (fUndo != NULL)
+		fUndo->Note(from, removed, inserted);
+	fCaret = from + length;
+	fAnchor = fCaret;
+	TextChanged();
+}
+
+
+/// Whether the user may put the text in place of so many bytes.
+bool
+BTextView::IsAllowed(const char* text, int32 length, int32 replaced)
+{
+	if (TextLength() - replaced + length > fMaxBytes)
+		return false;
+	if (fDisallowed.empty())
+		return true;
+	const std::string characters(text, length);
+	for (int32 i = 0; i < length; i += BPrivate::CharacterLength(characters, i)) {
+		const int32 size = BPrivate::CharacterLength(characters, i);
+		if (fDisallowed.count(CodePoint(text + i, size)) != 0) {
+			beep();
+			return false;
+		}
+	}
+	return true;
+}
+
+
+void
+BTextView::TextChanged()
+{
+	fWantedX = -1;
+	fCaret = std::clamp<int32>(fCaret, 0, TextLength());
+	fAnchor = std::clamp<int32>(fAnchor, 0, TextLength());
+	InvalidateText();
+}
+
+
+void
+BTextView::Select(int32 startOffset, int32 endOffset)
+{
+	if (startOffset > endOffset)
+		return;
+	fAnchor = std::clamp<int32>(startOffset, 0, TextLength());
+	fCaret = std::clamp<int32>(endOffset, 0, TextLength());
+	fWantedX = -1;
+	SealUndo();
+	InvalidateText();
+}
+
+
+void
+BTextView::SelectAll()
+{
+	Select(0, TextLength());
+}
+
+
+void
+BTextView::GetSelection(int32* _start, int32* _end) const
+{
+	if (_start != NULL)
+		*_start = std::min(fAnchor, fCaret);
+	if (_end != NULL)
+		*_end = std::max(fAnchor, fCaret);
+}
+
+
+void
+BTextView::Cut(BClipboard* clipboard)
+{
+	if (!fEditable)
+		return;
+	Copy(clipboard);
+	Delete();
+}
+
+
+void
+BTextView::Copy(BClipboard* clipboard)
+{
+	int32 start;
+	int32 end;
+	GetSelection(&start, &end);
+	if (start == end || clipboard == NULL || !clipboard->Lock())
+		return;
+	clipboard->Clear();
+	clipboard->Data()->AddData(kPlainText, B_MIME_TYPE, fText.data() + start, end - start);
+	clipboard->Commit();
+	clipboard->Unlock();
+}
+
+
+void
+BTextView::Paste(BClipboard* clipboard)
+{
+	if (!fEditable || clipboard == NULL || !clipboard->Lock())
+		return;
+	const void* data = NULL;
+	ssize_t size = 0;
+	std::string text;
+	if (clipboard->Data()->FindData(kPlainText, B_MIME_TYPE, &data, &size) == B_OK)
+		text.assign(static_cast<const char*>(data), strnlen(static_cast<const char*>(data), size));
+	clipboard->Unlock();
+
+	int32 start;
+	int32 end;
+	GetSelection(&start, &end);
+	const int32 length = static_cast<int32>(text.size());
+	if (length == 0 || !IsAllowed(text.data(), length, end - start))
+		return;
+	SealUndo();
+	Replace(start, end, text.data(), length);
+	SealUndo();
+	ScrollToSelection();
+}
+
+
+void
+BTextView::Clear()
+{
+	Delete();
+}
+
+
+bool
+BTextView::AcceptsPaste(BClipboard* clipboard)
+{
+	if (!fEditable || clipboard == NULL || !clipboard->Lock())
+		return false;
+	const bool accepts = clipboard->Data()->HasData(kPlainText, B_MIME_TYPE);
+	clipboard->Unlock();
+	return accepts;
+}
+
+
+bool
+BTextView::AcceptsDrop(const BMessage* message)
+{
+	return fEditable && message != NULL && message->HasData(kPlainText, B_MIME_TYPE);
+}
+
+
+void
+BTextView::SetDoesUndo(bool undo)
+{
+	if (!undo)
+		fUndo.reset();
+	else if (fUndo == NULL)
+		fUndo = std::make_unique<BPrivate::TextUndo>();
+}
+
+
+bool
+BTextView::DoesUndo() const
+{
+	return fUndo != NULL;
+}
+
+
+void
+BTextView::Undo(BClipboard*)
+{
+	if (!fEditable || fUndo == NULL || fUndo->IsEmpty())
+		return;
+	const int32 offset = fUndo->Offset();
+	const std::string text = fUndo->Removed();
+	const int32 inserted = static_cast<int32>(fUndo->Inserted().size());
+	fUndo->Seal();
+	Replace(offset, std::min(offset + inserted, TextLength()), text.data(),
+		static_cast<int32>(text.size()));
+	fUndo->Seal();
+	ScrollToSelection();
+}
+
+
+void
+BTextView::MessageReceived(BMessage* message)
+{
+	if (message->WasDropped() && AcceptsDrop(message)) {
+		const void* data;
+		ssize_t size;
+		if (message->FindData(kPlainText, B_MIME_TYPE, &data, &size) != B_OK)
+			return;
+		const char* text = static_cast<const char*>(data);
+		const int32 length = static_cast<int32>(strnlen(text, size));
+		if (!IsAllowed(text, length, 0))
+			return;
+		const int32 offset = OffsetAt(ConvertFromScreen(message->DropPoint()));
+		Replace(offset, offset, text, length);
+		return;
+	}
+
+	switch (message->what) {
+		case B_CUT:
+			Cut(be_clipboard);
+			break;
+
+		case B_COPY:
+			Copy(be_clipboard);
+			break;
+
+		case B_PASTE:
+			Paste(be_clipboard);
+			break;
+
+		case B_SELECT_ALL:
+			SelectAll();
+			break;
+
+		case B_UNDO:
+			Undo(be_clipboard);
+			break;
+
+		default:
+			BView::MessageReceived(message);
+			break;
+	}
+}
+
+
+void
+BTextView::SealUndo()
+{
+	if (fUndo != NULL)
+		fUndo->Seal();
+}
+
+
+void
+BTextView::ScrollToOffset(int32 offset)
+{
+	if (Window() == NULL)
+		return;
+	float height;
+	const BPoint top = PointAt(offset, &height);
+	const BRect bounds = Bounds();
+	BPoint where = bounds.LeftTop();
+	// Without word wrap a caret at the right edge brings some of what follows with it.
+	const float ahead = std::min(bounds.Width() / 4, 30.0f);
+	if (top.x < bounds.left + 1)
+		where.x = std::max(top.x - ahead, 0.0f);
+	else if (top.x > bounds.right - 1)
+		where.x = top.x - bounds.Width() + ahead;
+	if (top.y < bounds.top)
+		where.y = std::max(top.y, 0.0f);
+	else if (top.y + height > bounds.bottom + 1 && height <= bounds.Height())
+		where.y = top.y + height - bounds.Height();
+	if (where != bounds.LeftTop())
+		ScrollTo(where);
+}
+
+
+void
+BTextView::ScrollToSelection()
+{
+	ScrollToOffset(fCaret);
+}

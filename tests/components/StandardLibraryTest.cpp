@@ -1,0 +1,204 @@
+// SPDX-License-Identifier: MIT
+
+#include <Box.h>
+#include <Button.h>
+#include <CheckBox.h>
+#include <StringView.h>
+#include <TextControl.h>
+
+#include "designer/DesignerTest.h"
+#include "model/Event.h"
+#include "model/Property.h"
+#include "palette/PaletteCatalog.h"
+#include "palette/PaletteEntry.h"
+#include "props/PropertyEditor.h"
+#include "props/StringList.h"
+#include "support/CapturedOutput.h"
+#include "support/Printers.h"
+
+class StandardLibraryTest : public DesignerTest {
+protected:
+	template <class View>
+	static View* ViewOf(TComponent* component)
+	{
+		return dynamic_cast<View*>(component->DTView());
+	}
+
+	static void Set(TComponent* component, const char* name, const char* value)
+	{
+		CapturedOutput output;
+		component->SetPropertyValue(name, value);
+	}
+
+	static std::string Params(TComponent* component)
+	{
+		BString text;
+		component->OnSetConstructorParams(text);
+		return text.String();
+	}
+};
+
+
+TEST_F(StandardLibraryTest, EachClassHasItsNameHeaderAndOwnPropertiesAndEvents)
+{
+	const struct {
+		const char* className;
+		const char* stem;
+		const char* header;
+		std::vector<const char*> properties;
+		std::vector<const char*> events;
+	} kCases[] = {
+		{"TButton", "Button", "Button.h", {"Label", "Default"}, {"OnClick"}},
+		{"TCheckBox", "CheckBox", "CheckBox.h", {"Label", "Checked"}, {"OnChange"}},
+		{"TTextControl", "TextControl", "TextControl.h", {"Label", "Text", "Divider"},
+			{"OnChange", "OnEnter"}},
+		{"TStringView", "StringView", "StringView.h", {"Text", "Alignment", "ResizingMode"},
+			{"OnClick"}},
+		{"TBox", "Box", "Box.h", {"Label", "Border", "ResizingMode"}, {"OnClick"}},
+	};
+	TDesignForm* form = NewForm();
+	for (const auto& row : kCases) {
+		TPaletteEntry* entry = PaletteCatalog().FindPalEntry(row.className);
+		ASSERT_NE(entry, nullptr) << row.className;
+		EXPECT_STREQ(entry->ComponentName(), row.stem);
+		TComponent* component = Place(form, row.className, row.className);
+		ASSERT_NE(component, nullptr) << row.className;
+		EXPECT_STREQ(component->ClassName(), row.className);
+		EXPECT_STREQ(component->HeaderFile(), row.header);
+		for (const char* name : row.properties) {
+			TProperty* property = component->FindProperty(name);
+			ASSERT_NE(property, nullptr) << row.className << " " << name;
+			EXPECT_TRUE(property->IsGenerated()) << row.className << " " << name;
+			EXPECT_NE(property->Editor(), nullptr) << row.className << " " << name;
+		}
+		for (const char* name : row.events)
+			EXPECT_NE(component->FindEvent(name), nullptr) << row.className << " " << name;
+		EXPECT_STREQ(component->EventAt(0)->name, "OnAllAttached");
+		EXPECT_EQ(component->CountEvents(), 13 + static_cast<int32>(row.events.size()));
+	}
+}
+
+
+TEST_F(StandardLibraryTest, ComponentsLieInTheirFrameOnTheirParent)
+{
+	TDesignForm* form = NewForm();
+	for (const char* name : {"TButton", "TCheckBox", "TStringView", "TBox"}) {
+		TComponent* component = Place(form, name, name, BRect(15, 25, 95, 57));
+		EXPECT_EQ(component->DTView()->Frame(), BRect(15, 25, 95, 57)) << name;
+		EXPECT_EQ(component->DTView()->Parent(), form->View()) << name;
+	}
+}
+
+
+TEST_F(StandardLibraryTest, AnEntryWithoutAParentMakesNothing)
+{
+	EXPECT_EQ(PaletteCatalog().FindPalEntry("TButton")->CreateComponent(
+				  nullptr, nullptr, BRect(0, 0, 20, 20)),
+		nullptr);
+}
+
+
+TEST_F(StandardLibraryTest, AButtonShowsItsLabelAndState)
+{
+	TComponent* component = Place(NewForm(), "TButton", "Button1");
+	BButton* button = ViewOf<BButton>(component);
+	ASSERT_NE(button, nullptr);
+	Set(component, "Label", "OK");
+	EXPECT_STREQ(button->Label(), "OK");
+	Set(component, "Enabled", "TRUE");
+	EXPECT_FALSE(button->IsEnabled());
+	Set(component, "Enabled", "true");
+	EXPECT_TRUE(button->IsEnabled());
+	Set(component, "Default", "true");
+	EXPECT_EQ(button->Frame(), BRect(10, 10, 60, 40));
+	EXPECT_EQ(Params(component), "\"OK\"");
+	EXPECT_STREQ(component->FindProperty("Default")->SetStatement().String(),
+		"$COMPONENT->MakeDefault($VALUE);");
+}
+
+
+TEST_F(StandardLibraryTest, ACheckBoxShowsItsTick)
+{
+	TComponent* component = Place(NewForm(), "TCheckBox", "CheckBox1");
+	BCheckBox* box = ViewOf<BCheckBox>(component);
+	ASSERT_NE(box, nullptr);
+	Set(component, "Checked", "true");
+	EXPECT_EQ(box->Value(), B_CONTROL_ON);
+	Set(component, "Checked", "false");
+	EXPECT_EQ(box->Value(), B_CONTROL_OFF);
+}
+
+
+TEST_F(StandardLibraryTest, ATextControlShowsLabelTextAndDivider)
+{
+	TComponent* component = Place(NewForm(), "TTextControl", "TextControl1");
+	BTextControl* control = ViewOf<BTextControl>(component);
+	ASSERT_NE(control, nullptr);
+	Set(component, "Label", "Name:");
+	Set(component, "Text", "Jo");
+	Set(component, "Divider", "40");
+	EXPECT_STREQ(control->Label(), "Name:");
+	EXPECT_STREQ(control->Text(), "Jo");
+	EXPECT_EQ(control->Divider(), 40);
+	EXPECT_EQ(Params(component), "\"Name:\",\"Jo\"");
+}
+
+
+TEST_F(StandardLibraryTest, AStringViewShowsTextAndAlignment)
+{
+	TComponent* component = Place(NewForm(), "TStringView", "StringView1");
+	BStringView* view = ViewOf<BStringView>(component);
+	ASSERT_NE(view, nullptr);
+	Set(component, "Text", "Hello");
+	Set(component, "Alignment", "B_ALIGN_RIGHT");
+	EXPECT_STREQ(view->Text(), "Hello");
+	EXPECT_EQ(view->Alignment(), B_ALIGN_RIGHT);
+	Set(component, "Alignment", "nonsense");
+	EXPECT_EQ(view->Alignment(), B_ALIGN_LEFT);
+	EXPECT_STREQ(component->FindProperty("Text")->SetStatement().String(),
+		"StringView1->SetText(\"Hello\");");
+
+	TStringList list(20);
+	component->FindProperty("Alignment")->Editor()->GetValuePickList(&list);
+	component->FindProperty("Alignment")->Editor()->GetValuePickList(&list);
+	ASSERT_EQ(list.CountItems(), 3);
+	EXPECT_STREQ(list.StringAt(0), "B_ALIGN_LEFT");
+	EXPECT_STREQ(list.StringAt(1), "B_ALIGN_RIGHT");
+	EXPECT_STREQ(list.StringAt(2), "B_ALIGN_CENTER");
+}
+
+
+TEST_F(StandardLibraryTest, ABoxShowsLabelAndBorderAndHoldsComponents)
+{
+	TDesignForm* form = NewForm();
+	TComponent* component = Place(form, "TBox", "Box1", BRect(10, 10, 200, 150));
+	BBox* box = ViewOf<BBox>(component);
+	ASSERT_NE(box, nullptr);
+	Set(component, "Label", "Group");
+	Set(component, "Border", "B_PLAIN_BORDER");
+	EXPECT_STREQ(box->Label(), "Group");
+	EXPECT_EQ(box->Border(), B_PLAIN_BORDER);
+	TComponent* button = Place(form, "TButton", "Button1", BRect(10, 30, 80, 54), component);
+	EXPECT_EQ(button->DTView()->Parent(), box);
+	EXPECT_NE(dynamic_cast<TComponentOwner*>(component), nullptr);
+}
+
+
+TEST_F(StandardLibraryTest, ConstructorParametersAreEscapedLiterals)
+{
+	TComponent* component = Place(NewForm(), "TButton", "Button1");
+	Set(component, "Label", "Say \"hi\"\\\n");
+	EXPECT_EQ(Params(component), "\"Say \\\"hi\\\"\\\\\\n\"");
+}
+
+
+TEST_F(StandardLibraryTest, ControlsOnTheSurfaceDoNotTakeTheKeyboard)
+{
+	TComponent* component = Place(NewForm(), "TCheckBox", "CheckBox1");
+	BCheckBox* box = ViewOf<BCheckBox>(component);
+	const char space = ' ';
+	box->KeyDown(&space, 1);
+	EXPECT_EQ(box->Value(), B_CONTROL_OFF);
+	box->MakeFocus(true);
+	EXPECT_FALSE(box->IsFocus());
+}
