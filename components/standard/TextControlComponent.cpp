@@ -19,6 +19,9 @@ TTextControlComponent::TTextControlComponent(TFormDesigner* designer, BRect fram
 	InitEventList();
 	BTextControl* view = new DesignView<BTextControl>(this, frame, "TTextControl", "", "", nullptr);
 	view->SetDivider(0);
+	// A text control makes itself as high as its font needs, but the frame is what the user drew and
+	// what the document keeps.
+	view->ResizeTo(frame.Width(), frame.Height());
 	new DesignGlass(this, view);
 	SetDTView(view);
 }
