@@ -43,6 +43,9 @@ public:
 	explicit WindowData(BWindow* window);
 	~WindowData();
 
+	/// For the rest of the kits; \a window locked.
+	static WindowData& Of(BWindow* window) { return *window->fData; }
+
 	void ViewAdded(BView* view);
 	void ViewRemoved(BView* view);
 	/// Starts or stops the pulse as the rate and the views ask.

@@ -36,8 +36,11 @@ uint16
 FaceOf(const QString& family, const QString& style)
 {
 	int weight = QFontDatabase::weight(family, style);
+	auto isCalled = [&](const char* word) {
+		return style.contains(QLatin1String(word), Qt::CaseInsensitive);
+	};
 	uint16 face = 0;
-	if (QFontDatabase::italic(family, style))
+	if (QFontDatabase::italic(family, style) || isCalled("Italic") || isCalled("Oblique"))
 		face |= B_ITALIC_FACE;
 	if (weight >= QFont::Black)
 		face |= B_HEAVY_FACE;
@@ -45,9 +48,22 @@ FaceOf(const QString& family, const QString& style)
 		face |= B_BOLD_FACE;
 	else if (weight <= QFont::Light)
 		face |= B_LIGHT_FACE;
-	if (style.contains(QLatin1String("Condensed"), Qt::CaseInsensitive))
+	if (isCalled("Condensed"))
 		face |= B_CONDENSED_FACE;
 	return face == 0 ? static_cast<uint16>(B_REGULAR_FACE) : face;
+}
+
+
+/// Where a style comes in its family's list.
+int
+RankOf(uint16 face)
+{
+	int rank = 0;
+	for (uint16 one : {B_BOLD_FACE, B_ITALIC_FACE, B_LIGHT_FACE, B_HEAVY_FACE, B_CONDENSED_FACE}) {
+		rank = rank >> 1;
+		rank += (face & one) != 0 ? 16 : 0;
+	}
+	return rank;
 }
 
 
@@ -149,10 +165,14 @@ QtFonts::FamilyAt(int32 index)
 		std::string name = style.toStdString();
 		if (name.size() > B_FONT_STYLE_LENGTH)
 			continue;
-		family.styles.push_back({name, FaceOf(familyName, style),
-			QFontDatabase::weight(familyName, style), QFontDatabase::italic(familyName, style),
-			QFontDatabase::isFixedPitch(familyName, style)});
+		family.styles.push_back(
+			{name, FaceOf(familyName, style), QFontDatabase::weight(familyName, style),
+				(FaceOf(familyName, style) & B_ITALIC_FACE) != 0,
+				QFontDatabase::isFixedPitch(familyName, style)});
 	}
+	// The upright regular style first: it is what a family without a style stands for.
+	std::stable_sort(family.styles.begin(), family.styles.end(),
+		[](const Style& a, const Style& b) { return RankOf(a.face) < RankOf(b.face); });
 	return &family;
 }
 

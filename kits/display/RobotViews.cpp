@@ -1,0 +1,282 @@
+// SPDX-License-Identifier: MIT
+// The robot's eyes: windows and views by name, their texts and pictures.
+#include <cstring>
+
+#include <Application.h>
+#include <Control.h>
+#include <OS.h>
+#include <StringView.h>
+#include <View.h>
+#include <Window.h>
+
+#include "display/Display.h"
+#include "display/HostWindow.h"
+#include "display/Robot.h"
+#include "interface/WindowPrivate.h"
+
+namespace BPrivate {
+
+namespace {
+
+const bigtime_t kRetryTime = 10000;
+const bigtime_t kLockTime = 200000;
+
+
+bool
+TitleMatches(const char* title, const char* wanted)
+{
+	size_t length = strlen(wanted);
+	if (length > 0 && wanted[length - 1] == '*')
+		return strncmp(title, wanted, length - 1) == 0;
+	return strcmp(title, wanted) == 0;
+}
+
+
+BView*
+FindByLabel(BView* view, const char* label)
+{
+	auto control = dynamic_cast<BControl*>(view);
+	if (control != nullptr && control->Label() != nullptr && strcmp(control->Label(), label) == 0
+		&& !view->IsHidden())
+		return view;
+	for (int32 i = 0; i < view->CountChildren(); i++) {
+		BView* found = FindByLabel(view->ChildAt(i), label);
+		if (found != nullptr)
+			return found;
+	}
+	return nullptr;
+}
+
+
+BView*
+FindView(BWindow* window, const char* name)
+{
+	BView* view = window->FindView(name);
+	for (int32 i = 0; view == nullptr && i < window->CountChildren(); i++)
+		view = FindByLabel(window->ChildAt(i), name);
+	return view;
+}
+
+
+BRect
+VisiblePart(BView* view)
+{
+	BRect frame = view->ConvertToScreen(view->Bounds());
+	for (BView* parent = view->Parent(); parent != nullptr; parent = parent->Parent())
+		frame = frame & parent->ConvertToScreen(parent->Bounds());
+	return frame & view->Window()->Frame();
+}
+
+
+/// Calls \a task, window locked, for each window until it returns true. Busy ones are left out.
+bool
+ForEachWindow(const std::function<bool(BWindow*)>& task)
+{
+	for (int32 i = 0; be_app != nullptr && i < be_app->CountWindows(); i++) {
+		BWindow* window = be_app->WindowAt(i);
+		if (window == nullptr || window->LockWithTimeout(kLockTime) != B_OK)
+			continue;
+		bool isDone = task(window);
+		window->Unlock();
+		if (isDone)
+			return true;
+	}
+	return false;
+}
+
+
+bool
+TextOf(BView* view, BString* text)
+{
+	auto string = dynamic_cast<BStringView*>(view);
+	auto control = dynamic_cast<BControl*>(view);
+	const char* found = string != nullptr ? string->Text()
+		: control != nullptr              ? control->Label()
+										  : nullptr;
+	if (string == nullptr && control == nullptr)
+		return false;
+	*text = found;
+	return true;
+}
+
+} // namespace
+
+
+// #pragma mark - windows and views
+
+
+status_t
+Robot::WaitForWindow(const char* title, BMessenger* window)
+{
+	bigtime_t end = system_time() + fLimit;
+	do {
+		bool found = ForEachWindow([&](BWindow* candidate) {
+			if (candidate->IsHidden() || !TitleMatches(candidate->Title(), title))
+				return false;
+			*window = BMessenger(candidate);
+			return true;
+		});
+		if (found) {
+			Settle();
+			return B_OK;
+		}
+		Pause(kRetryTime);
+	} while (system_time() < end);
+	return B_TIMED_OUT;
+}
+
+
+status_t
+Robot::WaitForNoWindow(const char* title)
+{
+	bigtime_t end = system_time() + fLimit;
+	do {
+		bool found = ForEachWindow([&](BWindow* candidate) {
+			return !candidate->IsHidden() && TitleMatches(candidate->Title(), title);
+		});
+		if (!found)
+			return B_OK;
+		Pause(kRetryTime);
+	} while (system_time() < end);
+	return B_TIMED_OUT;
+}
+
+
+std::vector<BString>
+Robot::WindowTitles()
+{
+	std::vector<BString> titles;
+	ForEachWindow([&](BWindow* window) {
+		if (!window->IsHidden())
+			titles.push_back(window->Title());
+		return false;
+	});
+	return titles;
+}
+
+
+status_t
+Robot::WithWindow(const BMessenger& window, const std::function<void(BWindow*)>& task)
+{
+	status_t status = window.LockTargetWithTimeout(fLimit);
+	if (status != B_OK)
+		return status;
+	BLooper* looper;
+	window.Target(&looper);
+	auto target = dynamic_cast<BWindow*>(looper);
+	if (target != nullptr)
+		task(target);
+	looper->Unlock();
+	return target != nullptr ? B_OK : B_BAD_VALUE;
+}
+
+
+status_t
+Robot::WithView(const BMessenger& window, const char* name, const std::function<void(BView*)>& task)
+{
+	bigtime_t end = system_time() + fLimit;
+	do {
+		bool found = false;
+		status_t status = WithWindow(window, [&](BWindow* target) {
+			BView* view = FindView(target, name);
+			found = view != nullptr;
+			if (found)
+				task(view);
+		});
+		if (status != B_OK || found)
+			return status;
+		Pause(kRetryTime);
+	} while (system_time() < end);
+	return B_NAME_NOT_FOUND;
+}
+
+
+status_t
+Robot::GetWindowFrame(const BMessenger& window, BRect* frame)
+{
+	return WithWindow(window, [&](BWindow* target) { *frame = target->Frame(); });
+}
+
+
+status_t
+Robot::GetViewFrame(const BMessenger& window, const char* name, BRect* frame)
+{
+	return WithView(window, name, [&](BView* view) { *frame = VisiblePart(view); });
+}
+
+
+status_t
+Robot::ClickView(const BMessenger& window, const char* name, int32 count)
+{
+	BRect frame;
+	status_t status = GetViewFrame(window, name, &frame);
+	if (status != B_OK)
+		return status;
+	if (!frame.IsValid())
+		return B_BAD_VALUE;
+	Click(BPoint((frame.left + frame.right) / 2, (frame.top + frame.bottom) / 2), count);
+	return B_OK;
+}
+
+
+// #pragma mark - what came of it
+
+
+status_t
+Robot::GetText(const BMessenger& window, const char* name, BString* text)
+{
+	bool hasText = false;
+	status_t status = WithView(window, name, [&](BView* view) { hasText = TextOf(view, text); });
+	return status == B_OK && !hasText ? B_BAD_TYPE : status;
+}
+
+
+status_t
+Robot::GetValue(const BMessenger& window, const char* name, int32* value)
+{
+	bool hasValue = false;
+	status_t status = WithView(window, name, [&](BView* view) {
+		auto control = dynamic_cast<BControl*>(view);
+		hasValue = control != nullptr;
+		if (hasValue)
+			*value = control->Value();
+	});
+	return status == B_OK && !hasValue ? B_BAD_TYPE : status;
+}
+
+
+status_t
+Robot::WaitForText(const BMessenger& window, const char* name, const char* text, BString* found)
+{
+	bigtime_t end = system_time() + fLimit;
+	do {
+		status_t status = GetText(window, name, found);
+		if (status != B_OK || *found == text)
+			return status;
+		Pause(kRetryTime);
+	} while (system_time() < end);
+	return B_TIMED_OUT;
+}
+
+
+status_t
+Robot::ReadWindow(const BMessenger& window, Picture* picture)
+{
+	status_t status = WithWindow(window, [&](BWindow* target) {
+		HostWindow* host = WindowData::Of(target).host.get();
+		if (host != nullptr)
+			*picture = host->ReadPicture();
+	});
+	return status == B_OK && picture->pixels.empty() ? B_UNSUPPORTED : status;
+}
+
+
+status_t
+Robot::SaveWindow(const BMessenger& window, const char* path)
+{
+	Picture picture;
+	status_t status = ReadWindow(window, &picture);
+	return status == B_OK ? Display::Get().SavePicture(picture, path) : status;
+}
+
+} // namespace BPrivate
