@@ -57,7 +57,7 @@ TReplacementFile::KeepTail()
 
 
 status_t
-TReplacementFile::Replace()
+TReplacementFile::Replace(replacement_sync sync)
 {
 	if (fStatus != B_OK)
 		return fStatus;
@@ -73,7 +73,7 @@ TReplacementFile::Replace()
 	}
 
 	// The content has to be on the disk before the name leads to it.
-	status_t status = fNewFile.Sync();
+	status_t status = sync == REPLACE_SYNCED ? fNewFile.Sync() : B_OK;
 	if (status == B_OK)
 		status = BEntry(fNewPath.String()).Rename(fPath.String(), true);
 	if (status == B_OK) {

@@ -6,6 +6,12 @@
 #include <File.h>
 #include <String.h>
 
+/// Whether Replace() waits until the new content is on the disk.
+enum replacement_sync {
+	REPLACE_SYNCED, // for documents: a power failure, too, finds the old content or the new one
+	REPLACE_UNSYNCED // for files that can be made again: leaves the order of writing to the file system
+};
+
 /// The next content of a file: written beside the present one, and put in its place in one step.
 ///
 /// Whoever reads the path meanwhile, or after a crash, finds the old content or the new one, whole.
@@ -34,7 +40,7 @@ public:
 	///
 	/// Attributes already set on Stream() win over those of the present file. On failure the present
 	/// file is as it was. B_DEVICE_FULL and the like tell why.
-	status_t Replace();
+	status_t Replace(replacement_sync sync = REPLACE_SYNCED);
 
 private:
 	status_t OpenBeside(const char* path);
