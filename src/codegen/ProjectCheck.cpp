@@ -37,6 +37,7 @@ const char* const kAppMembers[] = {
 
 /// Classes that generated code takes from the runtime library.
 const char* const kRuntimeClasses[] = {"TForm", "TFormView"};
+const char* const kRuntimeLibrary = "the runtime library";
 
 
 bool
@@ -144,7 +145,7 @@ const std::vector<project_problem>&
 TProjectCheck::Run()
 {
 	for (const char* name : kRuntimeClasses)
-		fClasses.emplace(name, "the runtime library");
+		fClasses.emplace(name, kRuntimeLibrary);
 
 	CheckApp();
 	for (int32 i = 0; i < fApp->CountComponents(); i++) {
@@ -229,25 +230,35 @@ TProjectCheck::CheckComponentNames(TDesignForm* form)
 {
 	const TComponentOwner* components = FormComponents(form);
 	const int32 count = components->CountComponents();
-	// The class of a member cannot be named by another member.
+	std::unordered_set<std::string> classes;
 	for (int32 i = 0; i < count; i++) {
-		const std::string className = components->ComponentAt(i)->ClassName();
-		const bool isNew =
-			fMembers.emplace(className, "the components' class " + Quoted(className)).second;
-		if (isNew && !IsIdentifier(className))
-			Report("the class name " + Quoted(className) + " of "
-				+ ComponentOwnerText(components->ComponentAt(i))
-				+ " is no C++ identifier; correct its component library");
-		const auto clash = fClasses.find(className);
-		if (isNew && clash != fClasses.end() && clash->second != "the runtime library")
-			Report("the components' class " + Quoted(className) + " is also the class of "
-				+ clash->second + "; rename that");
+		const TComponent* component = components->ComponentAt(i);
+		if (classes.insert(component->ClassName()).second)
+			CheckComponentClass(component);
 	}
 	for (int32 i = 0; i < count; i++) {
 		const TComponent* component = components->ComponentAt(i);
 		const std::string owner = ComponentOwnerText(component);
 		CheckIdentifier(component->ComponentName(), owner);
 		ClaimName(fMembers, component->ComponentName(), owner, "member");
+	}
+}
+
+
+void
+TProjectCheck::CheckComponentClass(const TComponent* component)
+{
+	const std::string className = component->ClassName();
+	// A member cannot be called like the class of another member.
+	fMembers.emplace(className, "the components' class " + Quoted(className));
+	if (!IsIdentifier(className)) {
+		Report("the class name " + Quoted(className) + " of " + ComponentOwnerText(component)
+			+ " is no C++ identifier; correct its component library");
+	}
+	const auto clash = fClasses.find(className);
+	if (clash != fClasses.end() && clash->second != kRuntimeLibrary) {
+		Report("the components' class " + Quoted(className) + " is also the class of "
+			+ clash->second + "; rename that");
 	}
 }
 

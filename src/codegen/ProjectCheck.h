@@ -41,6 +41,7 @@ private:
 	void CheckFormFile(TDesignForm* form);
 	void CheckFormClasses(TDesignForm* form);
 	void CheckComponentNames(TDesignForm* form);
+	void CheckComponentClass(const TComponent* component);
 	void CheckHandlers(TDesignForm* form);
 	void CheckHandler(const TEvent& event, const std::string& name, const std::string& owner);
 	void CheckIdentifier(const char* name, const std::string& owner);

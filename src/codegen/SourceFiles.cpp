@@ -43,8 +43,13 @@ CreatePath(const char* path)
 	if (path == nullptr || path[0] == '\0')
 		return false;
 
-	BDirectory directory;
-	const status_t status = directory.CreateDirectory(path, nullptr);
+	BEntry entry(path);
+	BDirectory parent;
+	char name[B_FILE_NAME_LENGTH];
+	if (entry.GetParent(&parent) != B_OK || entry.GetName(name) != B_OK)
+		return false;
+
+	const status_t status = parent.CreateDirectory(name, nullptr);
 	return status == B_OK || status == B_FILE_EXISTS;
 }
 

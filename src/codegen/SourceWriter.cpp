@@ -43,7 +43,8 @@ ReplaceContent(const char* path, const char* content, size_t length, bool isNew)
 	mode_t permissions;
 	if (isNew && stream->GetPermissions(&permissions) == B_OK)
 		stream->SetPermissions(permissions & kSourcePermissions);
-	return replacement.Replace();
+	// Waiting for the disk would take longer than everything else that the generator does.
+	return replacement.Replace(REPLACE_UNSYNCED);
 }
 
 } // namespace

@@ -45,7 +45,6 @@ DescribeOptions(CLI::App& parser, command_line* line)
 			"load component libraries from this folder; may be given again"
 			" (default: Components beside the program)")
 		->type_name("DIR")
-		->expected(1)
 		->allow_extra_args(false)
 		->check(notEmpty);
 	parser.add_option("--main", line->mainForm, "make this form the main form")
