@@ -21,7 +21,7 @@
 #include <Messenger.h>
 #include <Node.h>
 
-#include "TemporaryFolder.h"
+#include "support/TemporaryFolder.h"
 
 namespace {
 
