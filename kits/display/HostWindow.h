@@ -48,7 +48,8 @@ public:
 	/// One of the messages below; coordinates are the API's pixels.
 	///
 	/// B_MOUSE_DOWN, B_MOUSE_UP, B_MOUSE_MOVED, B_MOUSE_WHEEL_CHANGED: "when", "screen_where", "where"
-	/// (window), "buttons", "modifiers"; "clicks" for down; "be:drag_message" while dragging;
+	/// (window), "buttons", "modifiers"; "clicks" for down, and "be:activates" (bool) when
+	/// that press made the window active; "be:drag_message" while dragging;
 	/// "be:wheel_delta_x" and "_y". A move with "be:transit" B_EXITED_VIEW says that the pointer left
 	/// the window. While a button is held its moves and its release go to the window of the press.
 	/// B_KEY_DOWN, B_KEY_UP, B_UNMAPPED_KEY_DOWN, B_UNMAPPED_KEY_UP, B_MODIFIERS_CHANGED: as in the API,

@@ -381,6 +381,7 @@ InputHub::Moved(StackedWindow* under)
 void
 InputHub::Pressed(StackedWindow* under, bool isFirst)
 {
+	StackedWindow* wasActive = fActive;
 	if (isFirst) {
 		fPressWindow = fGrabber != nullptr ? fGrabber : under;
 		if (under != nullptr && under->style.isMenu)
@@ -403,6 +404,8 @@ InputHub::Pressed(StackedWindow* under, bool isFirst)
 	fLastUnder = fPressWindow;
 	auto message = MakePointerMessage(B_MOUSE_DOWN, fPressWindow);
 	message->AddInt32("clicks", fClicks);
+	if (fActive == fPressWindow && fActive != wasActive)
+		message->AddBool("be:activates", true);
 	fPressWindow->client->Deliver(std::move(message));
 }
 
