@@ -144,7 +144,9 @@ WindowInput::MouseTarget(BMessage* message)
 		return fWindow;
 
 	ForwardToOtherWindows(*message, B_POINTER_EVENTS);
-	if (message->what == B_MOUSE_DOWN && ActivatesOnly())
+	// A press that made the window active does nothing else, unless the window takes first clicks.
+	if (message->GetBool("be:activates", false)
+		&& (fWindow->Flags() & B_WILL_ACCEPT_FIRST_CLICK) == 0)
 		return nullptr;
 
 	// The host says so when the pointer left: there may be another window on top.
@@ -175,20 +177,6 @@ WindowInput::MouseTarget(BMessage* message)
 	if (message->what == B_MOUSE_MOVED)
 		message->SetInt32("be:transit", primary.transit);
 	return primary.view;
-}
-
-
-// A press in an inactive window only activates it, unless the window takes first clicks or never has
-// the focus.
-bool
-WindowInput::ActivatesOnly()
-{
-	const WindowData& data = *fWindow->fData;
-	const uint32 kTakesClicks = B_WILL_ACCEPT_FIRST_CLICK | B_AVOID_FOCUS;
-	if (data.active || (data.flags & kTakesClicks) != 0 || data.Style().isMenu)
-		return false;
-	fWindow->Activate();
-	return true;
 }
 
 

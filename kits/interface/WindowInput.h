@@ -58,7 +58,6 @@ private:
 	};
 
 	BHandler* MouseTarget(BMessage* message);
-	bool ActivatesOnly();
 	bool TakeMouseMessage(BView* view, BPoint* where, uint32* buttons);
 	BHandler* KeyTarget(BMessage* message);
 	void ChooseMovedRecipients(BMessage* message, BView* under);

@@ -219,22 +219,6 @@ TEST_F(PointerTest, AViewHearsOfOtherWindowsToo)
 }
 
 
-TEST_F(PointerTest, AClickInAnInactiveWindowOnlyActivatesIt)
-{
-	fWindow->Lock();
-	fWindow->SetFlags(0);
-	fWindow->Unlock();
-	Post(B_MOUSE_DOWN, BPoint(50, 50), 1);
-	EXPECT_EQ(TakeLog(), Log());
-
-	BMessage activated(B_WINDOW_ACTIVATED);
-	activated.AddBool("active", true);
-	fWindow->PostMessage(&activated);
-	Post(B_MOUSE_DOWN, BPoint(50, 50), 1);
-	EXPECT_EQ(TakeLog(), (Log{"left down 50,50"}));
-}
-
-
 TEST_F(PointerTest, TheWheelGoesToTheViewUnderThePointer)
 {
 	Post(B_MOUSE_WHEEL_CHANGED, BPoint(15, 15));
