@@ -30,8 +30,8 @@ public:
 	}
 
 	/// Places a component of the class on \a parent, the form's surface when it is none.
-	TComponent* Place(const char* className, const char* name, BRect frame,
-		TComponent* parent = nullptr)
+	TComponent* Place(
+		const char* className, const char* name, BRect frame, TComponent* parent = nullptr)
 	{
 		PaletteCatalog().SetDropEntry(PaletteCatalog().FindPalEntry(className));
 		BView* view = parent != nullptr ? parent->DTView() : fForm->View();
@@ -40,6 +40,7 @@ public:
 		if (parent != nullptr)
 			dynamic_cast<TComponentOwner*>(parent)->AddComponent(component);
 		component->SetPropertyValue("Name", name);
+		component->SetPropertyValue("FontSize", "12");
 		return component;
 	}
 
@@ -87,21 +88,18 @@ DesignMainForm(TDesignForm* form)
 	Designer designer(form);
 	TComponent* greeting = designer.Place("TBox", "GreetingBox", BRect(12, 12, 348, 128));
 	greeting->SetPropertyValue("Label", "Greeting");
-	TComponent* name = designer.PlaceControl("TTextControl", "NameField", BRect(12, 26, 324, 50),
-		"Your name:", "OnChange", greeting);
+	TComponent* name = designer.PlaceControl(
+		"TTextControl", "NameField", BRect(12, 26, 324, 50), "Your name:", "OnChange", greeting);
 	name->SetPropertyValue("Divider", "90");
 	designer.PlaceControl(
 		"TCheckBox", "ShoutBox", BRect(12, 58, 150, 78), "Shout", "OnChange", greeting);
 	designer.PlaceText("GreetingText", BRect(12, 84, 324, 106), "Hello!", greeting);
 
-	designer.PlaceControl(
-		"TButton", "CountButton", BRect(12, 144, 112, 172), "Count", "OnClick");
+	designer.PlaceControl("TButton", "CountButton", BRect(12, 144, 112, 172), "Count", "OnClick");
 	designer.PlaceText("CountText", BRect(128, 144, 348, 166), "No clicks yet");
 	designer.PlaceControl("TButton", "NoteButton", BRect(12, 184, 112, 212), "Note...", "OnClick");
 	designer.PlaceText("NoteText", BRect(128, 184, 348, 206), "Opens another form");
-	TComponent* quit
-		= designer.PlaceControl("TButton", "QuitButton", BRect(248, 236, 348, 264), "Quit", "OnClick");
-	quit->SetPropertyValue("Default", "false");
+	designer.PlaceControl("TButton", "QuitButton", BRect(248, 236, 348, 264), "Quit", "OnClick");
 }
 
 
@@ -139,8 +137,9 @@ Design(const char* components, const char* folder)
 	app->SetPropertyValue("Signature", "application/x-vnd.Plimworks-Hello");
 	app->SetPropertyValue("GenerationPath", ".");
 
-	TDesignForm* mainForm = project.NewForm();
+	// Without the file's attribute, which a checkout does not have, the last form is the main form.
 	TDesignForm* noteForm = project.NewForm();
+	TDesignForm* mainForm = project.NewForm();
 	DesignMainForm(mainForm);
 	DesignNoteForm(noteForm);
 	mainForm->SetFilename("MainForm.frm");
