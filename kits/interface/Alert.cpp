@@ -3,6 +3,7 @@
 #include <Alert.h>
 
 #include <algorithm>
+#include <atomic>
 #include <cmath>
 
 #include <Application.h>
@@ -79,6 +80,20 @@ private:
 
 } // namespace
 
+/// What the thread in Go() waits for. The alert ends it, at the latest with itself.
+struct BAlert::Outcome {
+	Outcome()
+		: ended(create_sem(0, "alert ended")),
+		  answer(-1)
+	{
+	}
+	~Outcome() { delete_sem(ended); }
+
+	const sem_id ended;
+	std::atomic<int32> answer;
+};
+
+
 BAlert::BAlert()
 	: BAlert("", "", NULL)
 {
@@ -103,8 +118,7 @@ BAlert::BAlert(const char* title, const char* text, const char* button1, const c
 	  fButtons(),
 	  fShortcuts(),
 	  fInvoker(NULL),
-	  fAnswered(-1),
-	  fAnswer(NULL)
+	  fAnswered(false)
 {
 	const char* const labels[kMostButtons] = {button1, button2, button3};
 	Build(text, labels);
@@ -120,8 +134,7 @@ BAlert::BAlert(BMessage* archive)
 	  fButtons(),
 	  fShortcuts(),
 	  fInvoker(NULL),
-	  fAnswered(-1),
-	  fAnswer(NULL)
+	  fAnswered(false)
 {
 	int32 number;
 	if (archive->FindInt32("_atype", &number) == B_OK && number >= B_EMPTY_ALERT
@@ -131,7 +144,8 @@ BAlert::BAlert(BMessage* archive)
 		fButtonWidth = static_cast<button_width>(number);
 	const char* labels[kMostButtons] = {NULL, NULL, NULL};
 	for (int32 i = 0; i < kMostButtons; i++) {
-		archive->FindString("_but_label", i, &labels[i]);
+		if (archive->FindString("_but_label", i, &labels[i]) != B_OK)
+			labels[i] = NULL;
 		if (archive->FindInt32("_but_key", i, &number) == B_OK)
 			fShortcuts[i] = static_cast<char>(number);
 	}
@@ -141,9 +155,9 @@ BAlert::BAlert(BMessage* archive)
 
 BAlert::~BAlert()
 {
-	// Whoever waits has its answer, or the alert was closed without one.
-	if (fAnswered >= 0)
-		delete_sem(fAnswered);
+	// Whoever waits has its answer, or the alert was ended without one.
+	if (fOutcome != NULL)
+		release_sem(fOutcome->ended);
 }
 
 
@@ -279,29 +293,26 @@ BAlert::Shortcut(int32 buttonIndex) const
 int32
 BAlert::Go()
 {
-	int32 answer = -1;
-	const sem_id answered = create_sem(0, "alert answered");
-	if (answered < B_OK)
-		return answer;
-	fAnswer = &answer;
-	fAnswered = answered;
-	Place();
+	const auto outcome = std::make_shared<Outcome>();
+	if (outcome->ended < B_OK)
+		return -1;
+	fOutcome = outcome;
+	Prepare();
 	Show();
 
-	// From here on the alert deletes itself, and with it the semaphore.
+	// From here on the alert is its own thread's, and may be gone already.
 	BWindow* caller = dynamic_cast<BWindow*>(BLooper::LooperForThread(find_thread(NULL)));
-	if (caller == NULL) {
-		while (acquire_sem(answered) == B_INTERRUPTED) {
-		}
-		return answer;
-	}
+	const uint32 flags = caller != NULL ? B_RELATIVE_TIMEOUT : 0;
 	status_t status;
 	do {
-		status = acquire_sem_etc(answered, 1, B_RELATIVE_TIMEOUT, kRepaintInterval);
-		if (status == B_TIMED_OUT)
+		status = acquire_sem_etc(
+			outcome->ended, 1, flags, caller != NULL ? kRepaintInterval : B_INFINITE_TIMEOUT);
+		if (status == B_TIMED_OUT && caller->LockWithTimeout(0) == B_OK) {
 			caller->UpdateIfNeeded();
-	} while (status == B_TIMED_OUT || status == B_INTERRUPTED);
-	return answer;
+			caller->Unlock();
+		}
+	} while (status == B_TIMED_OUT || status == B_WOULD_BLOCK || status == B_INTERRUPTED);
+	return outcome->answer;
 }
 
 
@@ -309,7 +320,7 @@ status_t
 BAlert::Go(BInvoker* invoker)
 {
 	fInvoker = invoker;
-	Place();
+	Prepare();
 	Show();
 	return B_OK;
 }
@@ -345,20 +356,41 @@ BAlert::Build(const char* text, const char* const labels[kMostButtons])
 	fTextView->MakeSelectable(false);
 	fTextView->SetText(text);
 
-	BButton* last = NULL;
 	for (int32 i = 0; i < kMostButtons; i++) {
-		if (labels[i] == NULL || *labels[i] == '\0')
-			continue;
-		BMessage* pressed = new BMessage(kMsgAnswer);
-		pressed->AddInt32("which", i);
-		last = new BButton(BRect(0, 0, 10, 10), "_b_", labels[i], pressed);
-		fButtons[i] = last;
-		background->AddChild(last);
-		last->SetTarget(this);
+		if (labels[i] != NULL && *labels[i] != '\0')
+			AddButton(labels[i]);
 	}
-	if (last != NULL)
-		last->MakeDefault(true);
 	LayOut();
+}
+
+
+/// Puts a button to the right of the others; it becomes the default one.
+void
+BAlert::AddButton(const char* label)
+{
+	int32 index = 0;
+	while (fButtons[index] != NULL)
+		index++;
+	BMessage* pressed = new BMessage(kMsgAnswer);
+	pressed->AddInt32("which", index);
+	BButton* button = new BButton(BRect(0, 0, 10, 10), "_b_", label, pressed);
+	button->SetTarget(this);
+	ChildAt(0)->AddChild(button);
+	button->MakeDefault(true);
+	fButtons[index] = button;
+}
+
+
+/// The last things before the alert is shown.
+void
+BAlert::Prepare()
+{
+	if (fButtons[0] == NULL) {
+		AddButton("OK");
+		LayOut();
+	}
+	DefaultButton()->MakeFocus(true);
+	Place();
 }
 
 
@@ -406,13 +438,10 @@ BAlert::LayOut()
 	const float top = kMargin + textHeight + kMargin;
 	ResizeTo(width, top + height + kMargin);
 	float right = width - kMargin;
-	int32 left = 0;
-	while (left < kMostButtons && fButtons[left] == NULL)
-		left++;
 	for (int32 i = kMostButtons - 1; i >= 0; i--) {
 		if (fButtons[i] == NULL)
 			continue;
-		if (i == left && fSpacing == B_OFFSET_SPACING)
+		if (i == 0 && fSpacing == B_OFFSET_SPACING)
 			right -= kOffsetGap;
 		float preferred;
 		fButtons[i]->GetPreferredSize(NULL, &preferred);
@@ -444,18 +473,16 @@ BAlert::Place()
 void
 BAlert::Answer(int32 index)
 {
-	if (fAnswer != NULL) {
-		*fAnswer = index;
-		fAnswer = NULL;
-	} else if (fInvoker != NULL) {
-		BMessage* message = fInvoker->Message();
-		if (message != NULL) {
-			BMessage answer(*message);
-			answer.AddInt32("which", index);
-			fInvoker->Invoke(&answer);
-		}
-		fInvoker = NULL;
-	} else if (fAnswered >= 0)
+	if (fAnswered)
 		return;
+	fAnswered = true;
+
+	if (fOutcome != NULL)
+		fOutcome->answer = index;
+	else if (fInvoker != NULL && fInvoker->Message() != NULL) {
+		BMessage answer(*fInvoker->Message());
+		answer.AddInt32("which", index);
+		fInvoker->Invoke(&answer);
+	}
 	PostMessage(B_QUIT_REQUESTED);
 }

@@ -75,7 +75,7 @@ BBox::Archive(BMessage* archive, bool deep) const
 	status_t status = BView::Archive(archive, deep);
 	if (status == B_OK && !fLabel.IsEmpty())
 		status = archive->AddString("_label", fLabel);
-	if (status == B_OK && fLabelView != NULL)
+	if (status == B_OK && LabelView() != NULL)
 		status = archive->AddBool("_lblview", true);
 	if (status == B_OK)
 		status = archive->AddInt32("_style", fBorder);
@@ -166,8 +166,10 @@ BBox::Border() const
 void
 BBox::SetLabel(const char* string)
 {
+	// The text may be the present one's.
+	const BString label(string);
 	ClearLabel();
-	fLabel = string;
+	fLabel = label;
 	if (Window() != NULL)
 		Invalidate();
 }
@@ -176,6 +178,10 @@ BBox::SetLabel(const char* string)
 status_t
 BBox::SetLabel(BView* viewLabel)
 {
+	if (viewLabel != NULL && viewLabel == LabelView())
+		return B_OK;
+	if (viewLabel != NULL && viewLabel->Parent() != NULL)
+		return B_BAD_VALUE;
 	ClearLabel();
 	if (viewLabel != NULL) {
 		fLabelView = viewLabel;
@@ -198,7 +204,12 @@ BBox::Label() const
 BView*
 BBox::LabelView() const
 {
-	return fLabelView;
+	// It may have been removed, and even deleted, like any other child.
+	for (BView* child = ChildAt(0); child != NULL; child = child->NextSibling()) {
+		if (child == fLabelView)
+			return fLabelView;
+	}
+	return NULL;
 }
 
 
@@ -223,11 +234,12 @@ void
 BBox::ClearLabel()
 {
 	fLabel = "";
-	if (fLabelView == NULL)
-		return;
-	fLabelView->RemoveSelf();
-	delete fLabelView;
+	BView* labelView = LabelView();
 	fLabelView = NULL;
+	if (labelView == NULL)
+		return;
+	labelView->RemoveSelf();
+	delete labelView;
 }
 
 
@@ -235,8 +247,9 @@ BBox::ClearLabel()
 float
 BBox::LabelHeight() const
 {
-	if (fLabelView != NULL)
-		return fLabelView->Bounds().Height();
+	const BView* labelView = LabelView();
+	if (labelView != NULL)
+		return labelView->Bounds().Height();
 	if (fLabel.IsEmpty())
 		return 0;
 	font_height height;

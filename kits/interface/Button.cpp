@@ -46,7 +46,11 @@ BButton::BButton(BMessage* archive)
 }
 
 
-BButton::~BButton() {}
+BButton::~BButton()
+{
+	// As long as this is a button: the window tells its default button that it is none any more.
+	RemoveSelf();
+}
 
 
 BArchivable*
@@ -73,8 +77,8 @@ BButton::Draw(BRect)
 	if (fDefault)
 		frame.InsetBy(kDefaultInset, kDefaultInset);
 	const bool focused = IsFocus() && Window()->IsActive();
-	BPrivate::DrawButtonSurface(
-		this, frame, {IsEnabled(), focused, Value() != B_CONTROL_OFF}, fDefault);
+	const BPrivate::ControlState state = {IsEnabled(), focused, Value() != B_CONTROL_OFF};
+	BPrivate::DrawButtonSurface(this, frame, state, fDefault);
 	if (Label() == NULL)
 		return;
 
@@ -83,7 +87,7 @@ BButton::Draw(BRect)
 	BString label(Label());
 	TruncateString(&label, B_TRUNCATE_END, frame.Width() - 6);
 	const float width = StringWidth(label.String());
-	SetHighColor(BPrivate::ControlTextColor(IsEnabled(), LowColor()));
+	SetHighColor(BPrivate::ControlTextColor(IsEnabled(), BPrivate::ButtonSurfaceColor(state)));
 	SetDrawingMode(B_OP_OVER);
 	DrawString(label.String(),
 		BPoint(std::floor((frame.left + frame.right - width) / 2 + 0.5f),
@@ -109,10 +113,12 @@ BButton::MouseUp(BPoint where)
 	if (!IsTracking())
 		return;
 	SetTracking(false);
-	const bool inside = Bounds().Contains(where);
-	if (inside)
+	// What is sent may have the button deleted: nothing comes after it.
+	if (IsEnabled() && Bounds().Contains(where)) {
+		SetValue(B_CONTROL_ON);
 		Invoke();
-	SetValue(B_CONTROL_OFF);
+	} else
+		SetValue(B_CONTROL_OFF);
 }
 
 
@@ -136,8 +142,7 @@ BButton::AttachedToWindow()
 void
 BButton::DetachedFromWindow()
 {
-	if (Window()->DefaultButton() == this)
-		Window()->SetDefaultButton(NULL);
+	SetValue(B_CONTROL_OFF);
 	BControl::DetachedFromWindow();
 }
 
@@ -145,12 +150,14 @@ BButton::DetachedFromWindow()
 void
 BButton::KeyDown(const char* bytes, int32 numBytes)
 {
-	if (bytes[0] != B_ENTER && bytes[0] != B_SPACE) {
+	if (numBytes != 1 || (bytes[0] != B_ENTER && bytes[0] != B_SPACE)) {
 		BView::KeyDown(bytes, numBytes);
 		return;
 	}
-	if (IsEnabled())
-		Invoke();
+	if (!IsEnabled())
+		return;
+	SetValue(B_CONTROL_ON);
+	Invoke();
 }
 
 
@@ -174,13 +181,16 @@ BButton::GetPreferredSize(float* _width, float* _height)
 status_t
 BButton::Invoke(BMessage* message)
 {
-	return BControl::Invoke(message);
+	const status_t status = BControl::Invoke(message);
+	SetValue(B_CONTROL_OFF);
+	return status;
 }
 
 
 void
 BButton::MakeDefault(bool flag)
 {
+	// The window calls this, too, when it is told: the second call has nothing left to do.
 	if (flag == fDefault)
 		return;
 	const float grow = flag ? kDefaultInset : -kDefaultInset;

@@ -2,40 +2,20 @@
 
 #include <CheckBox.h>
 
-#include <algorithm>
-#include <cmath>
-
 #include <Window.h>
 
 #include "ControlLook.h"
 
-namespace {
-
-// The side of the box, right minus left, and the space between box and label.
-constexpr float kBoxSize = 12;
-constexpr float kLabelGap = 6;
-
-BRect
-BoxFrame(const BView* view)
-{
-	const BRect bounds = view->Bounds();
-	const float top = std::floor((bounds.Height() - kBoxSize) / 2 + 0.5f);
-	return BRect(
-		bounds.left + 1, bounds.top + top, bounds.left + 1 + kBoxSize, bounds.top + top + kBoxSize);
-}
-
-} // namespace
-
 BCheckBox::BCheckBox(BRect frame, const char* name, const char* label, BMessage* message,
 	uint32 resizingMode, uint32 flags)
-	: BControl(frame, name, label, message, resizingMode, flags),
+	: BControl(frame, name, label, message, resizingMode, flags | B_FULL_UPDATE_ON_RESIZE),
 	  fPressed(false)
 {
 }
 
 
 BCheckBox::BCheckBox(const char* name, const char* label, BMessage* message, uint32 flags)
-	: BControl(name, label, message, flags),
+	: BControl(name, label, message, flags | B_FULL_UPDATE_ON_RESIZE),
 	  fPressed(false)
 {
 }
@@ -68,21 +48,19 @@ void
 BCheckBox::Draw(BRect)
 {
 	const BPrivate::ControlState state = {IsEnabled(), IsFocus() && Window()->IsActive(), fPressed};
-	const BRect box = BoxFrame(this);
+	const BRect box = BPrivate::MarkFrame(this);
 	BPrivate::DrawFieldSurface(this, box, state);
 	if (Value() != B_CONTROL_OFF)
 		BPrivate::DrawTick(this, box, state, Value() == B_CONTROL_PARTIALLY_ON);
-	if (Label() == NULL)
-		return;
+	BPrivate::DrawMarkLabel(this, Label(), IsEnabled());
+}
 
-	font_height height;
-	GetFontHeight(&height);
-	SetHighColor(BPrivate::ControlTextColor(IsEnabled(), LowColor()));
-	SetDrawingMode(B_OP_OVER);
-	DrawString(Label(),
-		BPoint(box.right + kLabelGap,
-			std::floor((box.top + box.bottom + height.ascent - height.descent) / 2 + 0.5f)));
-	SetDrawingMode(B_OP_COPY);
+
+void
+BCheckBox::DetachedFromWindow()
+{
+	fPressed = false;
+	BControl::DetachedFromWindow();
 }
 
 
@@ -106,7 +84,7 @@ BCheckBox::MouseUp(BPoint where)
 	SetTracking(false);
 	fPressed = false;
 	Invalidate();
-	if (Bounds().Contains(where))
+	if (IsEnabled() && Bounds().Contains(where))
 		Toggle();
 }
 
@@ -127,7 +105,7 @@ BCheckBox::MouseMoved(BPoint where, uint32, const BMessage*)
 void
 BCheckBox::KeyDown(const char* bytes, int32 numBytes)
 {
-	if (bytes[0] != B_ENTER && bytes[0] != B_SPACE) {
+	if (numBytes != 1 || (bytes[0] != B_ENTER && bytes[0] != B_SPACE)) {
 		BView::KeyDown(bytes, numBytes);
 		return;
 	}
@@ -139,14 +117,7 @@ BCheckBox::KeyDown(const char* bytes, int32 numBytes)
 void
 BCheckBox::GetPreferredSize(float* _width, float* _height)
 {
-	font_height height;
-	GetFontHeight(&height);
-	const float label = Label() != NULL ? kLabelGap + std::ceil(StringWidth(Label())) : 0;
-	if (_width != NULL)
-		*_width = 1 + kBoxSize + label + 1;
-	if (_height != NULL) {
-		*_height = std::max(kBoxSize + 2, std::ceil(height.ascent) + std::ceil(height.descent) + 2);
-	}
+	BPrivate::GetMarkSize(this, Label(), _width, _height);
 }
 
 
@@ -163,5 +134,6 @@ void
 BCheckBox::Toggle()
 {
 	SetValue(Value() == B_CONTROL_ON ? B_CONTROL_OFF : B_CONTROL_ON);
+	// What is sent may have the box deleted: nothing comes after it.
 	Invoke();
 }

@@ -44,8 +44,12 @@ BControl::BControl(BMessage* archive)
 	archive->FindString("_label", &fLabel);
 	archive->FindInt32("_val", &fValue);
 	bool disabled = false;
-	if (archive->FindBool("_disable", &disabled) == B_OK && disabled)
-		BControl::SetEnabled(false);
+	if (archive->FindBool("_disable", &disabled) == B_OK && disabled) {
+		fEnabled = false;
+		// The archived flags are those of a disabled control.
+		fWantsNavigation = true;
+		BView::SetFlags(Flags() & ~B_NAVIGABLE);
+	}
 }
 
 
@@ -140,7 +144,7 @@ BControl::MakeFocus(bool focus)
 void
 BControl::KeyDown(const char* bytes, int32 numBytes)
 {
-	if (!fEnabled || (bytes[0] != B_ENTER && bytes[0] != B_SPACE)) {
+	if (!fEnabled || numBytes != 1 || (bytes[0] != B_ENTER && bytes[0] != B_SPACE)) {
 		BView::KeyDown(bytes, numBytes);
 		return;
 	}
@@ -187,7 +191,7 @@ BControl::ResizeToPreferred()
 void
 BControl::SetLabel(const char* string)
 {
-	if (fLabel == string)
+	if (fLabel == (string != NULL ? string : ""))
 		return;
 	fLabel = string;
 	if (Window() != NULL)
@@ -229,7 +233,8 @@ BControl::SetEnabled(bool enabled)
 
 	if (!enabled) {
 		fWantsNavigation = (Flags() & B_NAVIGABLE) != 0;
-		SetFlags(Flags() & ~B_NAVIGABLE);
+		if (fWantsNavigation)
+			SetFlags(Flags() & ~B_NAVIGABLE);
 		if (IsFocus())
 			MakeFocus(false);
 	} else if (fWantsNavigation)
@@ -250,16 +255,27 @@ BControl::IsEnabled() const
 status_t
 BControl::Invoke(BMessage* message)
 {
-	const BMessage* model = message != NULL ? message : Message();
-	if (model == NULL)
+	bool notify;
+	const uint32 kind = InvokeKind(&notify);
+	if (message == NULL && !notify)
+		message = Message();
+	if (message == NULL && !IsWatched())
 		return B_BAD_VALUE;
 
-	BMessage copy(*model);
+	BMessage copy(kind);
+	if (message != NULL)
+		copy = *message;
 	copy.AddInt64("when", system_time());
 	copy.AddPointer("source", this);
 	copy.AddInt32("be:value", fValue);
 	copy.AddMessenger("be:sender", BMessenger(this));
-	return BInvoker::Invoke(&copy);
+
+	// Not by BInvoker::Invoke(), which would add fields of its own, with the invoker as the source.
+	status_t status = B_BAD_VALUE;
+	if (message != NULL)
+		status = Messenger().SendMessage(&copy, HandlerForReply(), Timeout());
+	SendNotices(kind, &copy);
+	return status;
 }
 
 

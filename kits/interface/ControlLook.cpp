@@ -1,10 +1,13 @@
 // SPDX-License-Identifier: MIT
+// The look of controls in the window's own pixels.
 
 #include "ControlLook.h"
 
 #include <algorithm>
+#include <cmath>
 
 #include <InterfaceDefs.h>
+#include <String.h>
 #include <View.h>
 #include <Window.h>
 
@@ -15,11 +18,15 @@ namespace {
 constexpr float kButtonRadius = 3;
 constexpr float kDisabledStrength = 0.45f;
 
+// The side of a mark's square, right minus left, and the space between the mark and its label.
+constexpr float kMarkSize = 12;
+constexpr float kMarkGap = 6;
+
 void
-StrokeRoundFrame(BView* view, BRect frame, rgb_color color)
+StrokeRoundFrame(BView* view, BRect frame, float radius, rgb_color color)
 {
 	view->SetHighColor(color);
-	view->StrokeRoundRect(frame, kButtonRadius, kButtonRadius);
+	view->StrokeRoundRect(frame, radius, radius);
 }
 
 
@@ -29,8 +36,14 @@ BorderColor(ControlState state)
 	if (state.enabled && state.focused)
 		return ui_color(B_KEYBOARD_NAVIGATION_COLOR);
 	const rgb_color border = tint_color(ui_color(B_CONTROL_BORDER_COLOR), B_DARKEN_2_TINT);
-	const rgb_color panel = ui_color(B_PANEL_BACKGROUND_COLOR);
-	return state.enabled ? border : BlendColors(panel, border, kDisabledStrength);
+	return StrengthOf(state.enabled, border, ui_color(B_PANEL_BACKGROUND_COLOR));
+}
+
+
+rgb_color
+MarkColor(ControlState state)
+{
+	return StrengthOf(state.enabled, ui_color(B_CONTROL_MARK_COLOR), FieldColor(state));
 }
 
 } // namespace
@@ -52,50 +65,69 @@ BlendColors(rgb_color under, rgb_color over, float amount)
 
 
 rgb_color
+StrengthOf(bool enabled, rgb_color color, rgb_color background)
+{
+	return enabled ? color : BlendColors(background, color, kDisabledStrength);
+}
+
+
+rgb_color
 ControlTextColor(bool enabled, rgb_color background)
 {
-	const rgb_color text = ui_color(B_PANEL_TEXT_COLOR);
-	return enabled ? text : BlendColors(background, text, kDisabledStrength);
+	rgb_color text = ui_color(B_PANEL_TEXT_COLOR);
+	// On a background of its own kind the system's text could not be read.
+	if (text.IsDark() == background.IsDark())
+		text = background.IsDark() ? make_color(255, 255, 255) : make_color(0, 0, 0);
+	return StrengthOf(enabled, text, background);
+}
+
+
+rgb_color
+ButtonSurfaceColor(ControlState state)
+{
+	const rgb_color surface = ui_color(B_CONTROL_BACKGROUND_COLOR);
+	if (!state.enabled)
+		return BlendColors(
+			ui_color(B_PANEL_BACKGROUND_COLOR), tint_color(surface, 0.5f), kDisabledStrength);
+	return state.pressed ? tint_color(surface, B_DARKEN_2_TINT) : tint_color(surface, 0.5f);
+}
+
+
+rgb_color
+FieldColor(ControlState state)
+{
+	const rgb_color surface = ui_color(B_DOCUMENT_BACKGROUND_COLOR);
+	if (!state.enabled)
+		return BlendColors(ui_color(B_PANEL_BACKGROUND_COLOR), surface, kDisabledStrength);
+	return state.pressed ? tint_color(surface, B_DARKEN_1_TINT) : surface;
 }
 
 
 void
 DrawButtonSurface(BView* view, BRect frame, ControlState state, bool isDefault)
 {
-	const rgb_color outside = view->LowColor();
-	const rgb_color panel = ui_color(B_PANEL_BACKGROUND_COLOR);
-	view->SetHighColor(outside);
-	view->FillRect(view->Bounds());
-
 	if (isDefault) {
-		const rgb_color mark =
-			BlendColors(outside, BorderColor({state.enabled, false, false}), 0.5f);
-		StrokeRoundFrame(view, view->Bounds().InsetByCopy(1, 1), mark);
+		const rgb_color mark = BorderColor({state.enabled, false, false});
+		const BRect around = view->Bounds();
+		StrokeRoundFrame(view, around, kButtonRadius + 2, mark);
+		StrokeRoundFrame(view, around.InsetByCopy(1, 1), kButtonRadius + 1,
+			BlendColors(view->LowColor(), mark, 0.35f));
 	}
 
-	rgb_color surface =
-		tint_color(ui_color(B_CONTROL_BACKGROUND_COLOR), B_DARKEN_1_TINT / 2 + 0.5f);
-	if (!state.enabled)
-		surface = BlendColors(panel, surface, kDisabledStrength);
-	if (state.pressed)
-		surface = tint_color(panel, B_DARKEN_2_TINT);
-	view->SetHighColor(surface);
+	view->SetHighColor(ButtonSurfaceColor(state));
 	view->FillRoundRect(frame, kButtonRadius, kButtonRadius);
-	StrokeRoundFrame(view, frame, BorderColor(state));
-	if (state.enabled && state.focused)
-		StrokeRoundFrame(view, frame.InsetByCopy(1, 1), BorderColor(state));
+	StrokeRoundFrame(view, frame, kButtonRadius, BorderColor(state));
+	if (state.enabled && state.focused) {
+		const rgb_color ring = BlendColors(ButtonSurfaceColor(state), BorderColor(state), 0.5f);
+		StrokeRoundFrame(view, frame.InsetByCopy(1, 1), kButtonRadius - 1, ring);
+	}
 }
 
 
 void
 DrawFieldSurface(BView* view, BRect frame, ControlState state)
 {
-	rgb_color surface = ui_color(B_DOCUMENT_BACKGROUND_COLOR);
-	if (!state.enabled)
-		surface = BlendColors(ui_color(B_PANEL_BACKGROUND_COLOR), surface, kDisabledStrength);
-	if (state.pressed)
-		surface = tint_color(surface, B_DARKEN_1_TINT);
-	view->SetHighColor(surface);
+	view->SetHighColor(FieldColor(state));
 	view->FillRect(frame);
 	view->SetHighColor(BorderColor(state));
 	view->StrokeRect(frame);
@@ -103,12 +135,24 @@ DrawFieldSurface(BView* view, BRect frame, ControlState state)
 
 
 void
+DrawRoundField(BView* view, BRect frame, ControlState state, bool on)
+{
+	view->SetHighColor(FieldColor(state));
+	view->FillEllipse(frame);
+	view->SetHighColor(BorderColor(state));
+	view->StrokeEllipse(frame);
+	if (!on)
+		return;
+	view->SetHighColor(MarkColor(state));
+	view->FillEllipse(frame.InsetByCopy(3, 3));
+}
+
+
+void
 DrawTick(BView* view, BRect frame, ControlState state, bool partly)
 {
-	const rgb_color mark = ui_color(B_CONTROL_MARK_COLOR);
-	view->SetHighColor(
-		state.enabled ? mark : BlendColors(view->LowColor(), mark, kDisabledStrength));
-	const float third = frame.Width() / 3;
+	view->SetHighColor(MarkColor(state));
+	const float third = std::floor(frame.Width() / 3);
 	if (partly) {
 		view->FillRect(BRect(
 			frame.left + 3, frame.top + third + 1, frame.right - 3, frame.bottom - third - 1));
@@ -116,19 +160,66 @@ DrawTick(BView* view, BRect frame, ControlState state, bool partly)
 	}
 	view->SetPenSize(2);
 	const BPoint corner(frame.left + third + 1, frame.bottom - 3);
-	view->StrokeLine(BPoint(frame.left + 3, frame.bottom - third - 1), corner);
+	view->StrokeLine(BPoint(frame.left + 3, frame.bottom - third - 2), corner);
 	view->StrokeLine(corner, BPoint(frame.right - 3, frame.top + 3));
 	view->SetPenSize(1);
+}
+
+
+BRect
+MarkFrame(const BView* view)
+{
+	const BRect bounds = view->Bounds();
+	const float top = bounds.top + std::floor((bounds.Height() - kMarkSize) / 2 + 0.5f);
+	return BRect(bounds.left + 1, top, bounds.left + 1 + kMarkSize, top + kMarkSize);
+}
+
+
+void
+DrawMarkLabel(BView* view, const char* label, bool enabled)
+{
+	if (label == nullptr)
+		return;
+
+	const BRect mark = MarkFrame(view);
+	const float left = mark.right + kMarkGap;
+	BString text(label);
+	// A fraction of a pixel that is missing cuts nothing.
+	if (view->StringWidth(label) > view->Bounds().right - left + 1)
+		view->TruncateString(&text, B_TRUNCATE_END, view->Bounds().right - left);
+
+	font_height height;
+	view->GetFontHeight(&height);
+	const float middle = (mark.top + mark.bottom) / 2;
+	view->SetHighColor(ControlTextColor(enabled, view->LowColor()));
+	view->SetDrawingMode(B_OP_OVER);
+	view->DrawString(text.String(),
+		BPoint(left, std::floor(middle + (height.ascent - height.descent) / 2 + 0.5f)));
+	view->SetDrawingMode(B_OP_COPY);
+}
+
+
+void
+GetMarkSize(const BView* view, const char* label, float* _width, float* _height)
+{
+	font_height height;
+	view->GetFontHeight(&height);
+	const float space = label != nullptr ? kMarkGap + std::ceil(view->StringWidth(label)) : 0;
+	if (_width != nullptr)
+		*_width = 1 + kMarkSize + space + 1;
+	if (_height != nullptr)
+		*_height =
+			std::max(kMarkSize + 2, std::ceil(height.ascent) + std::ceil(height.descent) + 2);
 }
 
 
 void
 AdoptParentColors(BView* view)
 {
-	const rgb_color color = view->Parent() != nullptr ? view->Parent()->ViewColor()
-													  : ui_color(B_PANEL_BACKGROUND_COLOR);
-	if (color == B_TRANSPARENT_COLOR)
-		return;
+	rgb_color color = ui_color(B_PANEL_BACKGROUND_COLOR);
+	// A parent that paints all itself tells nothing about its colour.
+	if (view->Parent() != nullptr && view->Parent()->ViewColor() != B_TRANSPARENT_COLOR)
+		color = view->Parent()->ViewColor();
 	view->SetViewColor(color);
 	view->SetLowColor(color);
 }

@@ -14,6 +14,10 @@ namespace {
 
 // Between the control's edges (and the divider) and the text.
 constexpr float kInset = 2;
+// Between the label's end and the field.
+constexpr float kLabelGap = 4;
+// Between the text view's edges and the text.
+constexpr float kTextMargin = 2;
 
 } // namespace
 
@@ -103,8 +107,9 @@ void
 BTextControl::AttachedToWindow()
 {
 	BControl::AttachedToWindow();
-	fInput->SetViewColor(ui_color(B_DOCUMENT_BACKGROUND_COLOR));
-	fInput->SetLowColor(fInput->ViewColor());
+	// As long as it was not attached, a new size did not reach it.
+	LayOutField();
+	UpdateInput();
 }
 
 
@@ -122,8 +127,10 @@ BTextControl::Draw(BRect)
 	font_height height;
 	GetFontHeight(&height);
 	BString label(Label());
-	const float width = fDivider - 2 * kInset;
-	TruncateString(&label, B_TRUNCATE_END, width);
+	const float width = fDivider - kLabelGap;
+	// A fraction of a pixel that is missing cuts nothing.
+	if (StringWidth(label.String()) > width + 1)
+		TruncateString(&label, B_TRUNCATE_END, width);
 	float left = bounds.left;
 	if (fLabelAlignment != B_ALIGN_LEFT) {
 		const float space = width - StringWidth(label.String());
@@ -131,7 +138,8 @@ BTextControl::Draw(BRect)
 	}
 	SetHighColor(BPrivate::ControlTextColor(IsEnabled(), LowColor()));
 	SetDrawingMode(B_OP_OVER);
-	DrawString(label.String(), BPoint(left, fInput->Frame().top + std::ceil(height.ascent)));
+	DrawString(label.String(),
+		BPoint(left, fInput->Frame().top + fInput->TextRect().top + std::ceil(height.ascent)));
 	SetDrawingMode(B_OP_COPY);
 }
 
@@ -166,8 +174,8 @@ void
 BTextControl::GetPreferredSize(float* _width, float* _height)
 {
 	if (_width != NULL) {
-		const float label = Label() != NULL ? std::ceil(StringWidth(Label())) + 2 * kInset : 0;
-		*_width = label + std::ceil(StringWidth(Text())) + 2 * kInset + 40;
+		const float label = Label() != NULL ? std::ceil(StringWidth(Label())) + kLabelGap : 0;
+		*_width = label + std::ceil(StringWidth(Text())) + 2 * (kInset + kTextMargin) + 40;
 	}
 	if (_height != NULL)
 		*_height = NeededHeight();
@@ -190,6 +198,8 @@ BTextControl::SetText(const char* text)
 {
 	fInput->SetText(text);
 	fCommittedText = fInput->Text();
+	if (fInput->IsFocus())
+		fInput->SelectAll();
 }
 
 
@@ -282,26 +292,20 @@ BTextControl::SetEnabled(bool enable)
 {
 	if (enable == IsEnabled())
 		return;
-	fInput->MakeEditable(enable);
-	fInput->MakeSelectable(enable);
+	BControl::SetEnabled(enable);
+	UpdateInput();
+	// Last: what was changed is sent with this.
 	if (!enable && fInput->IsFocus())
 		fInput->MakeFocus(false);
-	const uint32 navigable = enable && fWantsInputNavigation ? B_NAVIGABLE : 0;
-	fInput->SetFlags((fInput->Flags() & ~B_NAVIGABLE) | navigable);
-	BControl::SetEnabled(enable);
-	if (fInput->Window() != NULL)
-		fInput->Invalidate();
 }
 
 
 void
 BTextControl::SetFlags(uint32 flags)
 {
-	if (fInput != NULL) {
-		fWantsInputNavigation = (flags & B_NAVIGABLE) != 0;
-		const uint32 navigable = IsEnabled() && fWantsInputNavigation ? B_NAVIGABLE : 0;
-		fInput->SetFlags((fInput->Flags() & ~B_NAVIGABLE) | navigable);
-	}
+	fWantsInputNavigation = (flags & B_NAVIGABLE) != 0;
+	if (fInput != NULL)
+		UpdateInput();
 	BControl::SetFlags(flags & ~B_NAVIGABLE);
 }
 
@@ -317,12 +321,28 @@ void
 BTextControl::Build(const char* text)
 {
 	ResizeTo(Bounds().Width(), NeededHeight());
+	BControl::SetFlags((Flags() & ~B_NAVIGABLE) | B_FRAME_EVENTS);
 	fInput =
 		new BPrivate::TextInput(this, BRect(0, 0, 10, 10), fWantsInputNavigation ? B_NAVIGABLE : 0);
 	AddChild(fInput);
 	fInput->SetAlignment(fTextAlignment);
 	LayOutField();
-	SetText(text);
+	UpdateInput();
+	fInput->SetText(text);
+	fCommittedText = fInput->Text();
+}
+
+
+/// What the text view needs to know of the control's state.
+void
+BTextControl::UpdateInput()
+{
+	const uint32 navigable = IsEnabled() && fWantsInputNavigation ? B_NAVIGABLE : 0;
+	fInput->SetFlags((fInput->Flags() & ~B_NAVIGABLE) | navigable);
+	fInput->SetViewColor(BPrivate::FieldColor({IsEnabled(), false, false}));
+	fInput->SetLowColor(fInput->ViewColor());
+	if (fInput->Window() != NULL)
+		fInput->Invalidate();
 }
 
 
@@ -336,7 +356,10 @@ BTextControl::LayOutField()
 	fInput->MoveTo(fDivider + kInset, kInset);
 	fInput->ResizeTo(std::fmax(bounds.Width() - fDivider - 2 * kInset, 0),
 		std::fmax(bounds.Height() - 2 * kInset, 0));
-	fInput->SetTextRect(fInput->Bounds().OffsetToCopy(0, 0).InsetByCopy(1, 0));
+	// One line, in the middle of the height.
+	BRect textRect = fInput->Bounds().OffsetToCopy(0, 0).InsetByCopy(kTextMargin, 0);
+	textRect.top = std::fmax(std::floor((textRect.Height() + 1 - fInput->LineHeight()) / 2), 0);
+	fInput->SetTextRect(textRect);
 }
 
 
@@ -352,7 +375,8 @@ BTextControl::NeededHeight() const
 void
 BTextControl::InputChanged()
 {
-	if (fModificationMessage != NULL)
+	// Who is told of a change and makes another one is not told again: that would never end.
+	if (fModificationMessage != NULL && InvokeKind() != B_CONTROL_MODIFIED)
 		InvokeNotify(fModificationMessage, B_CONTROL_MODIFIED);
 }
 
@@ -371,10 +395,17 @@ BTextControl::InputCommitted()
 void
 BTextControl::InputFocusChanged(bool focused)
 {
+	if (Window() != NULL)
+		Invalidate();
 	if (focused)
 		fCommittedText = fInput->Text();
 	else
 		InputCommitted();
-	if (Window() != NULL)
-		Invalidate();
+}
+
+
+void
+BTextControl::ForgetChange()
+{
+	fCommittedText = fInput->Text();
 }

@@ -7,6 +7,8 @@
 
 #include <TextControl.h>
 
+#include "ControlLook.h"
+
 namespace BPrivate {
 
 TextInput::TextInput(BTextControl* control, BRect frame, uint32 flags)
@@ -19,14 +21,36 @@ TextInput::TextInput(BTextControl* control, BRect frame, uint32 flags)
 
 
 void
+TextInput::DetachedFromWindow()
+{
+	// With its window the focus goes, too: nothing is sent then.
+	fControl->ForgetChange();
+	BTextView::DetachedFromWindow();
+}
+
+
+void
+TextInput::MouseDown(BPoint where)
+{
+	if (fControl->IsEnabled())
+		BTextView::MouseDown(where);
+}
+
+
+void
 TextInput::KeyDown(const char* bytes, int32 numBytes)
 {
+	if (!fControl->IsEnabled()) {
+		BView::KeyDown(bytes, numBytes);
+		return;
+	}
 	switch (bytes[0]) {
 		case B_ENTER:
-			if (IsEditable()) {
-				fControl->InputCommitted();
-				SelectAll();
-			}
+			if (!IsEditable())
+				break;
+			SelectAll();
+			// What is sent may have the control deleted: nothing comes after it.
+			fControl->InputCommitted();
 			break;
 
 		case B_TAB:
@@ -44,12 +68,16 @@ TextInput::KeyDown(const char* bytes, int32 numBytes)
 void
 TextInput::MakeFocus(bool focus)
 {
+	if (focus && !fControl->IsEnabled())
+		return;
 	const bool had = IsFocus();
 	BTextView::MakeFocus(focus);
 	if (IsFocus() == had)
 		return;
 	if (focus)
 		SelectAll();
+	else
+		ScrollToOffset(0);
 	fControl->InputFocusChanged(focus);
 }
 
@@ -61,15 +89,20 @@ TextInput::InsertText(const char* text, int32 length, int32 offset, const text_r
 	std::replace(line.begin(), line.end(), '\n', ' ');
 	std::replace(line.begin(), line.end(), '\r', ' ');
 	BTextView::InsertText(line.data(), length, offset, runs);
-	fControl->InputChanged();
 }
 
 
 void
-TextInput::DeleteText(int32 fromOffset, int32 toOffset)
+TextInput::ChangeEnded()
 {
-	BTextView::DeleteText(fromOffset, toOffset);
 	fControl->InputChanged();
+}
+
+
+rgb_color
+TextInput::DrawnColor() const
+{
+	return StrengthOf(fControl->IsEnabled(), fColor, ViewColor());
 }
 
 } // namespace BPrivate

@@ -14,6 +14,8 @@ class TextInput : public BTextView {
 public:
 	TextInput(BTextControl* control, BRect frame, uint32 flags);
 
+	void DetachedFromWindow() override;
+	void MouseDown(BPoint where) override;
 	void KeyDown(const char* bytes, int32 numBytes) override;
 	void MakeFocus(bool focus = true) override;
 
@@ -21,9 +23,11 @@ protected:
 	/// Line breaks become blanks.
 	void InsertText(
 		const char* text, int32 length, int32 offset, const text_run_array* runs) override;
-	void DeleteText(int32 fromOffset, int32 toOffset) override;
 
 private:
+	void ChangeEnded() override;
+	rgb_color DrawnColor() const override;
+
 	BTextControl* fControl;
 };
 

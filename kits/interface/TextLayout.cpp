@@ -102,6 +102,16 @@ TextLayout::LineEnd(int32 line) const
 
 
 int32
+TextLayout::LastOffset(int32 line) const
+{
+	// The end of a line that was broken between words is the start of the next one.
+	const int32 end = LineEnd(line);
+	const bool softBreak = line + 1 < CountLines() && LineStart(line + 1) == end;
+	return softBreak ? CharacterBefore(*fText, end) : end;
+}
+
+
+int32
 TextLayout::LineAt(int32 offset) const
 {
 	const auto next = std::upper_bound(fStarts.begin(), fStarts.end(), offset);
@@ -126,20 +136,28 @@ TextLayout::XAt(int32 line, int32 offset) const
 int32
 TextLayout::OffsetAt(int32 line, float x) const
 {
-	int32 offset = LineStart(line);
-	const int32 end = LineEnd(line);
-	float left = 0;
-	while (offset < end) {
-		const int32 next = offset + CharacterLength(*fText, offset);
-		const float right = WidthOf(LineStart(line), next);
-		if (x < (left + right) / 2)
-			return offset;
-		left = right;
-		offset = next;
+	const int32 start = LineStart(line);
+	const int32 last = LastOffset(line);
+
+	// The last character that begins at x or before, halving: long lines are measured often enough.
+	int32 low = start;
+	int32 high = last;
+	while (low < high) {
+		int32 middle = low + (high - low + 1) / 2;
+		while (middle < high && IsContinuation((*fText)[middle]))
+			middle++;
+		if (WidthOf(start, middle) <= x)
+			low = middle;
+		else {
+			high = middle - 1;
+			while (high > low && IsContinuation((*fText)[high]))
+				high--;
+		}
 	}
-	// The end of a line that was broken between words is the start of the next one.
-	const bool softBreak = line + 1 < CountLines() && LineStart(line + 1) == end;
-	return softBreak ? CharacterBefore(*fText, end) : end;
+	if (low >= last)
+		return last;
+	const int32 next = low + CharacterLength(*fText, low);
+	return x < (WidthOf(start, low) + WidthOf(start, next)) / 2 ? low : std::min(next, last);
 }
 
 
@@ -163,13 +181,11 @@ TextLayout::WidthOf(int32 from, int32 to) const
 int32
 TextLayout::BreakLine(int32 start, int32 end, float width) const
 {
-	if (WidthOf(start, end) <= width)
-		return end;
-
 	int32 lastBreak = start;
 	int32 offset = start;
 	while (offset < end) {
 		int32 next = offset;
+		// Word by word: a paragraph may be long, a line is not.
 		while (next < end && (*fText)[next] != ' ' && (*fText)[next] != '\t')
 			next++;
 		if (WidthOf(start, next) > width)
@@ -180,7 +196,7 @@ TextLayout::BreakLine(int32 start, int32 end, float width) const
 		lastBreak = next;
 		offset = next;
 	}
-	if (lastBreak > start)
+	if (lastBreak > start || start == end)
 		return lastBreak;
 
 	// A word wider than the line is broken anywhere, after one character at least.

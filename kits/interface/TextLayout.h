@@ -26,6 +26,9 @@ public:
 	int32 LineStart(int32 line) const { return fStarts[line]; }
 	int32 LineEnd(int32 line) const;
 
+	/// The last offset of the line that a caret stands at in this line, not at the start of the next.
+	int32 LastOffset(int32 line) const;
+
 	/// The line of the character at \a offset. An offset at a soft break belongs to the line after it.
 	int32 LineAt(int32 offset) const;
 

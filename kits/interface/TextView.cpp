@@ -7,6 +7,7 @@
 #include <cmath>
 #include <cstring>
 
+#include <Cursor.h>
 #include <File.h>
 #include <Message.h>
 #include <Window.h>
@@ -40,6 +41,7 @@ BTextView::BTextView(BRect frame, const char* name, BRect textRect, const BFont*
 	  fUndo(std::make_unique<BPrivate::TextUndo>()),
 	  fTextRect(textRect),
 	  fColor(initialColor != NULL ? *initialColor : ui_color(B_DOCUMENT_TEXT_COLOR)),
+	  fChanged(false),
 	  fAnchor(0),
 	  fCaret(0),
 	  fMaxBytes(INT32_MAX),
@@ -75,26 +77,48 @@ BTextView::BTextView(
 
 
 BTextView::BTextView(BMessage* archive)
-	: BTextView("", NULL, NULL, B_WILL_DRAW)
+	: BView(archive),
+	  fLayout(std::make_unique<BPrivate::TextLayout>()),
+	  fUndo(std::make_unique<BPrivate::TextUndo>()),
+	  fTextRect(Bounds()),
+	  fColor(ui_color(B_DOCUMENT_TEXT_COLOR)),
+	  fChanged(false),
+	  fAnchor(0),
+	  fCaret(0),
+	  fMaxBytes(INT32_MAX),
+	  fTabWidth(kDefaultTabWidth),
+	  fWantedX(-1),
+	  fAlignment(B_ALIGN_LEFT),
+	  fEditable(true),
+	  fSelectable(true),
+	  fWordWrap(true),
+	  fStylable(false),
+	  fAutoindent(false),
+	  fSelecting(false)
 {
-	const BRect frame = archive->FindRect("_frame");
-	MoveTo(frame.LeftTop());
-	ResizeTo(frame.Width(), frame.Height());
-	SetName(archive->FindString("_name"));
 	archive->FindRect("_trect", &fTextRect);
+	archive->FindColor("_tcolor", &fColor);
 	const char* text;
 	if (archive->FindString("_text", &text) == B_OK)
 		SetText(text);
 	int32 number;
 	if (archive->FindInt32("_max", &number) == B_OK)
 		fMaxBytes = number;
+	if (archive->FindInt32("_align", &number) == B_OK)
+		fAlignment = static_cast<alignment>(number);
 	bool flag;
 	if (archive->FindBool("_nedit", &flag) == B_OK)
 		fEditable = !flag;
 	if (archive->FindBool("_nsel", &flag) == B_OK)
 		fSelectable = !flag;
 	if (archive->FindBool("_wrap", &flag) == B_OK)
-		SetWordWrap(flag);
+		fWordWrap = flag;
+	if (archive->FindBool("_auto", &flag) == B_OK)
+		fAutoindent = flag;
+	float tabWidth;
+	if (archive->FindFloat("_tab", &tabWidth) == B_OK)
+		SetTabWidth(tabWidth);
+	Relayout();
 }
 
 
@@ -124,6 +148,14 @@ BTextView::Archive(BMessage* archive, bool deep) const
 		status = archive->AddBool("_nsel", !fSelectable);
 	if (status == B_OK)
 		status = archive->AddBool("_wrap", fWordWrap);
+	if (status == B_OK)
+		status = archive->AddBool("_auto", fAutoindent);
+	if (status == B_OK)
+		status = archive->AddInt32("_align", fAlignment);
+	if (status == B_OK)
+		status = archive->AddFloat("_tab", fTabWidth);
+	if (status == B_OK)
+		status = archive->AddColor("_tcolor", fColor);
 	return status;
 }
 
@@ -132,6 +164,8 @@ void
 BTextView::AttachedToWindow()
 {
 	BView::AttachedToWindow();
+	if (fSelectable || fEditable)
+		SetViewCursor(B_CURSOR_I_BEAM);
 	Relayout();
 }
 
@@ -167,8 +201,12 @@ BTextView::MakeFocus(bool focus)
 	const bool had = IsFocus();
 	BView::MakeFocus(focus);
 	SealUndo();
-	if (IsFocus() != had)
-		InvalidateText();
+	if (IsFocus() == had)
+		return;
+	// Windows know the other editing shortcuts; a program's own one takes this one's place.
+	if (focus && fEditable && !Window()->HasShortcut('z', B_COMMAND_KEY))
+		Window()->AddShortcut('z', B_COMMAND_KEY, new BMessage(B_UNDO), NULL);
+	InvalidateText();
 }
 
 
@@ -202,12 +240,16 @@ BTextView::SetText(const char* text, const text_run_array* runs)
 void
 BTextView::SetText(const char* text, int32 length, const text_run_array* runs)
 {
-	if (!fText.empty())
-		DeleteText(0, TextLength());
+	// A copy: the text may be this view's own.
+	std::string newText;
 	if (text != NULL && length > 0)
-		InsertText(text, length, 0, runs);
+		newText.assign(text, strnlen(text, length));
 	fAnchor = 0;
 	fCaret = 0;
+	if (!fText.empty())
+		DeleteText(0, TextLength());
+	if (!newText.empty())
+		InsertText(newText.data(), static_cast<int32>(newText.size()), 0, runs);
 	if (fUndo != NULL)
 		fUndo->Forget();
 	TextChanged();
@@ -335,7 +377,8 @@ BTextView::PointAt(int32 offset, float* _height) const
 
 	float left = fTextRect.left;
 	if (fAlignment != B_ALIGN_LEFT) {
-		const float space = fTextRect.Width() - fLayout->LineWidth(line);
+		// A line that does not fit begins at the left, where it can be scrolled to.
+		const float space = std::max(fTextRect.Width() - fLayout->LineWidth(line), 0.0f);
 		left += std::floor(fAlignment == B_ALIGN_RIGHT ? space : space / 2);
 	}
 	return BPoint(left + fLayout->XAt(line, offset), fTextRect.top + line * fLayout->LineHeight());
@@ -520,7 +563,11 @@ BTextView::SetMaxBytes(int32 max)
 	int32 end = max;
 	while (end > 0 && (static_cast<unsigned char>(fText[end]) & 0xc0) == 0x80)
 		end--;
+	const int32 anchor = fAnchor;
+	const int32 caret = fCaret;
 	Delete(end, TextLength());
+	fAnchor = std::min(anchor, end);
+	fCaret = std::min(caret, end);
 }
 
 
@@ -571,6 +618,7 @@ void
 BTextView::Draw(BRect updateRect)
 {
 	SetDrawingMode(B_OP_OVER);
+	SetLowColor(ViewColor());
 	const int32 first = LineAt(updateRect.LeftTop());
 	const int32 last = LineAt(updateRect.RightBottom());
 	for (int32 line = first; line <= last; line++)
@@ -579,8 +627,9 @@ BTextView::Draw(BRect updateRect)
 	if (ShowsCaret()) {
 		float height;
 		const BPoint top = PointAt(fCaret, &height);
-		SetHighColor(fColor);
-		StrokeLine(top, BPoint(top.x, top.y + height - 1));
+		const float x = std::floor(top.x);
+		SetHighColor(DrawnColor());
+		StrokeLine(BPoint(x, top.y), BPoint(x, top.y + height - 1));
 	}
 	SetDrawingMode(B_OP_COPY);
 }
@@ -599,16 +648,17 @@ BTextView::DrawLine(int32 line)
 	const int32 to = std::min(end, selectionEnd);
 	// A selection that goes on in the next line includes the line break.
 	const bool breakSelected = selectionStart <= end && selectionEnd > end;
-	const bool active = IsFocus() && Window()->IsActive();
-	if (fSelectable && (from < to || (breakSelected && from <= to))) {
-		const float left = top.x + fLayout->XAt(line, from);
-		const float right = breakSelected ? fTextRect.right : top.x + fLayout->XAt(line, to) - 1;
+	const bool active = Window()->IsActive();
+	if (fSelectable && IsFocus() && (from < to || (breakSelected && from <= to))) {
+		const float left = std::floor(top.x + fLayout->XAt(line, from));
+		const float right = breakSelected ? std::max(fTextRect.right, Bounds().right)
+										  : std::ceil(top.x + fLayout->XAt(line, to)) - 1;
 		const rgb_color mark = ui_color(B_LIST_SELECTED_BACKGROUND_COLOR);
 		SetHighColor(BPrivate::BlendColors(ViewColor(), mark, active ? 1.0f : 0.5f));
 		FillRect(BRect(left, top.y, right, top.y + fLayout->LineHeight() - 1));
 	}
 
-	SetHighColor(fColor);
+	SetHighColor(DrawnColor());
 	int32 offset = start;
 	while (offset < end) {
 		const size_t found = fText.find('\t', offset);
@@ -642,4 +692,18 @@ BTextView::InvalidateText()
 {
 	if (Window() != NULL)
 		Invalidate();
+}
+
+
+/// Called when a change of the text is complete.
+void
+BTextView::ChangeEnded()
+{
+}
+
+
+rgb_color
+BTextView::DrawnColor() const
+{
+	return fColor;
 }

@@ -2,6 +2,7 @@
 // BTextView: changes of the text, the selection and the clipboard.
 
 #include <algorithm>
+#include <cmath>
 #include <cstring>
 
 #include <Beep.h>
@@ -41,14 +42,11 @@ BTextView::Insert(const char* text, const text_run_array* runs)
 
 
 void
-BTextView::Insert(const char* text, int32 length, const text_run_array*)
+BTextView::Insert(const char* text, int32 length, const text_run_array* runs)
 {
-	if (text == NULL || length < 0)
-		return;
 	int32 start;
-	int32 end;
-	GetSelection(&start, &end);
-	Replace(start, end, text, length);
+	GetSelection(&start, NULL);
+	Insert(start, text, length, runs);
 }
 
 
@@ -57,12 +55,30 @@ BTextView::Insert(int32 offset, const char* text, int32 length, const text_run_a
 {
 	if (text == NULL || length <= 0)
 		return;
-	offset = std::clamp<int32>(offset, 0, TextLength());
+	// A copy: the text may be this view's own.
+	const std::string inserted(text, strnlen(text, length));
+	if (!inserted.empty()) {
+		InsertAt(std::clamp<int32>(offset, 0, TextLength()), inserted.data(),
+			static_cast<int32>(inserted.size()), runs);
+	}
+}
+
+
+void
+BTextView::InsertAt(int32 offset, const char* text, int32 length, const text_run_array* runs)
+{
+	const int32 before = TextLength();
 	InsertText(text, length, offset, runs);
+	// A subclass may have inserted more, or less.
+	const int32 grown = TextLength() - before;
 	if (fCaret >= offset)
-		fCaret += length;
+		fCaret += grown;
 	if (fAnchor >= offset)
-		fAnchor += length;
+		fAnchor += grown;
+	SealUndo();
+	if (fUndo != NULL && grown > 0)
+		fUndo->Note(offset, "", fText.substr(offset, grown));
+	SealUndo();
 	TextChanged();
 }
 
@@ -91,6 +107,7 @@ void
 BTextView::InsertText(const char* text, int32 length, int32 offset, const text_run_array*)
 {
 	fText.insert(offset, text, length);
+	fChanged = true;
 	Relayout();
 }
 
@@ -99,6 +116,7 @@ void
 BTextView::DeleteText(int32 fromOffset, int32 toOffset)
 {
 	fText.erase(fromOffset, toOffset - fromOffset);
+	fChanged = true;
 	Relayout();
 }
 
@@ -108,14 +126,17 @@ void
 BTextView::Replace(int32 from, int32 to, const char* text, int32 length)
 {
 	const std::string removed = fText.substr(from, to - from);
-	const std::string inserted(text, length);
+	const std::string wanted(text, length);
 	if (from < to)
 		DeleteText(from, to);
+	const int32 before = TextLength();
 	if (length > 0)
-		InsertText(inserted.data(), length, from, NULL);
+		InsertText(wanted.data(), length, from, NULL);
+	// A subclass may have inserted another text.
+	const int32 grown = std::max<int32>(TextLength() - before, 0);
 	if (fUndo != NULL)
-		fUndo->Note(from, removed, inserted);
-	fCaret = from + length;
+		fUndo->Note(from, removed, fText.substr(from, grown));
+	fCaret = from + grown;
 	fAnchor = fCaret;
 	TextChanged();
 }
@@ -148,6 +169,10 @@ BTextView::TextChanged()
 	fCaret = std::clamp<int32>(fCaret, 0, TextLength());
 	fAnchor = std::clamp<int32>(fAnchor, 0, TextLength());
 	InvalidateText();
+	if (!fChanged)
+		return;
+	fChanged = false;
+	ChangeEnded();
 }
 
 
@@ -299,10 +324,13 @@ BTextView::MessageReceived(BMessage* message)
 			return;
 		const char* text = static_cast<const char*>(data);
 		const int32 length = static_cast<int32>(strnlen(text, size));
-		if (!IsAllowed(text, length, 0))
+		if (length == 0 || !IsAllowed(text, length, 0))
 			return;
 		const int32 offset = OffsetAt(ConvertFromScreen(message->DropPoint()));
+		SealUndo();
 		Replace(offset, offset, text, length);
+		SealUndo();
+		ScrollToSelection();
 		return;
 	}
 
@@ -320,7 +348,8 @@ BTextView::MessageReceived(BMessage* message)
 			break;
 
 		case B_SELECT_ALL:
-			SelectAll();
+			if (fSelectable)
+				SelectAll();
 			break;
 
 		case B_UNDO:
@@ -348,12 +377,17 @@ BTextView::ScrollToOffset(int32 offset)
 	if (Window() == NULL)
 		return;
 	float height;
-	const BPoint top = PointAt(offset, &height);
+	BPoint top = PointAt(offset, &height);
+	// With the first line, and at the left edge, the margin is shown, too.
+	if (top.x <= fTextRect.left)
+		top.x = 0;
+	if (top.y <= fTextRect.top)
+		top.y = 0;
 	const BRect bounds = Bounds();
 	BPoint where = bounds.LeftTop();
 	// Without word wrap a caret at the right edge brings some of what follows with it.
 	const float ahead = std::min(bounds.Width() / 4, 30.0f);
-	if (top.x < bounds.left + 1)
+	if (top.x < bounds.left)
 		where.x = std::max(top.x - ahead, 0.0f);
 	else if (top.x > bounds.right - 1)
 		where.x = top.x - bounds.Width() + ahead;
@@ -361,6 +395,11 @@ BTextView::ScrollToOffset(int32 offset)
 		where.y = std::max(top.y, 0.0f);
 	else if (top.y + height > bounds.bottom + 1 && height <= bounds.Height())
 		where.y = top.y + height - bounds.Height();
+	// A single line leaves no empty space behind its end that its beginning could have.
+	if (CountLines() == 1) {
+		const float end = PointAt(TextLength()).x + std::max(fTextRect.left, 0.0f) + 1;
+		where.x = std::clamp(where.x, 0.0f, std::max(std::ceil(end - bounds.Width()), 0.0f));
+	}
 	if (where != bounds.LeftTop())
 		ScrollTo(where);
 }

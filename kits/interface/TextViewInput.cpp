@@ -38,9 +38,18 @@ BTextView::KeyDown(const char* bytes, int32 numBytes)
 {
 	const int32 held = MessageNumber(this, "modifiers");
 	const bool byWord = (held & (B_CONTROL_KEY | B_COMMAND_KEY | B_OPTION_KEY)) != 0;
-	if (fSelectable && MoveByKey(bytes[0], (held & B_SHIFT_KEY) != 0, byWord))
-		return;
-	if (!fEditable) {
+	const bool extend = fSelectable && (held & B_SHIFT_KEY) != 0;
+	if (numBytes == 1) {
+		if (!fEditable && !extend && ScrollByKey(bytes[0]))
+			return;
+		if ((fSelectable || fEditable) && MoveByKey(bytes[0], extend, byWord))
+			return;
+	}
+	// Of the keys that give control characters two are text, and two delete.
+	const unsigned char first = bytes[0];
+	const bool isText =
+		numBytes > 1 || (first >= ' ' && first != B_DELETE) || first == B_ENTER || first == B_TAB;
+	if (!fEditable || (!isText && first != B_BACKSPACE && first != B_DELETE)) {
 		BView::KeyDown(bytes, numBytes);
 		return;
 	}
@@ -49,12 +58,6 @@ BTextView::KeyDown(const char* bytes, int32 numBytes)
 		case B_BACKSPACE:
 		case B_DELETE:
 			DeleteByKey(bytes[0] == B_DELETE, byWord);
-			break;
-
-		case B_ESCAPE:
-		case B_INSERT:
-		case B_FUNCTION_KEY:
-			BView::KeyDown(bytes, numBytes);
 			break;
 
 		default:
@@ -123,13 +126,55 @@ BTextView::MoveByKey(char key, bool extend, bool byWord)
 			break;
 
 		case B_END:
-			MoveCaret(byWord ? TextLength() : fLayout->LineEnd(CurrentLine()), extend);
+			MoveCaret(byWord ? TextLength() : fLayout->LastOffset(CurrentLine()), extend);
 			break;
 
 		default:
 			return false;
 	}
 	ScrollToSelection();
+	return true;
+}
+
+
+/// Text that is only read moves instead of a caret that nobody sees; false for any other key.
+bool
+BTextView::ScrollByKey(char key)
+{
+	const BRect bounds = Bounds();
+	const float line = fLayout->LineHeight();
+	const float page = std::max(bounds.Height() - line, line);
+	float by;
+	switch (key) {
+		case B_UP_ARROW:
+			by = -line;
+			break;
+
+		case B_DOWN_ARROW:
+			by = line;
+			break;
+
+		case B_PAGE_UP:
+			by = -page;
+			break;
+
+		case B_PAGE_DOWN:
+			by = page;
+			break;
+
+		case B_HOME:
+			by = -bounds.top;
+			break;
+
+		case B_END:
+			by = CountLines() * line;
+			break;
+
+		default:
+			return false;
+	}
+	const float lowest = fTextRect.top + CountLines() * line - bounds.Height();
+	ScrollTo(BPoint(bounds.left, std::clamp(bounds.top + by, 0.0f, std::max(lowest, 0.0f))));
 	return true;
 }
 

@@ -3,6 +3,8 @@
 #ifndef _ALERT_H
 #define _ALERT_H
 
+#include <memory>
+
 #include <Window.h>
 
 class BButton;
@@ -28,8 +30,8 @@ enum button_spacing {
 class BAlert : public BWindow {
 public:
 	BAlert();
-	/// The texts are copied; a button without a label is left out. The right-most button is the
-	/// default one.
+	/// The texts are copied; a button without a label is left out and not counted. The right-most
+	/// button is the default one.
 	BAlert(const char* title, const char* text, const char* button1, const char* button2 = NULL,
 		const char* button3 = NULL, button_width width = B_WIDTH_AS_USUAL,
 		alert_type type = B_INFO_ALERT);
@@ -58,7 +60,8 @@ public:
 	void SetShortcut(int32 buttonIndex, char key);
 	char Shortcut(int32 buttonIndex) const;
 
-	/// Shows the alert, waits for the answer and returns the index of the pressed button.
+	/// Shows the alert, waits for the answer and returns the index of the pressed button; -1 when the
+	/// alert ended without an answer. The alert has gone then. One without buttons gets an "OK".
 	///
 	/// In a window's thread that window is repainted meanwhile, and its messages wait.
 	int32 Go();
@@ -73,7 +76,11 @@ public:
 private:
 	static const int32 kMostButtons = 3;
 
+	struct Outcome;
+
 	void Build(const char* text, const char* const labels[kMostButtons]);
+	void AddButton(const char* label);
+	void Prepare();
 	void LayOut();
 	void Place();
 	void Answer(int32 index);
@@ -85,8 +92,9 @@ private:
 	BButton* fButtons[kMostButtons];
 	char fShortcuts[kMostButtons];
 	BInvoker* fInvoker;
-	sem_id fAnswered;
-	int32* fAnswer;
+	bool fAnswered;
+	// Shared with the thread that waits, which may touch the alert no more.
+	std::shared_ptr<Outcome> fOutcome;
 };
 
 #endif // _ALERT_H

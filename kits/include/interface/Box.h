@@ -31,7 +31,8 @@ public:
 
 	/// The text is copied; null takes the label away.
 	void SetLabel(const char* string);
-	/// The view becomes the box's first child, at (10, 0), in place of the label so far.
+	/// The view becomes the box's first child, at (10, 0), in place of the label so far, which is deleted.
+	/// B_BAD_VALUE when it has another parent.
 	status_t SetLabel(BView* viewLabel);
 	/// Null without a text label.
 	const char* Label() const;

@@ -19,6 +19,7 @@ public:
 	static BArchivable* Instantiate(BMessage* archive);
 
 	void Draw(BRect updateRect) override;
+	void DetachedFromWindow() override;
 	void MouseDown(BPoint where) override;
 	void MouseUp(BPoint where) override;
 	void MouseMoved(BPoint where, uint32 code, const BMessage* dragMessage) override;

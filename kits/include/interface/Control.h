@@ -60,7 +60,7 @@ public:
 	status_t Invoke(BMessage* message = NULL) override;
 
 protected:
-	/// True inside Draw() when nothing but the focus changed.
+	/// True while MakeFocus() marks the control for being drawn with its new focus.
 	bool IsFocusChanging() const;
 	/// Whether a mouse button is held on the control.
 	bool IsTracking() const;

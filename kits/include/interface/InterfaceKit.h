@@ -3,18 +3,27 @@
 #ifndef _INTERFACE_KIT_H
 #define _INTERFACE_KIT_H
 
+#include <Alert.h>
 #include <Bitmap.h>
+#include <Box.h>
+#include <Button.h>
+#include <CheckBox.h>
+#include <Control.h>
 #include <Font.h>
 #include <GraphicsDefs.h>
 #include <InterfaceDefs.h>
 #include <Picture.h>
 #include <Point.h>
 #include <Polygon.h>
+#include <RadioButton.h>
 #include <Rect.h>
 #include <Region.h>
 #include <Screen.h>
 #include <Shape.h>
 #include <Size.h>
+#include <StringView.h>
+#include <TextControl.h>
+#include <TextView.h>
 #include <View.h>
 #include <Window.h>
 

@@ -14,7 +14,7 @@ class TextInput;
 /// A label and, from the divider on, a text view of one line that has the keyboard.
 ///
 /// The message is sent when Enter is pressed or the focus leaves, after a change; the modification
-/// message at each change. Its height is what the font needs, whatever the frame says.
+/// message at each change of the text, also by program. Its height is what the font needs, whatever the frame says.
 class BTextControl : public BControl {
 public:
 	BTextControl(BRect frame, const char* name, const char* label, const char* initialText,
@@ -37,6 +37,7 @@ public:
 	void GetPreferredSize(float* _width, float* _height) override;
 	void SetFont(const BFont* font, uint32 mask = B_FONT_ALL) override;
 
+	/// Null is the empty text.
 	virtual void SetText(const char* text);
 	/// Valid until the text changes.
 	const char* Text() const;
@@ -68,11 +69,13 @@ private:
 	void Build(const char* text);
 	void LayOutField();
 	float NeededHeight() const;
+	void UpdateInput();
 
 	// What the text view tells.
 	void InputChanged();
 	void InputCommitted();
 	void InputFocusChanged(bool focused);
+	void ForgetChange();
 
 	BPrivate::TextInput* fInput;
 	BMessage* fModificationMessage;

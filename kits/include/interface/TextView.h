@@ -27,6 +27,7 @@ struct text_run_array {
 };
 
 namespace BPrivate {
+class TextInput;
 class TextLayout;
 class TextUndo;
 } // namespace BPrivate
@@ -70,7 +71,7 @@ public:
 	void SetText(const char* text, const text_run_array* runs = NULL);
 	void SetText(const char* text, int32 length, const text_run_array* runs = NULL);
 	void SetText(BFile* file, int32 offset, int32 length, const text_run_array* runs = NULL);
-	/// Inserts at the caret, in place of the selection, or at \a offset.
+	/// Inserts at the selection's start, or at \a offset. What was selected moves along and stays.
 	void Insert(const char* text, const text_run_array* runs = NULL);
 	void Insert(const char* text, int32 length, const text_run_array* runs = NULL);
 	void Insert(int32 offset, const char* text, int32 length, const text_run_array* runs = NULL);
@@ -156,14 +157,22 @@ protected:
 	virtual void DeleteText(int32 fromOffset, int32 toOffset);
 
 private:
+	friend class BPrivate::TextInput;
+
+	// What a text control wants to know: the text is another one, and complete.
+	virtual void ChangeEnded();
+	virtual rgb_color DrawnColor() const;
+
 	// Changes
 	void Replace(int32 from, int32 to, const char* text, int32 length);
+	void InsertAt(int32 offset, const char* text, int32 length, const text_run_array* runs);
 	bool IsAllowed(const char* text, int32 length, int32 replaced);
 	void TextChanged();
 	void SealUndo();
 
 	// Keys
 	bool MoveByKey(char key, bool extend, bool byWord);
+	bool ScrollByKey(char key);
 	void MoveCaret(int32 offset, bool extend);
 	void DeleteByKey(bool forward, bool byWord);
 	int32 VerticalTarget(int32 lines);
@@ -184,6 +193,7 @@ private:
 	std::set<uint32> fDisallowed;
 	BRect fTextRect;
 	rgb_color fColor;
+	bool fChanged;
 	int32 fAnchor;
 	int32 fCaret;
 	int32 fMaxBytes;
