@@ -96,7 +96,7 @@ BBox::Draw(BRect)
 {
 	BRect border = Bounds();
 	border.top += TopBorderOffset();
-	const rgb_color low = LowColor();
+	const rgb_color low = ViewColor();
 	const rgb_color line = tint_color(low, B_DARKEN_2_TINT);
 	if (fBorder == B_FANCY_BORDER) {
 		SetHighColor(tint_color(low, B_LIGHTEN_2_TINT));

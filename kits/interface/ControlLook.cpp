@@ -111,7 +111,7 @@ DrawButtonSurface(BView* view, BRect frame, ControlState state, bool isDefault)
 		const BRect around = view->Bounds();
 		StrokeRoundFrame(view, around, kButtonRadius + 2, mark);
 		StrokeRoundFrame(view, around.InsetByCopy(1, 1), kButtonRadius + 1,
-			BlendColors(view->LowColor(), mark, 0.35f));
+			BlendColors(view->ViewColor(), mark, 0.35f));
 	}
 
 	view->SetHighColor(ButtonSurfaceColor(state));
@@ -191,7 +191,7 @@ DrawMarkLabel(BView* view, const char* label, bool enabled)
 	font_height height;
 	view->GetFontHeight(&height);
 	const float middle = (mark.top + mark.bottom) / 2;
-	view->SetHighColor(ControlTextColor(enabled, view->LowColor()));
+	view->SetHighColor(ControlTextColor(enabled, view->ViewColor()));
 	view->SetDrawingMode(B_OP_OVER);
 	view->DrawString(text.String(),
 		BPoint(left, std::floor(middle + (height.ascent - height.descent) / 2 + 0.5f)));

@@ -136,7 +136,7 @@ BTextControl::Draw(BRect)
 		const float space = width - StringWidth(label.String());
 		left += std::floor(fLabelAlignment == B_ALIGN_RIGHT ? space : space / 2);
 	}
-	SetHighColor(BPrivate::ControlTextColor(IsEnabled(), LowColor()));
+	SetHighColor(BPrivate::ControlTextColor(IsEnabled(), ViewColor()));
 	SetDrawingMode(B_OP_OVER);
 	DrawString(label.String(),
 		BPoint(left, fInput->Frame().top + fInput->TextRect().top + std::ceil(height.ascent)));
