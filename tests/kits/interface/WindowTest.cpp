@@ -193,9 +193,10 @@ TEST_F(WindowTest, QuitFromAnotherThreadReturnsWhenItIsGone)
 	auto* window = new HookWindow;
 	window->destroyed = &destroyed;
 	window->Show();
+	BMessenger messenger(window);
 	Quit(window);
 	EXPECT_TRUE(destroyed);
-	EXPECT_FALSE(window->Lock());
+	EXPECT_FALSE(messenger.LockTarget());
 }
 
 
