@@ -6,7 +6,8 @@
 
 TFormView::TFormView(TForm* parent, const char* name)
 	: BView(parent->Bounds(), name, B_FOLLOW_ALL_SIDES, B_WILL_DRAW | B_FRAME_EVENTS),
-	  fForm(parent)
+	  fForm(parent),
+	  fHasFocus(false)
 {
 }
 
@@ -15,10 +16,45 @@ TFormView::~TFormView() {}
 
 
 void
+TFormView::FormAttached()
+{
+	fForm->AttachedToWindow();
+}
+
+
+void
+TFormView::FormAllAttached()
+{
+	fForm->AllAttached();
+}
+
+
+void
+TFormView::FormFocusChanged(const BView* focus)
+{
+	const bool hasFocus = focus == this;
+	if (hasFocus == fHasFocus)
+		return;
+	fHasFocus = hasFocus;
+	if (hasFocus)
+		fForm->GotFocus();
+	else
+		fForm->LostFocus();
+}
+
+
+void
+TFormView::FormChildDispatched(const BView*, const BMessage*)
+{
+}
+
+
+void
 TFormView::AllAttached()
 {
 	BView::AllAttached();
-	fForm->AllAttached();
+	if (fForm->IsOpen())
+		fForm->AllAttached();
 }
 
 
@@ -26,7 +62,8 @@ void
 TFormView::AttachedToWindow()
 {
 	BView::AttachedToWindow();
-	fForm->AttachedToWindow();
+	if (fForm->IsOpen())
+		fForm->AttachedToWindow();
 }
 
 
@@ -43,7 +80,8 @@ void
 TFormView::Draw(BRect updateRect)
 {
 	BView::Draw(updateRect);
-	fForm->Draw(updateRect);
+	if (fForm->IsOpen())
+		fForm->Draw(updateRect);
 }
 
 
@@ -51,7 +89,8 @@ void
 TFormView::KeyDown(const char* bytes, int32 numBytes)
 {
 	BView::KeyDown(bytes, numBytes);
-	fForm->KeyDown();
+	if (fForm->IsOpen())
+		fForm->KeyDown();
 }
 
 
@@ -59,21 +98,8 @@ void
 TFormView::KeyUp(const char* bytes, int32 numBytes)
 {
 	BView::KeyUp(bytes, numBytes);
-	fForm->KeyUp();
-}
-
-
-void
-TFormView::MakeFocus(bool focus)
-{
-	const bool hadFocus = IsFocus();
-	BView::MakeFocus(focus);
-	if (IsFocus() == hadFocus)
-		return;
-	if (hadFocus)
-		fForm->LostFocus();
-	else
-		fForm->GotFocus();
+	if (fForm->IsOpen())
+		fForm->KeyUp();
 }
 
 
@@ -81,7 +107,8 @@ void
 TFormView::MouseUp(BPoint where)
 {
 	BView::MouseUp(where);
-	fForm->MouseUp(where);
+	if (fForm->IsOpen())
+		fForm->MouseUp(where);
 }
 
 
@@ -89,7 +116,8 @@ void
 TFormView::MouseDown(BPoint where)
 {
 	BView::MouseDown(where);
-	fForm->MouseDown(where);
+	if (fForm->IsOpen())
+		fForm->MouseDown(where);
 }
 
 
@@ -97,5 +125,6 @@ void
 TFormView::MouseMoved(BPoint where, uint32 transit, const BMessage* message)
 {
 	BView::MouseMoved(where, transit, message);
-	fForm->MouseMoved(where, transit, message);
+	if (fForm->IsOpen())
+		fForm->MouseMoved(where, transit, message);
 }

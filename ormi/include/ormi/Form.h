@@ -10,18 +10,22 @@ class TFormView;
 /// A form: a window with one view that fills it and carries the form's components.
 ///
 /// A generated form class derives from it, creates the components in its constructor, and overrides the
-/// hooks of the events that it has handlers for. The hooks run in the window's thread with the window
-/// locked. Make forms on the heap: a form deletes itself when it is closed. The main form's end is the
-/// program's.
+/// hooks of the events that it has handlers for. The hooks run with the window locked, in the window's
+/// thread; those that Show() and Quit() call run in the thread of their caller. Make forms on the heap: a
+/// form deletes itself when it is closed. The main form's end is the program's.
 class TForm : public BWindow {
 public:
-	/// \a frame: the content's, in screen coordinates. The window is hidden until Show().
+	/// \a frame: the content's, in screen coordinates. The window is hidden until Show(). Without
+	/// B_ASYNCHRONOUS_CONTROLS controls would swallow the mouse events of a press, so it is always set.
 	TForm(BRect frame, const char* title, window_look look, window_feel feel, uint32 flags);
 	virtual ~TForm();
 
+	void DispatchMessage(BMessage* message, BHandler* handler) override;
 	void MessageReceived(BMessage* message) override;
 
-	/// The first call tells every component that it is attached: until then it had no handlers.
+	/// The first call opens the form: its view and the components are told that they are attached, which
+	/// they could not be before they had handlers, and the view gets the focus if nothing else has it.
+	/// The window must be locked for that call, as it is in the thread that made the form.
 	void Show() override;
 
 	/// Takes the components off the window, which calls their handlers, and deletes the form.
@@ -60,7 +64,11 @@ public:
 	virtual void CommitViewTransaction();
 
 private:
+	void Open();
+	void TellFocus();
+
 	TFormView* fFormView;
+	const BView* fLastFocus; // only compared: the view may be gone
 	bool fIsMainForm;
 	bool fIsOpen;
 };

@@ -5,10 +5,13 @@
 
 #include <View.h>
 
+#include <ormi/Part.h>
+
 class TForm;
 
-/// The background of a form, on which its components lie. It hands its events to the form's hooks.
-class TFormView : public BView {
+/// The background of a form, on which its components lie. It hands its events to the form's hooks while
+/// the form is open.
+class TFormView : public BView, public TFormPart {
 public:
 	/// As large as \a parent, which adds it with SetFormView().
 	TFormView(TForm* parent, const char* name);
@@ -16,17 +19,22 @@ public:
 
 	TForm* ParentForm() const { return fForm; }
 
+	void FormAttached() override;
+	void FormAllAttached() override;
+	void FormFocusChanged(const BView* focus) override;
+	void FormChildDispatched(const BView* child, const BMessage* message) override;
+
 	void AllAttached() override;
 	void AttachedToWindow() override;
 	void AllDetached() override;
 	void Draw(BRect updateRect) override;
 	void KeyDown(const char* bytes, int32 numBytes) override;
 	void KeyUp(const char* bytes, int32 numBytes) override;
-	void MakeFocus(bool focus = true) override;
 	void MouseUp(BPoint where) override;
 	void MouseDown(BPoint where) override;
 	void MouseMoved(BPoint where, uint32 transit, const BMessage* message) override;
 
 private:
 	TForm* fForm;
+	bool fHasFocus;
 };

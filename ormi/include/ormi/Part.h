@@ -7,12 +7,18 @@
 
 #include <View.h>
 
-/// What a form knows of its components.
+/// What a form knows of its view and its components.
 class TFormPart {
 public:
 	/// The form is shown for the first time: the part was attached before it had handlers.
 	virtual void FormAttached() = 0;
 	virtual void FormAllAttached() = 0;
+
+	/// The form's focus is \a focus now, null when it is nowhere.
+	virtual void FormFocusChanged(const BView* focus) = 0;
+
+	/// \a child, a view in the part that is no part itself, got \a message.
+	virtual void FormChildDispatched(const BView* child, const BMessage* message) = 0;
 
 protected:
 	~TFormPart() = default;
@@ -21,7 +27,8 @@ protected:
 /// A \a View whose events call member functions of the form of class \a Form.
 ///
 /// An event is a pointer to such a member, null when the form has no handler for it. Handlers run in the
-/// window's thread with the window locked, after what the view itself does.
+/// window's thread with the window locked, after what the view itself does, and only while the form is
+/// open.
 template <class Form, class View>
 class TPart : public View, public TFormPart {
 public:
@@ -48,6 +55,7 @@ public:
 		: View(std::forward<Arguments>(arguments)...),
 		  fForm(form)
 	{
+		View::SetFlags(this->Flags() | B_FRAME_EVENTS);
 	}
 
 	Form* ParentForm() const { return fForm; }
@@ -63,8 +71,25 @@ public:
 			this->Hide();
 	}
 
+	/// Sets the flags that a designer chooses; those that the part's events and the view need stay.
+	void SetFlags(uint32 flags) override
+	{
+		View::SetFlags(flags | B_FRAME_EVENTS | (this->Flags() & B_NAVIGABLE_JUMP));
+	}
+
 	void FormAttached() override { Call(OnAttachedToWindow); }
 	void FormAllAttached() override { Call(OnAllAttached); }
+
+	void FormFocusChanged(const BView* focus) override
+	{
+		const bool hasFocus = focus == FocusView();
+		if (hasFocus == fHasFocus)
+			return;
+		fHasFocus = hasFocus;
+		Call(hasFocus ? OnGotFocus : OnLostFocus);
+	}
+
+	void FormChildDispatched(const BView*, const BMessage*) override {}
 
 	void AllAttached() override
 	{
@@ -114,14 +139,6 @@ public:
 		Call(OnKeyUp);
 	}
 
-	void MakeFocus(bool focus = true) override
-	{
-		const bool hadFocus = this->IsFocus();
-		View::MakeFocus(focus);
-		if (this->IsFocus() != hadFocus)
-			Call(hadFocus ? OnLostFocus : OnGotFocus);
-	}
-
 	void MouseUp(BPoint point) override
 	{
 		View::MouseUp(point);
@@ -141,6 +158,9 @@ public:
 	}
 
 protected:
+	/// The view that has the focus when the part has it.
+	virtual const BView* FocusView() const { return this; }
+
 	/// Calls the handler of an event, if the form is open and has one.
 	template <class... Parameters, class... Arguments>
 	void Call(void (Form::*handler)(Parameters...), Arguments... arguments)
@@ -151,6 +171,7 @@ protected:
 
 private:
 	Form* fForm;
+	bool fHasFocus = false;
 };
 
 /// A part that is no control, with an event for a press and release of the mouse inside it.

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include <MessageFilter.h>
+#include <Message.h>
 #include <TextControl.h>
 #include <TextView.h>
 
@@ -28,7 +28,6 @@ public:
 			this->SetDivider(0);
 		this->SetMessage(new BMessage);
 		this->SetModificationMessage(new BMessage);
-		this->TextView()->AddFilter(new InputFilter(this));
 	}
 
 	/// The control sends itself its two messages through this operation.
@@ -40,39 +39,10 @@ public:
 		return status;
 	}
 
-	/// The mark of the focus is drawn anew when the focus comes or goes, which nothing else tells.
-	void Draw(BRect updateRect) override
+	void FormChildDispatched(const BView* child, const BMessage* message) override
 	{
-		Part::Draw(updateRect);
-		const bool focused = this->TextView()->IsFocus();
-		if (focused == fFocused)
+		if (child != this->TextView())
 			return;
-		fFocused = focused;
-		this->Call(focused ? this->OnGotFocus : this->OnLostFocus);
-	}
-
-private:
-	/// Looks at the input of the text view before the text view does.
-	class InputFilter : public BMessageFilter {
-	public:
-		explicit InputFilter(TTextControl* control)
-			: BMessageFilter(B_ANY_DELIVERY, B_ANY_SOURCE),
-			  fControl(control)
-		{
-		}
-
-		filter_result Filter(BMessage* message, BHandler**) override
-		{
-			fControl->InputReceived(message);
-			return B_DISPATCH_MESSAGE;
-		}
-
-	private:
-		TTextControl* fControl;
-	};
-
-	void InputReceived(const BMessage* message)
-	{
 		BPoint point;
 		message->FindPoint("be:view_where", &point);
 		this->TextView()->ConvertToParent(&point);
@@ -97,8 +67,10 @@ private:
 			{
 				int32 transit = B_INSIDE_VIEW;
 				message->FindInt32("be:transit", &transit);
+				BMessage dragged;
+				const bool isDrag = message->FindMessage("be:drag_message", &dragged) == B_OK;
 				this->Call(this->OnMouseMoved, point, static_cast<uint32>(transit),
-					static_cast<const BMessage*>(nullptr));
+					static_cast<const BMessage*>(isDrag ? &dragged : nullptr));
 				break;
 			}
 
@@ -107,5 +79,6 @@ private:
 		}
 	}
 
-	bool fFocused = false;
+protected:
+	const BView* FocusView() const override { return this->TextView(); }
 };
