@@ -1,0 +1,102 @@
+# What is installed, and the packages by which other projects find the libraries: the CMake packages
+# Ormi (for generated programs) and Plimworks (for component libraries), and ormi.pc. The packages are
+# made in the build folder too, for use without an installation.
+
+set(ormi_cmake_dir ${CMAKE_INSTALL_LIBDIR}/cmake/Ormi)
+set(plimworks_cmake_dir ${CMAKE_INSTALL_LIBDIR}/cmake/Plimworks)
+
+# Programs and libraries
+
+foreach(program plimworks plimgen)
+  if(TARGET ${program})
+    install(TARGETS ${program} RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})
+  endif()
+endforeach()
+install(TARGETS be ormi EXPORT OrmiTargets LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR})
+install(TARGETS plim EXPORT PlimworksTargets LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR})
+if(TARGET be_display_qt)
+  # libbe.so looks for it in its own folder.
+  install(TARGETS be_display_qt LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR})
+endif()
+
+# Component libraries
+
+get_property(component_dirs DIRECTORY ${PROJECT_SOURCE_DIR}/components PROPERTY SUBDIRECTORIES)
+foreach(dir IN LISTS component_dirs)
+  get_property(libraries DIRECTORY ${dir} PROPERTY BUILDSYSTEM_TARGETS)
+  foreach(library IN LISTS libraries)
+    get_target_property(type ${library} TYPE)
+    if(type STREQUAL "MODULE_LIBRARY")
+      set_target_properties(${library} PROPERTIES
+        INSTALL_RPATH "$ORIGIN/../../${CMAKE_INSTALL_LIBDIR}")
+      install(TARGETS ${library} LIBRARY DESTINATION ${CMAKE_INSTALL_BINDIR}/Components)
+    endif()
+  endforeach()
+endforeach()
+
+# Headers
+
+install(DIRECTORY ${PROJECT_SOURCE_DIR}/ormi/include/ DESTINATION ${PLIM_INSTALL_INCLUDEDIR}
+  FILES_MATCHING PATTERN "*.h")
+if(NOT CMAKE_SYSTEM_NAME STREQUAL "Haiku")
+  install(DIRECTORY ${PROJECT_SOURCE_DIR}/kits/include/ DESTINATION ${PLIM_INSTALL_INCLUDEDIR}/be
+    FILES_MATCHING PATTERN "*.h")
+endif()
+# ComponentKit.h and what it includes.
+install(DIRECTORY ${PROJECT_SOURCE_DIR}/src/model DESTINATION ${PLIM_INSTALL_INCLUDEDIR}/designer
+  FILES_MATCHING PATTERN "*.h")
+install(DIRECTORY ${PROJECT_SOURCE_DIR}/src/props DESTINATION ${PLIM_INSTALL_INCLUDEDIR}/designer
+  FILES_MATCHING PATTERN "*Property.h" PATTERN "PropertyEditor.h" PATTERN "StringList.h")
+install(FILES ${PROJECT_SOURCE_DIR}/src/palette/PaletteEntry.h
+  DESTINATION ${PLIM_INSTALL_INCLUDEDIR}/designer/palette)
+
+# The CMake packages
+
+include(CMakePackageConfigHelpers)
+foreach(package Ormi Plimworks)
+  string(TOLOWER ${package} lower)
+  configure_file(${PROJECT_SOURCE_DIR}/cmake/${package}Config.cmake.in
+    ${PROJECT_BINARY_DIR}/${package}Config.cmake @ONLY)
+  write_basic_package_version_file(${PROJECT_BINARY_DIR}/${package}ConfigVersion.cmake
+    COMPATIBILITY SameMinorVersion)
+  export(EXPORT ${package}Targets NAMESPACE ${package}::
+    FILE ${PROJECT_BINARY_DIR}/${package}Targets.cmake)
+  install(EXPORT ${package}Targets NAMESPACE ${package}:: DESTINATION ${${lower}_cmake_dir})
+  install(FILES ${PROJECT_BINARY_DIR}/${package}Config.cmake
+    ${PROJECT_BINARY_DIR}/${package}ConfigVersion.cmake DESTINATION ${${lower}_cmake_dir})
+endforeach()
+
+# ormi.pc
+
+# write_ormi_pc(FILE PREFIX LIBDIR INCLUDEDIR...)
+function(write_ormi_pc file prefix libdir)
+  set(ORMI_PC_PREFIX ${prefix})
+  set(ORMI_PC_LIBDIR ${libdir})
+  list(TRANSFORM ARGN PREPEND "-I")
+  list(JOIN ARGN " " ORMI_PC_CFLAGS)
+  configure_file(${PROJECT_SOURCE_DIR}/cmake/ormi.pc.in ${file} @ONLY)
+endfunction()
+
+# The folders of the kits' headers under root, where the host has none of its own.
+function(get_kit_dirs root result)
+  set(dirs "")
+  if(NOT CMAKE_SYSTEM_NAME STREQUAL "Haiku")
+    set(dirs /support /kernel /app /storage /interface)
+    list(TRANSFORM dirs PREPEND ${root})
+    list(PREPEND dirs ${root})
+  endif()
+  set(${result} ${dirs} PARENT_SCOPE)
+endfunction()
+
+get_kit_dirs(${PROJECT_SOURCE_DIR}/kits/include kit_dirs)
+write_ormi_pc(${PROJECT_BINARY_DIR}/pkgconfig/ormi.pc ${PROJECT_BINARY_DIR} "\${prefix}/lib"
+  ${PROJECT_SOURCE_DIR}/ormi/include ${kit_dirs})
+
+# The installed one finds its prefix from where it lies, so that an installation may be moved.
+file(RELATIVE_PATH pc_to_prefix ${CMAKE_INSTALL_FULL_LIBDIR}/pkgconfig ${CMAKE_INSTALL_PREFIX})
+string(REGEX REPLACE "/$" "" pc_to_prefix ${pc_to_prefix})
+get_kit_dirs("\${prefix}/${PLIM_INSTALL_INCLUDEDIR}/be" kit_dirs)
+write_ormi_pc(${PROJECT_BINARY_DIR}/pkgconfig/installed/ormi.pc "\${pcfiledir}/${pc_to_prefix}"
+  "\${prefix}/${CMAKE_INSTALL_LIBDIR}" "\${prefix}/${PLIM_INSTALL_INCLUDEDIR}" ${kit_dirs})
+install(FILES ${PROJECT_BINARY_DIR}/pkgconfig/installed/ormi.pc
+  DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig)
