@@ -251,6 +251,9 @@ QtWindow::ShowAgain()
 	if (!fIsAway)
 		return;
 	fIsAway = false;
+	// Minimized along with its parent it would come back so, and take the parent with it again.
+	if ((windowStates() & Qt::WindowMinimized) != 0)
+		setWindowStates(windowStates() & ~Qt::WindowMinimized);
 	setVisible(true);
 }
 
