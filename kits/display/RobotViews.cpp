@@ -6,6 +6,8 @@
 #include <Control.h>
 #include <OS.h>
 #include <StringView.h>
+#include <TextControl.h>
+#include <TextView.h>
 #include <View.h>
 #include <Window.h>
 
@@ -89,11 +91,19 @@ bool
 TextOf(BView* view, BString* text)
 {
 	auto string = dynamic_cast<BStringView*>(view);
+	auto textView = dynamic_cast<BTextView*>(view);
+	auto textControl = dynamic_cast<BTextControl*>(view);
 	auto control = dynamic_cast<BControl*>(view);
-	const char* found = string != nullptr ? string->Text()
-		: control != nullptr              ? control->Label()
-										  : nullptr;
-	if (string == nullptr && control == nullptr)
+	const char* found = nullptr;
+	if (string != nullptr)
+		found = string->Text();
+	else if (textView != nullptr)
+		found = textView->Text();
+	else if (textControl != nullptr)
+		found = textControl->Text();
+	else if (control != nullptr)
+		found = control->Label();
+	else
 		return false;
 	*text = found;
 	return true;
