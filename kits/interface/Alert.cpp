@@ -15,6 +15,7 @@
 #include <TextView.h>
 
 #include "ControlLook.h"
+#include "app/LooperPrivate.h"
 
 namespace {
 
@@ -301,6 +302,7 @@ BAlert::Go()
 	Show();
 
 	// From here on the alert is its own thread's, and may be gone already.
+	BPrivate::CheckWait("an alert");
 	BWindow* caller = dynamic_cast<BWindow*>(BLooper::LooperForThread(find_thread(NULL)));
 	const uint32 flags = caller != NULL ? B_RELATIVE_TIMEOUT : 0;
 	status_t status;

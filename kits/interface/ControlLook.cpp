@@ -89,7 +89,7 @@ ButtonSurfaceColor(ControlState state)
 	if (!state.enabled)
 		return BlendColors(
 			ui_color(B_PANEL_BACKGROUND_COLOR), tint_color(surface, 0.5f), kDisabledStrength);
-	return state.pressed ? tint_color(surface, B_DARKEN_2_TINT) : tint_color(surface, 0.5f);
+	return state.pressed ? tint_color(surface, B_DARKEN_1_TINT) : tint_color(surface, 0.5f);
 }
 
 
