@@ -356,6 +356,11 @@ void
 TEventForm::Button1Click(void)
 {
 	gEvents.Add(name + "Button1Click");
+	if (opensOnClick) {
+		TEventForm* other = new TEventForm;
+		other->SetTitle("opened");
+		other->Show();
+	}
 	if (quitsOnClick)
 		Quit();
 }

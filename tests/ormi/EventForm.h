@@ -82,5 +82,6 @@ public:
 	// The developer's own members.
 	bool mayQuit = true;
 	bool quitsOnClick = false;
+	bool opensOnClick = false;
 	std::string name;
 };

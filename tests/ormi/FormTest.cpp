@@ -106,6 +106,27 @@ TEST_F(FormTest, AHandlerMayQuitTheForm)
 }
 
 
+TEST_F(FormTest, AHandlerMayOpenAnotherForm)
+{
+	Open();
+	fForm->opensOnClick = true;
+	Click(BPoint(20, 20));
+	const Lines events = TakeEvents();
+	EXPECT_EQ(Count(events, "FormCreate"), 1);
+	EXPECT_EQ(Count(events, "Show"), 1);
+
+	ASSERT_EQ(fApplication.CountWindows(), 2);
+	TForm* other = dynamic_cast<TForm*>(fApplication.WindowAt(1));
+	ASSERT_NE(other, nullptr);
+	ASSERT_TRUE(other->Lock());
+	EXPECT_STREQ(other->Title(), "opened");
+	EXPECT_NE(other->Thread(), fThread);
+	other->Quit();
+	Click(BPoint(250, 150));
+	EXPECT_EQ(Count(TakeEvents(), "MouseDown 250,150"), 1);
+}
+
+
 TEST_F(FormTest, AFormMayRefuseToQuit)
 {
 	Open();
