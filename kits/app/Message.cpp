@@ -131,13 +131,18 @@ BMessage::GetInfo(type_code typeRequested, int32 index, char** nameFound, type_c
 {
 	int32 left = index;
 	bool typeExists = typeRequested == B_ANY_TYPE;
-	for (int32 i = 0; i < CountFields() && index >= 0; i++) {
-		const Field& field = fBody->Fields()[i];
-		if (typeRequested != B_ANY_TYPE && field.type != typeRequested)
-			continue;
-		typeExists = true;
-		if (left-- > 0)
-			continue;
+	const Field* fields = fBody != nullptr ? fBody->Fields() : nullptr;
+	const int32 count = index >= 0 ? CountFields() : 0;
+	// Whoever walks over all fields must not pay for the ones before.
+	for (int32 i = typeExists ? index : 0; i < count; i++) {
+		const Field& field = fields[i];
+		if (typeRequested != B_ANY_TYPE) {
+			if (field.type != typeRequested)
+				continue;
+			typeExists = true;
+			if (left-- > 0)
+				continue;
+		}
 
 		if (nameFound != nullptr)
 			*nameFound = const_cast<char*>(fBody->NameOf(field));

@@ -70,14 +70,17 @@ TGenerationRun::TGenerationRun(const generation_options& options, FILE* out, FIL
 }
 
 
+TGenerationRun::~TGenerationRun() = default;
+
+
 generation_result
 TGenerationRun::Run()
 {
 	const message_box_hook previous = SetMessageBoxHook(AnswerBox);
 	generation_result result = LoadLibraries();
 	if (result == GENERATION_DONE) {
-		TProject project(FORM_HIDDEN);
-		result = LoadProject(&project);
+		fProject = std::make_unique<TProject>(FORM_HIDDEN);
+		result = LoadProject();
 	}
 	SetMessageBoxHook(previous);
 	return result;
@@ -110,13 +113,13 @@ TGenerationRun::LoadLibraries()
 
 
 generation_result
-TGenerationRun::LoadProject(TProject* project)
+TGenerationRun::LoadProject()
 {
 	const char* path = fOptions.project.String();
 	TLoadReport report;
-	if (!project->LoadFromFile(path, &report)) {
+	if (!fProject->LoadFromFile(path, &report)) {
 		BString text("the project cannot be read (");
-		text << strerror(project->OpenStatus()) << "); name a project file (.plim)";
+		text << strerror(fProject->OpenStatus()) << "); name a project file (.plim)";
 		TellProblem(path, text.String());
 		return GENERATION_FILE_BAD;
 	}
@@ -126,20 +129,20 @@ TGenerationRun::LoadProject(TProject* project)
 		return GENERATION_FILE_BAD;
 	}
 
-	const generation_result result = SetMainForm(project);
+	const generation_result result = SetMainForm();
 	if (result != GENERATION_DONE)
 		return result;
 	if (fOptions.check)
-		return Check(project, report);
+		return Check(report);
 
 	const generation_result judged = JudgeLoad(report);
 	if (judged != GENERATION_DONE)
 		return judged;
 
-	TProjectCheck check(project->App(), path);
+	TProjectCheck check(fProject->App(), path);
 	for (const project_problem& problem : check.Run())
 		Warn(problem.file.c_str(), problem.text.c_str());
-	return Generate(project);
+	return Generate();
 }
 
 
@@ -170,31 +173,31 @@ TGenerationRun::JudgeLoad(const TLoadReport& report)
 
 
 generation_result
-TGenerationRun::SetMainForm(TProject* project)
+TGenerationRun::SetMainForm()
 {
 	if (fOptions.mainForm.Length() == 0)
 		return GENERATION_DONE;
 
-	TDesignForm* form = project->FindForm(fOptions.mainForm.String());
+	TDesignForm* form = fProject->FindForm(fOptions.mainForm.String());
 	if (form == nullptr) {
 		BString text("the project has no form '");
 		text << fOptions.mainForm << "'; give one of its forms to --main:";
-		for (int32 i = 0; i < project->CountForms(); i++)
-			text << " " << project->FormAt(i)->ComponentName();
+		for (int32 i = 0; i < fProject->CountForms(); i++)
+			text << " " << fProject->FormAt(i)->ComponentName();
 		TellProblem(fOptions.project.String(), text.String());
 		return GENERATION_USAGE_BAD;
 	}
-	project->SetMainForm(form);
+	fProject->SetMainForm(form);
 	return GENERATION_DONE;
 }
 
 
 generation_result
-TGenerationRun::Check(TProject* project, const TLoadReport& report)
+TGenerationRun::Check(const TLoadReport& report)
 {
 	for (const load_problem& problem : report.Problems())
 		TellProblem(problem.file.String(), WithAdvice(problem).c_str());
-	TProjectCheck check(project->App(), fOptions.project.String());
+	TProjectCheck check(fProject->App(), fOptions.project.String());
 	for (const project_problem& problem : check.Run())
 		TellProblem(problem.file.c_str(), problem.text.c_str());
 
@@ -209,11 +212,11 @@ TGenerationRun::Check(TProject* project, const TLoadReport& report)
 
 
 generation_result
-TGenerationRun::Generate(TProject* project)
+TGenerationRun::Generate()
 {
 	TCodeGenerator generator;
 	generator.Writer().SetDryRun(fOptions.dryRun);
-	generator.SetAppComponent(project->App());
+	generator.SetAppComponent(fProject->App());
 	const generation_result result = SetFolder(&generator);
 	if (result != GENERATION_DONE)
 		return result;

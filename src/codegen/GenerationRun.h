@@ -5,6 +5,7 @@
 
 #include <stdio.h>
 
+#include <memory>
 #include <vector>
 
 #include <String.h>
@@ -43,16 +44,20 @@ class TGenerationRun {
 public:
 	/// \a out gets the result, \a err what is wrong; both stay the caller's.
 	TGenerationRun(const generation_options& options, FILE* out, FILE* err);
+	/// Closes the project, which takes about as long as loading it.
+	~TGenerationRun();
+	TGenerationRun(const TGenerationRun&) = delete;
+	TGenerationRun& operator=(const TGenerationRun&) = delete;
 
 	generation_result Run();
 
 private:
 	generation_result LoadLibraries();
-	generation_result LoadProject(TProject* project);
+	generation_result LoadProject();
 	generation_result JudgeLoad(const TLoadReport& report);
-	generation_result SetMainForm(TProject* project);
-	generation_result Check(TProject* project, const TLoadReport& report);
-	generation_result Generate(TProject* project);
+	generation_result SetMainForm();
+	generation_result Check(const TLoadReport& report);
+	generation_result Generate();
 	generation_result SetFolder(TCodeGenerator* generator);
 	generation_result Tell(TCodeGenerator* generator);
 	void TellFile(const generated_file& file);
@@ -63,5 +68,6 @@ private:
 	const generation_options& fOptions;
 	FILE* fOut;
 	FILE* fErr;
+	std::unique_ptr<TProject> fProject;
 	int32 fProblemCount;
 };

@@ -88,27 +88,37 @@ TakeStandardOutput()
 }
 
 
-generation_result
+/// Ends the program without taking the project apart, which would take as long as loading it.
+[[noreturn]] void
+Leave(generation_result result)
+{
+	fflush(nullptr);
+	_exit(result);
+}
+
+
+[[noreturn]] void
 Generate(const generation_options& options)
 {
 	FILE* out = options.verbose ? stdout : TakeStandardOutput();
 	if (out == nullptr) {
 		fprintf(stderr, "plimgen: standard output: it cannot be used (%s); redirect it\n",
 			strerror(errno));
-		return GENERATION_FILE_BAD;
+		Leave(GENERATION_FILE_BAD);
 	}
 
 	// Windows have no pictures here, whatever display there is, and the designer's settings are not ours.
 	setenv("BE_DISPLAY", "none", 1);
 	AppSettings.LeaveFileAlone();
 	BApplication application("application/x-qtx.Plimgen");
-	generation_result result = TGenerationRun(options, out, stderr).Run();
+	TGenerationRun run(options, out, stderr);
+	generation_result result = run.Run();
 	if (fflush(out) != 0 || ferror(out) != 0) {
 		fprintf(stderr, "plimgen: standard output: it cannot be written (%s); free some space\n",
 			strerror(errno));
 		result = GENERATION_FILE_BAD;
 	}
-	return result;
+	Leave(result);
 }
 
 } // namespace
@@ -129,5 +139,5 @@ main(int argc, char** argv)
 		return GENERATION_USAGE_BAD;
 	}
 	CompleteOptions(&line);
-	return Generate(line.options);
+	Generate(line.options);
 }

@@ -87,7 +87,10 @@ TFormReader::CreateComponents(const BMessage& collection)
 {
 	char* name;
 	type_code type;
-	for (int32 i = 0; collection.GetInfo(B_MESSAGE_TYPE, i, &name, &type) == B_OK; i++) {
+	// Asking for the fields of one type would walk over all fields before each of them.
+	for (int32 i = 0; collection.GetInfo(B_ANY_TYPE, i, &name, &type) == B_OK; i++) {
+		if (type != B_MESSAGE_TYPE)
+			continue;
 		BMessage record;
 		if (collection.FindMessage(name, &record) != B_OK) {
 			printf("Warning: Unable to extract Component message\n");
