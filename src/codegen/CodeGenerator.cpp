@@ -322,9 +322,9 @@ void
 TCodeGenerator::WriteFormText(TDesignForm* form, const BString& path, BString& text)
 {
 	char buffer[kGeneratedNameSize];
-	ReplacePlaceholder(text, "$FORMNAME", form->ComponentName());
-	ReplacePlaceholder(text, "$FORMFILE", BaseFormFilename(form, buffer));
-	ReplacePlaceholder(text, "$TAB", "  ");
+	ReplacePlaceholders(text,
+		{{"$FORMNAME", form->ComponentName()}, {"$FORMFILE", BaseFormFilename(form, buffer)},
+			{"$TAB", "  "}});
 	fWriter.WriteText(path.String(), text);
 }
 
@@ -332,9 +332,10 @@ TCodeGenerator::WriteFormText(TDesignForm* form, const BString& path, BString& t
 void
 TCodeGenerator::WriteAppText(const BString& path, BString& text)
 {
-	ReplacePlaceholder(text, "$APPNAME", fAppComponent->ComponentName());
-	ReplacePlaceholder(text, "$APPSIG", PropertyText(fAppComponent, "Signature").String());
-	ReplacePlaceholder(text, "$TAB", "  ");
+	const BString signature = PropertyText(fAppComponent, "Signature");
+	ReplacePlaceholders(text,
+		{{"$APPNAME", fAppComponent->ComponentName()}, {"$APPSIG", signature.String()},
+			{"$TAB", "  "}});
 	fWriter.WriteText(path.String(), text);
 }
 

@@ -191,12 +191,11 @@ TFormSourceEmitter::EmitComponentConstructor(TComponent* component, BString& tex
 		statement << ",$PARAMS";
 	statement << ")\n  );\n";
 
-	ReplacePlaceholder(statement, "$FORMNAME", Form()->ComponentName());
-	ReplacePlaceholder(statement, "$PARENT", ParentExpression(Form(), component));
-	ReplacePlaceholder(statement, "$COMPONENT", component->ComponentName());
-	ReplacePlaceholder(statement, "$CLSNAME", component->ClassName());
-	ReplacePlaceholder(statement, "$RECT", FrameText(component).String());
-	ReplacePlaceholder(statement, "$PARAMS", params.String());
+	const BString frame = FrameText(component);
+	ReplacePlaceholders(statement,
+		{{"$FORMNAME", Form()->ComponentName()}, {"$PARENT", ParentExpression(Form(), component)},
+			{"$COMPONENT", component->ComponentName()}, {"$CLSNAME", component->ClassName()},
+			{"$RECT", frame.String()}, {"$PARAMS", params.String()}});
 	text << "$TAB// create " << component->ComponentName() << "\n" << statement;
 }
 
@@ -211,9 +210,9 @@ TFormSourceEmitter::EmitComponentPropSet(TComponent* component, BString& text)
 			continue;
 
 		BString statement = property->SetStatement();
-		ReplacePlaceholder(statement, "$COMPONENT", component->ComponentName());
-		ReplacePlaceholder(
-			statement, "$VALUE", BString(property->Value(), TPropertyText::kSize).String());
+		const BString value(property->Value(), TPropertyText::kSize);
+		ReplacePlaceholders(
+			statement, {{"$COMPONENT", component->ComponentName()}, {"$VALUE", value.String()}});
 		IndentContinuationLines(statement);
 		text << "$TAB" << statement << "\n";
 	}

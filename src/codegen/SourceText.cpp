@@ -6,6 +6,8 @@
 #include <string.h>
 #include <strings.h>
 
+#include <utility>
+
 namespace {
 
 /// Where the content of a section lies in a text: [from, to).
@@ -49,6 +51,10 @@ FindSection(const BString& text, const char* name, SectionRange* range)
 }
 
 
+/// No placeholder is longer, in bytes.
+constexpr int32 kLongestPlaceholder = 16;
+
+
 enum CommentState { kNoComment, kLineComment, kBlockComment };
 
 
@@ -67,6 +73,59 @@ NextCommentState(CommentState state, const char* at, const char* begin)
 	if (previous == '*' && state == kBlockComment)
 		return kNoComment;
 	return state;
+}
+
+
+/// The first of \a placeholders that stands at \a text, in any case of its letters; null when none does.
+const placeholder_value*
+FindPlaceholder(const char* text, std::initializer_list<placeholder_value> placeholders)
+{
+	for (const placeholder_value& each : placeholders) {
+		if (strncasecmp(text, each.placeholder, strlen(each.placeholder)) == 0)
+			return &each;
+	}
+	return nullptr;
+}
+
+
+/// Replaces all of \a placeholders at once. False, with \a text as it is, when one pass for each could come to
+/// another result: when replacing one makes another.
+bool
+ReplaceInOnePass(BString& text, std::initializer_list<placeholder_value> placeholders)
+{
+	// Most statements hold no placeholder at all: their first character settles that quickly.
+	const char* from = strchr(text.String(), '$');
+	if (from == nullptr)
+		return true;
+
+	for (const placeholder_value& each : placeholders) {
+		if (placeholders.size() > 1 && strchr(each.value, '$') != nullptr)
+			return false;
+	}
+
+	const char* copied = text.String();
+	const char* loneDollar = nullptr;
+	BString result;
+	for (; from != nullptr; from = strchr(from, '$')) {
+		const placeholder_value* found = FindPlaceholder(from, placeholders);
+		if (found == nullptr) {
+			loneDollar = from++;
+			continue;
+		}
+		if (placeholders.size() > 1 && loneDollar != nullptr
+			&& from - loneDollar < kLongestPlaceholder)
+			return false;
+
+		result.Append(copied, static_cast<int32>(from - copied));
+		result.Append(found->value);
+		copied = from + strlen(found->placeholder);
+		from = copied;
+	}
+	if (copied != text.String()) {
+		result.Append(copied);
+		text = std::move(result);
+	}
+	return true;
 }
 
 
@@ -121,29 +180,18 @@ WriteUserSection(const char* name, bool fileExists, const BString& fileText, BSt
 void
 ReplacePlaceholder(BString& text, const char* placeholder, const char* value)
 {
-	// Most statements hold no placeholder at all: their first character settles that quickly.
-	const char* from = strchr(text.String(), placeholder[0]);
-	if (from == nullptr)
+	ReplacePlaceholders(text, {{placeholder, value}});
+}
+
+
+void
+ReplacePlaceholders(BString& text, std::initializer_list<placeholder_value> placeholders)
+{
+	if (ReplaceInOnePass(text, placeholders))
 		return;
 
-	const size_t length = strlen(placeholder);
-	const char* copied = text.String();
-	BString result;
-	while (from != nullptr) {
-		if (strncasecmp(from, placeholder, length) != 0) {
-			from = strchr(from + 1, placeholder[0]);
-			continue;
-		}
-		result.Append(copied, static_cast<int32>(from - copied));
-		result.Append(value);
-		copied = from + length;
-		from = strchr(copied, placeholder[0]);
-	}
-	if (copied == text.String())
-		return;
-
-	result.Append(copied);
-	text = result;
+	for (const placeholder_value& each : placeholders)
+		ReplaceInOnePass(text, {each});
 }
 
 

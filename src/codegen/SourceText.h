@@ -5,6 +5,8 @@
 
 #include <stddef.h>
 
+#include <initializer_list>
+
 #include <String.h>
 
 /// The longest line, in bytes without its line break, that is read from an existing file.
@@ -27,6 +29,15 @@ void WriteUserSection(const char* name, bool fileExists, const BString& fileText
 /// Replaces every \a placeholder in \a text by \a value, in any case of its letters and in one pass:
 /// what was put in is not searched again.
 void ReplacePlaceholder(BString& text, const char* placeholder, const char* value);
+
+/// A word that begins with "$" and what it becomes.
+struct placeholder_value {
+	const char* placeholder;
+	const char* value;
+};
+
+/// Replaces several placeholders, one after the other: what the first put in is searched for the second.
+void ReplacePlaceholders(BString& text, std::initializer_list<placeholder_value> placeholders);
 
 /// Indents the second and every later line of a statement by two spaces.
 void IndentContinuationLines(BString& statement);

@@ -176,6 +176,39 @@ TEST(ReplacePlaceholderTest, LeavesTextWithoutThePlaceholderAlone)
 }
 
 
+TEST(ReplacePlaceholderTest, ReplacesSeveralOneAfterTheOther)
+{
+	struct replace_case {
+		const char* text;
+		const char* first;
+		const char* second;
+		const char* expected;
+	} const cases[] = {
+		{"$ONE $two $THREE", "1", "2", "1 2 $THREE"},
+		{"$one", "$TWO", "2", "2"},
+		{"$TWO $ONE", "1", "$ONE", "$ONE 1"},
+		{"$$ONE$TWO$", "", "x", "$x$"},
+	};
+	for (const replace_case& each : cases) {
+		BString text(each.text);
+		ReplacePlaceholders(text, {{"$ONE", each.first}, {"$TWO", each.second}});
+		EXPECT_STREQ(text.String(), each.expected) << each.text;
+	}
+}
+
+
+TEST(ReplacePlaceholderTest, DoesNotJoinAPlaceholderFromWhatItPutInAndWhatFollows)
+{
+	// In two passes the second finds what the first left behind: "$T" and "AB".
+	BString text("$ONEAB");
+	ReplacePlaceholders(text, {{"$ONE", "$T"}, {"$TAB", "  "}});
+	EXPECT_STREQ(text.String(), "  ");
+	BString split("$$ONETAB");
+	ReplacePlaceholders(split, {{"$ONE", ""}, {"$TAB", "  "}});
+	EXPECT_STREQ(split.String(), "  ");
+}
+
+
 TEST(IndentContinuationLinesTest, IndentsEveryLineButTheFirst)
 {
 	BString text("one\ntwo\n\nfour");
