@@ -445,8 +445,8 @@ TEST_F(FormDocumentTest, AComponentWhoseNameNoFieldCanHaveIsToldAndLeftOut)
 	EXPECT_EQ(strlen(form->ComponentAt(0)->ComponentName()), 1023u);
 	const std::string output = Save(form, fFolder / "form.frm");
 	EXPECT_TRUE(fResult);
-	EXPECT_NE(output.find("Warning: Unable to add the component to the collection\n"),
-		std::string::npos);
+	EXPECT_NE(
+		output.find("Warning: Unable to add the component to the collection\n"), std::string::npos);
 	TDesignForm* loaded = NewForm("Other");
 	Load(loaded, fFolder / "form.frm");
 	EXPECT_TRUE(fResult);
