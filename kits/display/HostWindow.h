@@ -55,7 +55,8 @@ public:
 	/// B_KEY_DOWN, B_KEY_UP, B_UNMAPPED_KEY_DOWN, B_UNMAPPED_KEY_UP, B_MODIFIERS_CHANGED: as in the API,
 	/// to the active window.
 	/// B_WINDOW_ACTIVATED: "active". B_WINDOW_MOVED: "where". B_WINDOW_RESIZED: "width", "height".
-	/// B_MINIMIZE: "minimize" (the host already did it). B_ZOOM: asked for by the host, the same.
+	/// B_MINIMIZE: "minimize" (the host already did it). What the host's zoom button does comes as a move
+	/// and a resize.
 	/// B_SCREEN_CHANGED: "frame", "mode". B_QUIT_REQUESTED: the close button.
 	virtual void Deliver(std::unique_ptr<BMessage> message) = 0;
 

@@ -33,6 +33,22 @@ const int kExitFailed = 2;
 const int kExitDidNotQuit = 3;
 
 
+std::string
+ReasonFor(status_t status)
+{
+	switch (status) {
+		case B_TIMED_OUT:
+			return "it did not happen in time";
+		case B_UNSUPPORTED:
+			return "this display draws nothing, or does not tell";
+		case B_BAD_VALUE:
+			return "there is no such window";
+		default:
+			return strerror(status);
+	}
+}
+
+
 class ScriptRunner {
 public:
 	explicit ScriptRunner(const char* path)
@@ -157,7 +173,7 @@ ScriptRunner::RunLine(const std::string& line)
 		fFound.clear();
 		status_t status = (this->*command.run)(arguments);
 		if (status != B_OK)
-			Fail("\"" + line + "\" failed: " + (fFound.empty() ? strerror(status) : fFound));
+			Fail("\"" + line + "\" failed: " + (fFound.empty() ? ReasonFor(status) : fFound));
 		return;
 	}
 	Fail("\"" + name + "\" is no command");

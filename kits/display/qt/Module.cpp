@@ -53,7 +53,9 @@ be_display_start(const char** reason)
 	// Never deleted: the program's threads may call it until the very end.
 	auto display = new QtDisplay(!BPrivate::HasWindowManager(platforms));
 	sDisplay = display;
-	if (display->Start(platforms))
+	bool isConnected = display->Start(platforms);
+	BPrivate::PlatformsConnected();
+	if (isConnected)
 		return display;
 
 	sDisplay = nullptr;

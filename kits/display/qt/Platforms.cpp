@@ -23,28 +23,44 @@ Environment(const char* name)
 
 
 /// Connects once, since Qt would end the program where it cannot.
-bool
-XServerAnswers()
-{
-	void* library = dlopen("libxcb.so.1", RTLD_NOW | RTLD_LOCAL);
-	if (library == nullptr)
-		return false;
+class XServerProbe {
+public:
+	bool Answers()
+	{
+		void* library = dlopen("libxcb.so.1", RTLD_NOW | RTLD_LOCAL);
+		if (library == nullptr)
+			return false;
+		auto connect = reinterpret_cast<Connect>(dlsym(library, "xcb_connect"));
+		auto hasError = reinterpret_cast<HasError>(dlsym(library, "xcb_connection_has_error"));
+		fDisconnect = reinterpret_cast<Disconnect>(dlsym(library, "xcb_disconnect"));
+		if (connect == nullptr || hasError == nullptr || fDisconnect == nullptr)
+			return false;
 
+		fConnection = connect(nullptr, nullptr);
+		bool answers = fConnection != nullptr && hasError(fConnection) == 0;
+		if (!answers)
+			HangUp();
+		return answers;
+	}
+
+	void HangUp()
+	{
+		if (fConnection != nullptr)
+			fDisconnect(fConnection);
+		fConnection = nullptr;
+	}
+
+private:
 	typedef void* (*Connect)(const char* display, int* screen);
 	typedef int (*HasError)(void* connection);
 	typedef void (*Disconnect)(void* connection);
-	auto connect = reinterpret_cast<Connect>(dlsym(library, "xcb_connect"));
-	auto hasError = reinterpret_cast<HasError>(dlsym(library, "xcb_connection_has_error"));
-	auto disconnect = reinterpret_cast<Disconnect>(dlsym(library, "xcb_disconnect"));
-	if (connect == nullptr || hasError == nullptr || disconnect == nullptr)
-		return false;
 
-	void* connection = connect(nullptr, nullptr);
-	bool answers = connection != nullptr && hasError(connection) == 0;
-	if (connection != nullptr)
-		disconnect(connection);
-	return answers;
-}
+	void* fConnection = nullptr;
+	Disconnect fDisconnect = nullptr;
+};
+
+
+XServerProbe sProbe;
 
 
 bool
@@ -97,7 +113,7 @@ ChoosePlatforms(std::string* reason)
 		return wanted;
 
 	std::string platforms;
-	if (wantsX && XServerAnswers())
+	if (wantsX && sProbe.Answers())
 		platforms = wanted.empty() ? "xcb" : wanted;
 	if (wantsWayland && WaylandAnswers()) {
 		if (!platforms.empty())
@@ -108,6 +124,13 @@ ChoosePlatforms(std::string* reason)
 		*reason = wantsX ? "no X server answers at \"" + display + "\""
 						 : "no Wayland compositor answers at \"" + wayland + "\"";
 	return platforms;
+}
+
+
+void
+PlatformsConnected()
+{
+	sProbe.HangUp();
 }
 
 

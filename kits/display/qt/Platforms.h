@@ -13,6 +13,10 @@ namespace BPrivate {
 /// not answer.
 std::string ChoosePlatforms(std::string* reason);
 
+/// To be called once Qt has connected, or has not. Until then the connection that asked the X server is
+/// kept: some servers start afresh, and refuse others for a moment, when their last client leaves.
+void PlatformsConnected();
+
 /// Whether the platform has a window manager that raises and activates windows.
 bool HasWindowManager(const std::string& platforms);
 
