@@ -47,6 +47,7 @@ TEST(DocumentFileTest, WhatWasSavedIsOpenedWithItsCode)
 TEST(DocumentFileTest, SavingRecordsTypeAndPreferredApplication)
 {
 	TemporaryFolder folder;
+	SKIP_WITHOUT_ATTRIBUTES(folder);
 	TPLIMFile file(kType);
 	file.SetFilename((folder / "document").c_str());
 	ASSERT_TRUE(file.SaveFile());

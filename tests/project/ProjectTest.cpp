@@ -308,6 +308,7 @@ TEST_F(ProjectTest, FormPathsThatAreNotAbsoluteStartAtTheProjectsFolder)
 
 TEST_F(ProjectTest, TheMainFormIsRememberedBesideTheDocument)
 {
+	SKIP_WITHOUT_ATTRIBUTES(fFolder);
 	TProject project(FORM_HIDDEN);
 	AddForm(project, "Form1", "1.frm");
 	AddForm(project, "Form2", "2.frm");
@@ -331,6 +332,7 @@ TEST_F(ProjectTest, TheMainFormIsRememberedBesideTheDocument)
 
 TEST_F(ProjectTest, AMainFormThatIsGoneIsNoMainForm)
 {
+	SKIP_WITHOUT_ATTRIBUTES(fFolder);
 	TProject project(FORM_HIDDEN);
 	AddForm(project, "Form1", "1.frm");
 	Save(project, fFolder / "test.plim");

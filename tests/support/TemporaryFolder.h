@@ -4,6 +4,8 @@
 #ifndef TESTS_SUPPORT_TEMPORARY_FOLDER_H
 #define TESTS_SUPPORT_TEMPORARY_FOLDER_H
 
+#include <sys/xattr.h>
+
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
@@ -57,9 +59,21 @@ public:
 		std::filesystem::create_symlink(target, *this / name);
 	}
 
+	/// Whether files here can have attributes; not every file system keeps them.
+	bool KeepsAttributes() const
+	{
+		return setxattr(fPath.c_str(), "user.probe", "x", 1, 0) == 0
+			&& removexattr(fPath.c_str(), "user.probe") == 0;
+	}
+
 private:
 	std::string fPath;
 };
+
+/// Skips the test where files have no attributes.
+#define SKIP_WITHOUT_ATTRIBUTES(folder)                                                            \
+	if (!(folder).KeepsAttributes())                                                               \
+	GTEST_SKIP() << "the temporary folder has no extended attributes"
 
 /// Sets a variable of the environment, and puts the old value back at the end.
 class ScopedVariable {
