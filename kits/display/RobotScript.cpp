@@ -2,10 +2,13 @@
 // A script that uses the running program like a person; docs/robot.md describes its commands.
 #include "display/RobotScript.h"
 
+#include <chrono>
+#include <condition_variable>
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
 #include <fstream>
+#include <mutex>
 #include <string>
 #include <thread>
 #include <vector>
@@ -46,6 +49,55 @@ ReasonFor(status_t status)
 		default:
 			return strerror(status);
 	}
+}
+
+
+/// Lets the program's end wait for the script's thread, which must not be in the middle of the kits
+/// while their static objects go.
+class ScriptEnd {
+public:
+	/// Between two commands: does not return once the program ends.
+	void LeaveIfEnding()
+	{
+		std::unique_lock<std::mutex> lock(fMutex);
+		if (!fEnding)
+			return;
+		fHasLeft = true;
+		fCondition.notify_all();
+		lock.unlock();
+		for (;;)
+			pause();
+	}
+
+	void HasLeft()
+	{
+		std::lock_guard<std::mutex> lock(fMutex);
+		fHasLeft = true;
+		fCondition.notify_all();
+	}
+
+	/// While the program ends: waits for the running command, but no longer than it may take to see that
+	/// there is nobody left to talk to.
+	void Wait()
+	{
+		std::unique_lock<std::mutex> lock(fMutex);
+		fEnding = true;
+		fCondition.wait_for(lock, std::chrono::seconds(3), [this] { return fHasLeft; });
+	}
+
+private:
+	std::mutex fMutex;
+	std::condition_variable fCondition;
+	bool fEnding = false;
+	bool fHasLeft = false;
+};
+
+
+ScriptEnd&
+End()
+{
+	static auto end = new ScriptEnd;
+	return *end;
 }
 
 
@@ -152,6 +204,7 @@ ScriptRunner::Run()
 	while (std::getline(file, line)) {
 		fLine++;
 		RunLine(line);
+		End().LeaveIfEnding();
 	}
 }
 
@@ -523,7 +576,8 @@ ScriptRunner::Quit(const Arguments&)
 {
 	fflush(stdout);
 	be_app_messenger.SendMessage(B_QUIT_REQUESTED);
-	// The program's end ends this thread too.
+	// The program's end ends this thread too, which uses the kits no more.
+	End().HasLeft();
 	snooze(fRobot.Limit());
 	fprintf(stderr, "robot: %s:%d: the program does not quit\n", fPath.c_str(), fLine);
 	for (const BString& title : fRobot.WindowTitles())
@@ -544,7 +598,11 @@ StartRobotScript()
 	std::string script = path;
 	// Programs that this one starts have nothing to do with the script.
 	unsetenv("BE_ROBOT_SCRIPT");
-	std::thread([script] { ScriptRunner(script.c_str()).Run(); }).detach();
+	atexit([] { End().Wait(); });
+	std::thread([script] {
+		ScriptRunner(script.c_str()).Run();
+		End().HasLeft();
+	}).detach();
 }
 
 } // namespace BPrivate
