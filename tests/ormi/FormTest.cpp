@@ -4,6 +4,7 @@
 #include <ormi/Form.h>
 
 #include <string>
+#include <vector>
 
 #include "EventFormFixture.h"
 #include "support/Printers.h"
@@ -274,6 +275,48 @@ TEST_F(FormTest, EachInstanceHasHandlersOfItsOwn)
 	gEvents.Take();
 	Pointer(B_MOUSE_MOVED, BPoint(200, 150));
 	EXPECT_EQ(TakeEvents(), Lines{"MouseMoved 200,150,0"});
+}
+
+
+TEST_F(FormTest, AComponentMayBeInvisibleFromTheBeginning)
+{
+	Locked([&] { fForm->Button1->SetVisible(false); });
+	Open();
+	Locked([&] { EXPECT_TRUE(fForm->Button1->IsHidden()); });
+	Click(BPoint(20, 20));
+	EXPECT_EQ(TakeEvents(), (Lines{"MouseDown 20,20", "MouseUp 20,20"}));
+	Locked([&] { fForm->Button1->SetVisible(true); });
+	Click(BPoint(20, 20));
+	EXPECT_EQ(Count(TakeEvents(), "Button1Click"), 1);
+}
+
+
+TEST_F(FormTest, ManyFormsOpenAndCloseAtOnce)
+{
+	const int kForms = 40;
+	gEvents.Take();
+	std::vector<thread_id> threads;
+	for (int i = 0; i < kForms; i++) {
+		TEventForm* form = new TEventForm;
+		form->Show();
+		threads.push_back(form->Thread());
+		BMessage active(B_WINDOW_ACTIVATED);
+		active.AddBool("active", true);
+		form->PostMessage(&active);
+		PointerIn(form, B_MOUSE_DOWN, BPoint(20, 20), B_PRIMARY_MOUSE_BUTTON);
+		PointerIn(form, B_MOUSE_UP, BPoint(20, 20));
+		form->PostMessage(B_QUIT_REQUESTED);
+	}
+	for (thread_id thread : threads) {
+		status_t result;
+		wait_for_thread(thread, &result);
+	}
+	const Lines events = gEvents.Take();
+	EXPECT_EQ(Count(events, "FormCreate"), kForms);
+	EXPECT_EQ(Count(events, "Button1Click"), kForms);
+	EXPECT_EQ(Count(events, "AllDetached"), kForms);
+	EXPECT_EQ(Count(events, "FormDestroy text"), kForms);
+	EXPECT_EQ(fApplication.CountWindows(), 1);
 }
 
 
