@@ -24,7 +24,8 @@ constexpr uint32 kMsgAnswer = '_ans'; // "which" (int32)
 constexpr float kMargin = 12;
 constexpr float kIconSize = 32;
 constexpr float kStripeWidth = 30;
-constexpr float kTextWidth = 300;
+// The text is as wide as the first of these that keeps the alert lower than half of the screen.
+constexpr float kTextWidths[] = {300, 450, 600};
 constexpr float kUsualButtonWidth = 75;
 constexpr float kOffsetGap = 40;
 // While a window waits for an alert it looks after its picture this often.
@@ -429,12 +430,19 @@ BAlert::LayOut()
 	if (fSpacing == B_OFFSET_SPACING)
 		buttons += kOffsetGap;
 
-	const float width = std::max(textLeft + kTextWidth + kMargin, kStripeWidth + buttons);
+	const float highest = BScreen(B_MAIN_SCREEN_ID).Frame().Height() / 2;
+	float width = 0;
+	float textHeight = 0;
 	fTextView->MoveTo(textLeft, kMargin);
-	fTextView->ResizeTo(width - textLeft - kMargin, 10);
-	fTextView->SetTextRect(fTextView->Bounds());
-	const float textHeight =
-		std::max(fTextView->TextHeight(0, fTextView->CountLines() - 1), kIconSize);
+	for (float textWidth : kTextWidths) {
+		width = std::max(textLeft + textWidth + kMargin, kStripeWidth + buttons);
+		fTextView->ResizeTo(width - textLeft - kMargin, 10);
+		fTextView->SetTextRect(fTextView->Bounds());
+		textHeight = fTextView->TextHeight(0, fTextView->CountLines() - 1);
+		if (textHeight <= highest)
+			break;
+	}
+	textHeight = std::max(textHeight, kIconSize);
 	fTextView->ResizeTo(width - textLeft - kMargin, textHeight);
 
 	const float top = kMargin + textHeight + kMargin;

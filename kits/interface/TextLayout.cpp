@@ -51,6 +51,7 @@ CharacterBefore(const std::string& text, int32 offset)
 TextLayout::TextLayout()
 	: fText(nullptr),
 	  fStarts(1, 0),
+	  fWidth(0),
 	  fTabWidth(28),
 	  fAscent(0),
 	  fLineHeight(0)
@@ -63,6 +64,7 @@ TextLayout::SetTo(const std::string& text, const BFont& font, float width, float
 {
 	fText = &text;
 	fFont = font;
+	fWidth = width;
 	fTabWidth = tabWidth;
 	font_height height;
 	fFont.GetHeight(&height);
@@ -70,21 +72,54 @@ TextLayout::SetTo(const std::string& text, const BFont& font, float width, float
 	fLineHeight = fAscent + std::ceil(height.descent) + std::ceil(height.leading);
 
 	fStarts.assign(1, 0);
-	const int32 size = static_cast<int32>(text.size());
-	int32 start = 0;
-	while (start < size) {
-		const size_t newline = text.find('\n', start);
-		const int32 end = newline == std::string::npos ? size : static_cast<int32>(newline);
-		while (width > 0) {
-			const int32 next = BreakLine(start, end, width);
-			if (next >= end)
+	AddLines(0, static_cast<int32>(text.size()));
+}
+
+
+void
+TextLayout::Update(int32 offset, int32 removed, int32 inserted)
+{
+	int32 first = LineAt(offset);
+	while (first > 0 && (*fText)[fStarts[first] - 1] != '\n')
+		first--;
+	const int32 start = fStarts[first];
+
+	// From the next paragraph on the lines are the same, only further on or back.
+	std::vector<int32> rest;
+	const size_t newline = fText->find('\n', offset + inserted);
+	const bool hasRest = newline != std::string::npos;
+	const int32 end = static_cast<int32>(hasRest ? newline : fText->size());
+	if (hasRest) {
+		const int32 shift = inserted - removed;
+		rest.assign(
+			std::lower_bound(fStarts.begin(), fStarts.end(), end + 1 - shift), fStarts.end());
+		for (int32& lineStart : rest)
+			lineStart += shift;
+	}
+	fStarts.resize(first + 1);
+	AddLines(start, end);
+	fStarts.insert(fStarts.end(), rest.begin(), rest.end());
+}
+
+
+/// Adds the starts of the lines behind the first one, which begins at \a start, up to \a end.
+void
+TextLayout::AddLines(int32 start, int32 end)
+{
+	while (true) {
+		const size_t newline = fText->find('\n', start);
+		const bool isLast = newline == std::string::npos || static_cast<int32>(newline) >= end;
+		const int32 paragraphEnd = isLast ? end : static_cast<int32>(newline);
+		while (fWidth > 0 && start < paragraphEnd) {
+			const int32 next = BreakLine(start, paragraphEnd, fWidth);
+			if (next >= paragraphEnd)
 				break;
 			fStarts.push_back(next);
 			start = next;
 		}
-		if (newline == std::string::npos)
-			break;
-		start = end + 1;
+		if (isLast)
+			return;
+		start = paragraphEnd + 1;
 		fStarts.push_back(start);
 	}
 }

@@ -20,6 +20,10 @@ public:
 	/// The layout refers to \a text until the next call.
 	void SetTo(const std::string& text, const BFont& font, float width, float tabWidth);
 
+	/// The text was changed: \a removed bytes at \a offset gave way to \a inserted ones. Lays out the
+	/// paragraphs that this touched only.
+	void Update(int32 offset, int32 removed, int32 inserted);
+
 	int32 CountLines() const { return static_cast<int32>(fStarts.size()); }
 
 	/// The first byte of a line, and the byte behind its last visible one (before a line break).
@@ -45,10 +49,12 @@ public:
 private:
 	float WidthOf(int32 from, int32 to) const;
 	int32 BreakLine(int32 start, int32 end, float width) const;
+	void AddLines(int32 start, int32 end);
 
 	const std::string* fText;
 	BFont fFont;
 	std::vector<int32> fStarts;
+	float fWidth;
 	float fTabWidth;
 	float fAscent;
 	float fLineHeight;

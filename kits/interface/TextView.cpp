@@ -96,6 +96,7 @@ BTextView::BTextView(BMessage* archive)
 	  fAutoindent(false),
 	  fSelecting(false)
 {
+	Relayout();
 	archive->FindRect("_trect", &fTextRect);
 	archive->FindColor("_tcolor", &fColor);
 	const char* text;

@@ -108,7 +108,8 @@ BTextView::InsertText(const char* text, int32 length, int32 offset, const text_r
 {
 	fText.insert(offset, text, length);
 	fChanged = true;
-	Relayout();
+	fLayout->Update(offset, 0, length);
+	InvalidateText();
 }
 
 
@@ -117,7 +118,8 @@ BTextView::DeleteText(int32 fromOffset, int32 toOffset)
 {
 	fText.erase(fromOffset, toOffset - fromOffset);
 	fChanged = true;
-	Relayout();
+	fLayout->Update(fromOffset, toOffset - fromOffset, 0);
+	InvalidateText();
 }
 
 

@@ -307,8 +307,9 @@ BNode::GetNextAttrName(char* buffer)
 	const dirent* entry = fs_read_attr_dir(fAttributes->directory);
 	if (entry == nullptr)
 		return B_ENTRY_NOT_FOUND;
-	strncpy(buffer, entry->d_name, B_ATTR_NAME_LENGTH - 1);
-	buffer[B_ATTR_NAME_LENGTH - 1] = '\0';
+	const size_t length = strnlen(entry->d_name, B_ATTR_NAME_LENGTH - 1);
+	memcpy(buffer, entry->d_name, length);
+	buffer[length] = '\0';
 	return B_OK;
 }
 

@@ -179,6 +179,21 @@ TEST_F(AlertTest, LongTextWrapsAndMakesTheAlertHigher)
 }
 
 
+TEST_F(AlertTest, VeryLongTextMakesTheAlertWider)
+{
+	BAlert* alert = Make("A");
+	const float width = alert->Bounds().Width();
+	std::string text;
+	for (int i = 0; i < 100; i++)
+		text += "a long line of text that needs most of the width\n";
+	alert->SetText(text.c_str());
+	EXPECT_GT(alert->Bounds().Width(), width);
+	alert->SetText("short");
+	EXPECT_EQ(alert->Bounds().Width(), width);
+	Drop(alert);
+}
+
+
 TEST_F(AlertTest, GoReturnsTheIndexOfTheClickedButton)
 {
 	Ask(Make("A", "B", "C"));

@@ -445,6 +445,31 @@ TEST_F(TextViewTest, LinesBreakBetweenWords)
 }
 
 
+TEST_F(TextViewTest, LinesAreThoseOfTheWholeTextAfterEachChange)
+{
+	const char* const kPieces[] = {"a", "\n", "two words ", "\n\n", "ä", "\t",
+		"several words that do not fit into one line\nand some more of them "};
+	uint32 random = 1;
+	const auto next = [&random](uint32 limit) {
+		random = random * 1103515245 + 12345;
+		return static_cast<int32>((random >> 16) % limit);
+	};
+	BTextView whole(BRect(0, 0, 199, 99), "whole", BRect(4, 4, 195, 95), B_FOLLOW_NONE, 0);
+	for (int round = 0; round < 300; round++) {
+		const int32 offset = next(fView->TextLength() + 1);
+		if (next(3) == 0)
+			fView->Delete(offset, offset + next(30));
+		else
+			fView->Insert(offset, kPieces[next(B_COUNT_OF(kPieces))], 100);
+
+		whole.SetText(fView->Text());
+		ASSERT_EQ(fView->CountLines(), whole.CountLines()) << round << ": " << fView->Text();
+		for (int32 line = 0; line < whole.CountLines(); line++)
+			ASSERT_EQ(fView->OffsetAt(line), whole.OffsetAt(line)) << round << ", line " << line;
+	}
+}
+
+
 TEST_F(TextViewTest, WordWiderThanTheLineIsBroken)
 {
 	fView->SetText("mmmmmmmmmmmmmmmmmmmmmmmmmmmmmmmmmmmmmmmmmmmmmm");
