@@ -9,10 +9,12 @@
 #include <pthread.h>
 #include <unistd.h>
 
+#include <QClipboard>
 #include <QCoreApplication>
 #include <QEvent>
 #include <QGuiApplication>
 #include <QObject>
+#include <QPointingDevice>
 
 namespace BPrivate {
 
@@ -118,6 +120,10 @@ DisplayThread::Main(const std::string& platforms, const std::function<void()>& s
 		application = std::make_unique<QGuiApplication>(count, argv);
 	}
 	QGuiApplication::setQuitOnLastWindowClosed(false);
+	// These make static objects when they are first asked for, which have to be there before the
+	// display is stopped at the program's end.
+	QPointingDevice::primaryPointingDevice();
+	QInputDevice::primaryKeyboard();
 	bool succeeded = QGuiApplication::platformName().toStdString() != fallback
 		|| platforms.find(fallback) != std::string::npos;
 	Waker waker([this] { RunTasks(); });
@@ -137,8 +143,17 @@ DisplayThread::Main(const std::string& platforms, const std::function<void()>& s
 	if (succeeded)
 		QGuiApplication::exec();
 
-	std::lock_guard<std::mutex> lock(fMutex);
-	fWaker = nullptr;
+	{
+		std::lock_guard<std::mutex> lock(fMutex);
+		fWaker = nullptr;
+	}
+	// The program is at its end, and static objects of Qt that came up late are gone already: taking
+	// Qt apart could meet them. Only what is on the clipboard has to be handed over to the host, which
+	// the application object's destructor does.
+	bool keepsClipboard = succeeded && QGuiApplication::clipboard()->ownsClipboard()
+		&& QGuiApplication::platformName() == QLatin1String("xcb");
+	if (succeeded && !keepsClipboard)
+		application.release();
 }
 
 
