@@ -34,5 +34,14 @@ function(plim_test name)
     "HOME=${CMAKE_BINARY_DIR}/tests/home" "XDG_CONFIG_HOME=${CMAKE_BINARY_DIR}/tests/home/.config"
     "XDG_DATA_HOME=${CMAKE_BINARY_DIR}/tests/home/.local/share" ${arg_ENVIRONMENT})
   gtest_discover_tests(${name} TEST_PREFIX ${name}. DISCOVERY_TIMEOUT 60 DISCOVERY_MODE PRE_TEST
-    PROPERTIES TIMEOUT 120 ENVIRONMENT "${environment}")
+    PROPERTIES TIMEOUT 120)
+  # Only the first value of a list would get through there: the tests get it once they are known.
+  set(script ${CMAKE_CURRENT_BINARY_DIR}/${name}_environment.cmake)
+  file(CONFIGURE OUTPUT ${script} @ONLY CONTENT
+    [=[
+if(@name@_TESTS)
+  set_tests_properties(${@name@_TESTS} PROPERTIES ENVIRONMENT "@environment@")
+endif()
+]=])
+  set_property(DIRECTORY APPEND PROPERTY TEST_INCLUDE_FILES ${script})
 endfunction()
