@@ -9,6 +9,9 @@ namespace BPrivate {
 
 namespace {
 
+// Words are measured after so many bytes, and at their end.
+constexpr int32 kMeasuredPiece = 64;
+
 bool
 IsContinuation(char byte)
 {
@@ -220,10 +223,17 @@ TextLayout::BreakLine(int32 start, int32 end, float width) const
 	int32 offset = start;
 	while (offset < end) {
 		int32 next = offset;
-		// Word by word: a paragraph may be long, a line is not.
-		while (next < end && (*fText)[next] != ' ' && (*fText)[next] != '\t')
-			next++;
-		if (WidthOf(start, next) > width)
+		// Word by word, and a long word in pieces: a paragraph may be long, a line is not.
+		int32 measured = offset;
+		bool fits = true;
+		while (fits && next < end && (*fText)[next] != ' ' && (*fText)[next] != '\t') {
+			next += CharacterLength(*fText, next);
+			if (next - measured >= kMeasuredPiece) {
+				fits = WidthOf(start, next) <= width;
+				measured = next;
+			}
+		}
+		if (!fits || WidthOf(start, next) > width)
 			break;
 		// Blanks at the end of a line may stick out.
 		while (next < end && ((*fText)[next] == ' ' || (*fText)[next] == '\t'))

@@ -2,6 +2,8 @@
 // Tests of BTextView: text, selection, lines, keys, mouse, clipboard and undo.
 #include <TextView.h>
 
+#include <cmath>
+
 #include <Clipboard.h>
 
 #include "ControlsFixture.h"
@@ -477,6 +479,19 @@ TEST_F(TextViewTest, WordWiderThanTheLineIsBroken)
 	EXPECT_LE(fView->LineWidth(0), 191);
 	fView->SetTextRect(BRect(0, 0, 0, 10));
 	EXPECT_EQ(fView->CountLines(), 46) << "one character a line at least";
+}
+
+
+TEST_F(TextViewTest, LongWordThatFitsIsNotBroken)
+{
+	std::string word;
+	for (int i = 0; i < 100; i++)
+		word += "ä";
+	fView->SetTextRect(BRect(0, 0, std::ceil(fView->StringWidth(word.c_str())), 10));
+	fView->SetText(("a " + word + " b").c_str());
+	ASSERT_EQ(fView->CountLines(), 3);
+	EXPECT_EQ(fView->OffsetAt(static_cast<int32>(1)), 2);
+	EXPECT_EQ(fView->OffsetAt(static_cast<int32>(2)), 203);
 }
 
 
