@@ -212,8 +212,8 @@ bool
 Robot::SettleOnce()
 {
 	// A test may do without the application's loop.
-	bool settled = be_app == nullptr || !LooperAccess::IsRunning(be_app)
-		|| Ping(be_app_messenger, kBusyTime);
+	bool settled =
+		be_app == nullptr || !LooperAccess::IsRunning(be_app) || Ping(be_app_messenger, kBusyTime);
 	for (int32 i = 0; be_app != nullptr && i < be_app->CountWindows(); i++) {
 		BWindow* window = be_app->WindowAt(i);
 		if (window == nullptr || window->LockWithTimeout(kBusyTime) != B_OK) {
