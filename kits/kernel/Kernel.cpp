@@ -33,6 +33,7 @@ std::mutex sLock;
 KERNEL_TLS Thread* tThread = nullptr;
 KERNEL_TLS volatile sig_atomic_t tShieldDepth = 0;
 KERNEL_TLS volatile sig_atomic_t tOwnInterrupt = 0;
+KERNEL_TLS bool tIsEnding = false;
 
 
 struct ThreadTable {
@@ -76,6 +77,12 @@ handle_stop_signal(int)
 void
 release_current_thread(void* value)
 {
+	// Libraries of the host clean up by keys of their own, in an order that nobody promises. The value
+	// is kept for one more round, which comes after theirs.
+	if (!tIsEnding && pthread_setspecific(table().key, value) == 0) {
+		tIsEnding = true;
+		return;
+	}
 	std::unique_ptr<std::shared_ptr<Thread>> thread(static_cast<std::shared_ptr<Thread>*>(value));
 	if ((*thread)->kind == Thread::Kind::kForeign)
 		run_exit_callbacks(thread->get());
