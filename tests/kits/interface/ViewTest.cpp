@@ -2,7 +2,6 @@
 // Tests of BView: the tree, its hooks, coordinates, resizing and the graphics state.
 #include <View.h>
 
-#include <chrono>
 
 #include <MessageFilter.h>
 #include <Region.h>
@@ -507,19 +506,7 @@ TEST_F(ViewTest, ArchivesKeepTheTree)
 }
 
 
-TEST_F(ViewTest, AThousandViewsAreCheap)
+TEST_F(ViewTest, AViewIsSmall)
 {
 	EXPECT_LE(sizeof(BView), 256u);
-
-	BWindow* window = MakeWindow();
-	auto start = std::chrono::steady_clock::now();
-	BView* parent = MakeView("parent", BRect(0, 0, 999, 999));
-	window->AddChild(parent);
-	for (int i = 0; i < 1000; i++)
-		parent->AddChild(MakeView("child", BRect(i, i, i + 9, i + 9)));
-	auto took = std::chrono::steady_clock::now() - start;
-	RecordProperty(
-		"microseconds", std::chrono::duration_cast<std::chrono::microseconds>(took).count());
-	EXPECT_LT(took, std::chrono::milliseconds(100));
-	window->Quit();
 }
