@@ -78,7 +78,7 @@ BMessage::Clear()
 		SendReply(B_NO_REPLY);
 
 	fIsLive = false;
-	free(fBody);
+	Body::Destroy(fBody);
 	fBody = nullptr;
 	delete fOriginal;
 	fOriginal = nullptr;
@@ -110,6 +110,7 @@ BMessage::CopyFrom(const BMessage& other)
 	fBody->dataSize = other.fBody->dataSize;
 	memcpy(fBody->Fields(), other.fBody->Fields(), fBody->fieldCount * sizeof(Field));
 	memcpy(fBody->Data(), other.fBody->Data(), fBody->dataSize);
+	fBody->IndexNames();
 }
 
 
@@ -129,21 +130,34 @@ status_t
 BMessage::GetInfo(type_code typeRequested, int32 index, char** nameFound, type_code* typeFound,
 	int32* countFound) const
 {
-	int32 left = index;
 	bool typeExists = typeRequested == B_ANY_TYPE;
-	const Field* fields = fBody != nullptr ? fBody->Fields() : nullptr;
+	int32 i = 0;
+	int32 left = index;
 	const int32 count = index >= 0 ? CountFields() : 0;
-	// Whoever walks over all fields must not pay for the ones before.
-	for (int32 i = typeExists ? index : 0; i < count; i++) {
-		const Field& field = fields[i];
-		if (typeRequested != B_ANY_TYPE) {
-			if (field.type != typeRequested)
-				continue;
-			typeExists = true;
-			if (left-- > 0)
-				continue;
+	if (typeExists) {
+		i = index;
+		left = 0;
+	} else if (count > 0) {
+		const uint64 cursor = fBody->NameCursor();
+		const int32 cursorField = int32(uint32(cursor));
+		const int32 cursorIndex = int32(cursor >> 32);
+		if (cursorIndex <= index && fBody->Fields()[cursorField].type == typeRequested
+			&& cursorField > 0) {
+			i = cursorField;
+			left = index - cursorIndex;
 		}
+	}
 
+	for (; i < count; i++) {
+		const Field& field = fBody->Fields()[i];
+		if (typeRequested != B_ANY_TYPE && field.type != typeRequested)
+			continue;
+		typeExists = true;
+		if (left-- > 0)
+			continue;
+
+		if (typeRequested != B_ANY_TYPE)
+			fBody->SetNameCursor(uint64(index) << 32 | uint32(i));
 		if (nameFound != nullptr)
 			*nameFound = const_cast<char*>(fBody->NameOf(field));
 		if (typeFound != nullptr)
@@ -480,6 +494,7 @@ BMessage::Rename(const char* oldEntry, const char* newEntry)
 		return status;
 
 	memcpy(fBody->Data() + offset, newEntry, nameLength);
+	fBody->DropNames();
 	Unlink(index);
 	Field& field = fBody->Fields()[index];
 	field.nameLength = uint16(nameLength);

@@ -12,6 +12,9 @@ static_assert(std::endian::native == std::endian::little);
 
 inline constexpr uint32 kBucketCount = 5;
 
+/// Messages with that many fields have a table of their names.
+inline constexpr uint32 kIndexedFieldCount = 64;
+
 /// The most bytes that the names and items of one message can take.
 inline constexpr uint32 kMaxDataSize = 0x7fffffff;
 
@@ -51,11 +54,23 @@ struct BMessage::Body {
 	uint32 dataCapacity;
 	// The variable item that was found last, index << 32 | offset of its size word, or 0: a loop over
 	// the items of a field would else walk from the first one each time. Several threads may be
-	// reading, so it is only touched by the two functions below.
+	// reading, so it is only touched by the functions below.
 	uint64 cursor;
+	// The field that GetInfo() found last, index among the fields of its type << 32 | field: a loop over
+	// the names would else count from the first field each time. Read and written as the other.
+	uint64 nameCursor;
 
-	/// An empty body with room for that much; null when there is no memory. Freed with free().
+	// The last field of each hash chain, or -1 when it is not known: adding at the end need not walk there.
+	int32 lastLinks[kBucketCount];
+	// The fields by name, for messages with many of them, whose five chains are long: a hash table with
+	// open addressing, a power of two in size, -1 where it is empty. Null without.
+	int32* names;
+	uint32 namesSize;
+
+	/// An empty body with room for that much; null when there is no memory.
 	static Body* Create(uint32 fieldCapacity, uint32 dataCapacity);
+	/// Frees the body, which may be null.
+	static void Destroy(Body* body);
 
 	Field* Fields() { return reinterpret_cast<Field*>(this + 1); }
 	uint8* Data() { return reinterpret_cast<uint8*>(Fields() + fieldCapacity); }
@@ -64,8 +79,22 @@ struct BMessage::Body {
 		return reinterpret_cast<const char*>(Data()) + field.offset;
 	}
 
+	/// Makes the table of names when there are enough fields for one; without memory there is none.
+	void IndexNames();
+	/// The slot of the table with the field of that name, or the empty one where it belongs.
+	int32* NameSlot(const char* name, uint32 nameLength, uint32 hash);
+	/// Enters a field that was linked at the end of its chain.
+	void AddName(int32 index);
+	/// Forgets the table and the ends of the chains, before a field goes or gets another name.
+	void DropNames();
+
 	uint64 Cursor() { return __atomic_load_n(&cursor, __ATOMIC_RELAXED); }
 	void SetCursor(uint64 position) { __atomic_store_n(&cursor, position, __ATOMIC_RELAXED); }
+	uint64 NameCursor() { return __atomic_load_n(&nameCursor, __ATOMIC_RELAXED); }
+	void SetNameCursor(uint64 position)
+	{
+		__atomic_store_n(&nameCursor, position, __ATOMIC_RELAXED);
+	}
 };
 
 

@@ -2,6 +2,7 @@
 // The fields of a message in memory: finding, adding, removing, and the hash chains between them.
 
 #include <algorithm>
+#include <bit>
 #include <cstdlib>
 #include <cstring>
 
@@ -22,7 +23,98 @@ BMessage::Body::Create(uint32 fieldCapacity, uint32 dataCapacity)
 	body->fieldCapacity = fieldCapacity;
 	body->dataCapacity = dataCapacity;
 	body->cursor = 0;
+	body->nameCursor = 0;
+	std::fill_n(body->lastLinks, kBucketCount, -1);
+	body->names = nullptr;
+	body->namesSize = 0;
 	return body;
+}
+
+
+void
+BMessage::Body::Destroy(Body* body)
+{
+	if (body != nullptr)
+		free(body->names);
+	free(body);
+}
+
+
+void
+BMessage::Body::IndexNames()
+{
+	free(names);
+	names = nullptr;
+	namesSize = 0;
+	if (fieldCount < kIndexedFieldCount)
+		return;
+
+	// At most half full now, and refilled when three quarters are.
+	const uint32 size = std::bit_ceil(fieldCount * 2);
+	names = static_cast<int32*>(malloc(size * sizeof(int32)));
+	if (names == nullptr)
+		return;
+	namesSize = size;
+	std::fill_n(names, size, -1);
+
+	// What a walk along the chain would find: the first field of its name, in the chain of its name.
+	for (uint32 bucket = 0; bucket < kBucketCount; bucket++) {
+		for (int32 i = buckets[bucket]; i >= 0; i = Fields()[i].next) {
+			const Field& field = Fields()[i];
+			if (field.hash % kBucketCount != bucket)
+				continue;
+			int32* slot = NameSlot(NameOf(field), field.nameLength, field.hash);
+			if (*slot < 0)
+				*slot = i;
+		}
+	}
+}
+
+
+int32*
+BMessage::Body::NameSlot(const char* name, uint32 nameLength, uint32 hash)
+{
+	// Fibonacci hashing: the low bits of the hash know the last letters only.
+	const int shift = std::countl_zero(namesSize - 1);
+	uint32 slot = (hash * 2654435769u) >> shift;
+	for (;; slot = (slot + 1) & (namesSize - 1)) {
+		if (names[slot] < 0)
+			return &names[slot];
+		const Field& field = Fields()[names[slot]];
+		if (field.hash == hash && field.nameLength == nameLength
+			&& memcmp(NameOf(field), name, nameLength) == 0)
+			return &names[slot];
+	}
+}
+
+
+void
+BMessage::Body::AddName(int32 index)
+{
+	if (names == nullptr) {
+		// Not with every field: a table that there was no memory for, or that was dropped, can wait.
+		if (std::has_single_bit(fieldCount))
+			IndexNames();
+		return;
+	}
+	if (fieldCount > namesSize / 4 * 3) {
+		IndexNames();
+		return;
+	}
+	const Field& field = Fields()[index];
+	int32* slot = NameSlot(NameOf(field), field.nameLength, field.hash);
+	if (*slot < 0)
+		*slot = index;
+}
+
+
+void
+BMessage::Body::DropNames()
+{
+	free(names);
+	names = nullptr;
+	namesSize = 0;
+	std::fill_n(lastLinks, kBucketCount, -1);
 }
 
 
@@ -54,6 +146,9 @@ BMessage::IndexOf(const char* name) const
 
 	const uint32 hash = Private::HashName(name);
 	const size_t nameLength = strlen(name) + 1;
+	if (fBody->names != nullptr)
+		return *fBody->NameSlot(name, uint32(nameLength), hash);
+
 	const Field* fields = fBody->Fields();
 	int32 index = fBody->buckets[hash % kBucketCount];
 	while (index >= 0) {
@@ -142,13 +237,14 @@ BMessage::Reserve(uint32 moreFields, uint32 moreData)
 	if (fBody != nullptr && fields <= oldFields && data <= oldData)
 		return B_OK;
 
-	// Growing by half each time keeps adding at the end cheap, in time and in memory.
+	// Growing by half each time keeps adding at the end cheap, in time and in memory. What is nearly
+	// full grows along, and is not copied again soon.
 	uint32 newFields = oldFields;
-	if (fields > oldFields)
-		newFields = uint32(std::max<uint64>({fields, 4, uint64(oldFields) + oldFields / 2}));
+	if (fields > oldFields - oldFields / 4)
+		newFields = uint32(std::max<uint64>({fields, 8, uint64(oldFields) + oldFields / 2}));
 	uint32 newData = oldData;
-	if (data > oldData)
-		newData = uint32(std::max<uint64>({data, 64, uint64(oldData) + oldData / 2}));
+	if (data > oldData - oldData / 4)
+		newData = uint32(std::max<uint64>({data, 128, uint64(oldData) + oldData / 2}));
 
 	Body* body = Body::Create(newFields, newData);
 	if (body == nullptr)
@@ -158,6 +254,10 @@ BMessage::Reserve(uint32 moreFields, uint32 moreData)
 		body->fieldCount = fBody->fieldCount;
 		body->dataSize = fBody->dataSize;
 		body->cursor = fBody->cursor;
+		body->nameCursor = fBody->nameCursor;
+		std::copy_n(fBody->lastLinks, kBucketCount, body->lastLinks);
+		body->names = fBody->names;
+		body->namesSize = fBody->namesSize;
 		memcpy(body->Fields(), fBody->Fields(), fBody->fieldCount * sizeof(Field));
 		memcpy(body->Data(), fBody->Data(), fBody->dataSize);
 		free(fBody);
@@ -227,6 +327,7 @@ BMessage::AddField(
 	fBody->dataSize = field.EndOffset();
 	fBody->fieldCount++;
 	Link(index);
+	fBody->AddName(index);
 	return B_OK;
 }
 
@@ -261,6 +362,7 @@ BMessage::AddItem(int32 fieldIndex, const void* data, uint32 size)
 void
 BMessage::RemoveField(int32 index)
 {
+	fBody->DropNames();
 	Unlink(index);
 
 	Field* fields = fBody->Fields();
@@ -268,6 +370,7 @@ BMessage::RemoveField(int32 index)
 	const uint32 size = fields[index].EndOffset() - offset;
 	ResizeBytes(index, offset, size, 0);
 
+	fBody->SetNameCursor(0);
 	fBody->fieldCount--;
 	memmove(fields + index, fields + index + 1, (fBody->fieldCount - index) * sizeof(Field));
 
@@ -288,10 +391,13 @@ BMessage::Link(int32 index)
 {
 	Field* fields = fBody->Fields();
 	fields[index].next = -1;
-	int32* link = &fBody->buckets[fields[index].hash % kBucketCount];
+	const uint32 bucket = fields[index].hash % kBucketCount;
+	const int32 last = fBody->lastLinks[bucket];
+	int32* link = last >= 0 ? &fields[last].next : &fBody->buckets[bucket];
 	while (*link >= 0)
 		link = &fields[*link].next;
 	*link = index;
+	fBody->lastLinks[bucket] = index;
 }
 
 

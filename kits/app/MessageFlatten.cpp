@@ -217,6 +217,8 @@ BMessage::Private::ParseHaiku(const uint8* buffer, size_t size, BMessage* messag
 		}
 	}
 
+	body->IndexNames();
+
 	message->what = header.what;
 	message->fFlags = header.flags;
 	message->fTarget = header.target;

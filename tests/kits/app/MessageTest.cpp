@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: MIT
 // The fields of a message: adding, finding, replacing, removing, renaming, and asking about them.
 
+#include <string>
+#include <vector>
+
 #include <Errors.h>
 #include <GraphicsDefs.h>
 #include <Message.h>
@@ -606,4 +609,67 @@ TEST(MessageTest, ManyFieldsAreAllFound)
 		else
 			ASSERT_EQ(std::string(value), std::to_string(i * i));
 	}
+}
+
+
+// Messages with many fields find them by another way than small ones.
+TEST(MessageTest, ManyFieldsAreFoundByTheirNames)
+{
+	BMessage message;
+	const int32 count = 1000;
+	for (int32 i = 0; i < count; i++) {
+		const std::string name = "Button" + std::to_string(i);
+		ASSERT_EQ(message.AddInt32(name.c_str(), i), B_OK);
+		ASSERT_FALSE(message.HasInt32(("Button" + std::to_string(i + 1)).c_str()));
+	}
+	ASSERT_EQ(message.RemoveName("Button500"), B_OK);
+	ASSERT_EQ(message.Rename("Button501", "Renamed"), B_OK);
+	ASSERT_EQ(message.AddInt32("Button500", -1), B_OK);
+
+	BMessage copy(message);
+	std::vector<char> flat(message.FlattenedSize());
+	ASSERT_EQ(message.Flatten(flat.data(), ssize_t(flat.size())), B_OK);
+	BMessage read;
+	ASSERT_EQ(read.Unflatten(flat.data()), B_OK);
+	for (const BMessage* each : {&message, &copy, &read}) {
+		EXPECT_EQ(each->CountNames(B_ANY_TYPE), count);
+		EXPECT_FALSE(each->HasInt32("Button501"));
+		EXPECT_EQ(each->FindInt32("Renamed"), 501);
+		EXPECT_EQ(each->FindInt32("Button500"), -1);
+		for (int32 i = 0; i < count; i++) {
+			if (i == 500 || i == 501)
+				continue;
+			ASSERT_EQ(each->FindInt32(("Button" + std::to_string(i)).c_str()), i);
+		}
+	}
+}
+
+
+TEST(MessageTest, ManyFieldsOfTwoTypesAreListedInOrder)
+{
+	BMessage message;
+	for (int32 i = 0; i < 200; i++) {
+		message.AddInt32(("number" + std::to_string(i)).c_str(), i);
+		message.AddString(("text" + std::to_string(i)).c_str(), "");
+	}
+	message.RemoveName("number0");
+	const auto nameAt = [&message](type_code type, int32 index) {
+		char* name;
+		type_code found;
+		return message.GetInfo(type, index, &name, &found) == B_OK ? std::string(name) : "";
+	};
+
+	// Up, down and by turns: the place of the last answer must not show.
+	for (int32 i = 0; i < 199; i++) {
+		EXPECT_EQ(nameAt(B_INT32_TYPE, i), "number" + std::to_string(i + 1));
+		EXPECT_EQ(nameAt(B_STRING_TYPE, 199 - i), "text" + std::to_string(199 - i));
+		EXPECT_EQ(nameAt(B_STRING_TYPE, i), "text" + std::to_string(i));
+	}
+	EXPECT_EQ(nameAt(B_INT32_TYPE, 199), "");
+	EXPECT_EQ(nameAt(B_INT32_TYPE, 10), "number11");
+	EXPECT_EQ(nameAt(B_ANY_TYPE, 398), "text199");
+	EXPECT_EQ(nameAt(B_ANY_TYPE, 399), "");
+	message.RemoveName("text3");
+	EXPECT_EQ(nameAt(B_STRING_TYPE, 3), "text4");
+	EXPECT_EQ(nameAt(B_INT32_TYPE, 10), "number11");
 }
