@@ -27,6 +27,7 @@ BHandler::BHandler(const char* name)
 	  fName(nullptr),
 	  fLooper(nullptr),
 	  fNextHandler(nullptr),
+	  fIsNext(false),
 	  fFilters(nullptr),
 	  fObservers(nullptr)
 {
@@ -40,6 +41,7 @@ BHandler::BHandler(BMessage* archive)
 	  fName(nullptr),
 	  fLooper(nullptr),
 	  fNextHandler(nullptr),
+	  fIsNext(false),
 	  fFilters(nullptr),
 	  fObservers(nullptr)
 {
@@ -122,6 +124,8 @@ BHandler::SetNextHandler(BHandler* handler)
 	if (Looper() == nullptr || (handler != nullptr && handler->Looper() != Looper()))
 		return;
 	fNextHandler = handler;
+	if (handler != nullptr)
+		handler->fIsNext = true;
 }
 
 
@@ -195,6 +199,11 @@ BHandler::LockLooper()
 status_t
 BHandler::LockLooperWithTimeout(bigtime_t timeout)
 {
+	// A handler whose looper this thread has locked stays where it is: no need to ask the registry.
+	LooperPort* held = LooperPort::HeldPort(fLooper);
+	if (held != nullptr)
+		return held->Lock(timeout);
+
 	Registry& registry = Registry::Default();
 	port_id id = registry.HandlerPort(fToken);
 	std::shared_ptr<LooperPort> port = registry.PortFor(id);

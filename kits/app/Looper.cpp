@@ -195,11 +195,17 @@ BLooper::RemoveHandler(BHandler* handler)
 
 	if (handler == fPreferred)
 		fPreferred = nullptr;
-	fHandlers.erase(std::find(fHandlers.begin(), fHandlers.end(), handler));
+	// A large window closes from either end of the list.
+	if (fHandlers.back() == handler)
+		fHandlers.pop_back();
+	else
+		fHandlers.erase(std::find(fHandlers.begin(), fHandlers.end(), handler));
 	// Whoever passed its messages on through it passes them to the one behind it.
-	for (BHandler* other : fHandlers) {
-		if (other->fNextHandler == handler)
-			other->fNextHandler = handler->fNextHandler;
+	if (handler->fIsNext) {
+		for (BHandler* other : fHandlers) {
+			if (other->fNextHandler == handler)
+				other->fNextHandler = handler->fNextHandler;
+		}
 	}
 	handler->SetLooper(nullptr, nullptr);
 	Unlock();

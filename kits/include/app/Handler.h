@@ -103,6 +103,7 @@ private:
 	char* fName;
 	std::atomic<BLooper*> fLooper;
 	BHandler* fNextHandler;
+	bool fIsNext; // another handler's next one has been this
 	BList* fFilters;
 	BPrivate::ObserverList* fObservers;
 };

@@ -4,8 +4,8 @@
 #ifndef _LOOPER_H
 #define _LOOPER_H
 
+#include <deque>
 #include <memory>
-#include <vector>
 
 #include <Handler.h>
 #include <Message.h>
@@ -138,7 +138,7 @@ private:
 	std::shared_ptr<BPrivate::LooperPort> fPort;
 	BMessageQueue* fQueue;
 	BMessage* fLastMessage;
-	std::vector<BHandler*> fHandlers;
+	std::deque<BHandler*> fHandlers;
 	BHandler* fPreferred;
 	BList* fCommonFilters;
 	int32 fPriority;
