@@ -165,13 +165,6 @@ BList::MoveItem(int32 from, int32 to)
 
 
 void*
-BList::ItemAt(int32 index) const
-{
-	return index >= 0 && index < CountItems() ? fItems[index] : nullptr;
-}
-
-
-void*
 BList::FirstItem() const
 {
 	return ItemAt(0);
@@ -225,13 +218,6 @@ BList::IndexOf(const void* item) const
 {
 	auto found = std::find(fItems.begin(), fItems.end(), item);
 	return found == fItems.end() ? -1 : static_cast<int32>(found - fItems.begin());
-}
-
-
-int32
-BList::CountItems() const
-{
-	return static_cast<int32>(fItems.size());
 }
 
 

@@ -41,7 +41,10 @@ public:
 	/// Shifts the items between.
 	bool MoveItem(int32 from, int32 to);
 
-	void* ItemAt(int32 index) const;
+	void* ItemAt(int32 index) const
+	{
+		return index >= 0 && index < CountItems() ? fItems[index] : nullptr;
+	}
 	void* FirstItem() const;
 	void* LastItem() const;
 	/// Without a check of the index.
@@ -53,7 +56,7 @@ public:
 	bool HasItem(const void* item) const;
 	int32 IndexOf(void* item) const;
 	int32 IndexOf(const void* item) const;
-	int32 CountItems() const;
+	int32 CountItems() const { return static_cast<int32>(fItems.size()); }
 	bool IsEmpty() const;
 
 	/// Stops when \a func returns true.
