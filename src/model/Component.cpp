@@ -343,9 +343,14 @@ TComponent::FindProperty(const char* name) const
 {
 	if (name == nullptr)
 		return nullptr;
-	for (int32 i = 0; i < CountProperties(); i++) {
+	const int32 count = CountProperties();
+	for (int32 i = 0; i < count; i++) {
 		TProperty* property = PropertyAt(i);
-		if (property != nullptr && strcmp(property->Name(), name) == 0)
+		if (property == nullptr)
+			continue;
+		// This is where loading a form spends its time, and few names begin alike.
+		const char* candidate = property->Name();
+		if (candidate[0] == name[0] && strcmp(candidate, name) == 0)
 			return property;
 	}
 	return nullptr;

@@ -36,7 +36,10 @@ TProperty::TProperty(TComponent* component, const char* name, const char* value,
 	  fQuoted(false),
 	  fGenerated(generated)
 {
-	snprintf(fName, sizeof(fName), "%s", name != nullptr ? name : "");
+	const size_t length = name != nullptr ? strnlen(name, sizeof(fName) - 1) : 0;
+	if (length > 0)
+		memcpy(fName, name, length);
+	fName[length] = '\0';
 	fValue.SetTo(value);
 }
 
@@ -111,10 +114,16 @@ TProperty::SetStatement() const
 		return BString(fSetStatement.Text());
 
 	const char* quote = fQuoted ? "\"" : "";
-	BString statement;
-	statement << NameOf(fComponent) << "->Set" << Name() << "(" << quote << Value() << quote
-			  << ");";
-	return statement.Truncate(kMaxSetStatement);
+	const char* const parts[] = {
+		NameOf(fComponent), "->Set", Name(), "(", quote, Value(), quote, ");"};
+	char statement[kMaxSetStatement];
+	size_t length = 0;
+	for (const char* part : parts) {
+		const size_t partLength = strnlen(part, kMaxSetStatement - length);
+		memcpy(statement + length, part, partLength);
+		length += partLength;
+	}
+	return BString(statement, static_cast<int32>(length));
 }
 
 

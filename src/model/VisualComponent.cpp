@@ -58,7 +58,7 @@ static int
 EdgeIndex(const char* name)
 {
 	for (int i = 0; i < 4; i++) {
-		if (strcmp(name, kEdgeNames[i]) == 0)
+		if (name[0] == kEdgeNames[i][0] && strcmp(name, kEdgeNames[i]) == 0)
 			return i;
 	}
 	return -1;
