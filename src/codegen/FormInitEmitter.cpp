@@ -3,6 +3,8 @@
 
 #include "codegen/FormSourceEmitter.h"
 
+#include <string.h>
+
 #include "codegen/FormParts.h"
 #include "codegen/HandlerNames.h"
 #include "codegen/SourceText.h"
@@ -210,9 +212,12 @@ TFormSourceEmitter::EmitComponentPropSet(TComponent* component, BString& text)
 			continue;
 
 		BString statement = property->SetStatement();
-		const BString value(property->Value(), TPropertyText::kSize);
-		ReplacePlaceholders(
-			statement, {{"$COMPONENT", component->ComponentName()}, {"$VALUE", value.String()}});
+		// Most statements hold no placeholder.
+		if (strchr(statement.String(), '$') != nullptr) {
+			const BString value(property->Value(), TPropertyText::kSize);
+			ReplacePlaceholders(statement,
+				{{"$COMPONENT", component->ComponentName()}, {"$VALUE", value.String()}});
+		}
 		IndentContinuationLines(statement);
 		text << "$TAB" << statement << "\n";
 	}

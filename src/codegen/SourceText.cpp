@@ -198,7 +198,8 @@ ReplacePlaceholders(BString& text, std::initializer_list<placeholder_value> plac
 void
 IndentContinuationLines(BString& statement)
 {
-	statement.ReplaceAll("\n", "\n  ");
+	if (strchr(statement.String(), '\n') != nullptr)
+		statement.ReplaceAll("\n", "\n  ");
 }
 
 
