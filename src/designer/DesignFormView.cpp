@@ -169,6 +169,8 @@ TDesignFormView::SetFilename(const char* name)
 {
 	if (name == nullptr)
 		return;
-	strncpy(fFilename, name, sizeof(fFilename) - 1);
-	fFilename[sizeof(fFilename) - 1] = '\0';
+	// The name may be this very one.
+	const size_t length = strnlen(name, sizeof(fFilename) - 1);
+	memmove(fFilename, name, length);
+	fFilename[length] = '\0';
 }

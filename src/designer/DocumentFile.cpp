@@ -14,12 +14,14 @@ namespace {
 constexpr uint32 kDocument = 'PlmF';
 constexpr const char* kDesignerSignature = "application/x-qtx.Plim";
 
-/// Copies \a text into the zero-filled \a field of \a size bytes, cutting what is too long.
+/// Copies \a text, which may be the field's own, into the zero-filled \a field of \a size bytes, cutting
+/// what is too long.
 void
 CopyText(char* field, size_t size, const char* text)
 {
-	memset(field, 0, size);
-	strncpy(field, text, size - 1);
+	const size_t length = strnlen(text, size - 1);
+	memmove(field, text, length);
+	memset(field + length, 0, size - length);
 }
 
 } // namespace

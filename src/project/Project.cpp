@@ -58,16 +58,17 @@ bool
 TProject::LoadFromFile(const char* path, TLoadReport* report)
 {
 	printf("** filename = '%s'\n", path);
-	NewProject(false);
-
 	TPLIMFile document(kProjectFileType);
 	document.SetFilename(path);
+	// The path may be the project's own, which a new project forgets.
+	const BString filename(path);
+	NewProject(false);
 	const bool opened = document.OpenFile();
 	fStatus = document.InitCheck();
 	if (!opened)
 		return false;
 
-	SetFilename(path);
+	SetFilename(filename.String());
 	LoadApp(document);
 	LoadForms(document, report);
 	ReadMainForm();
@@ -104,8 +105,10 @@ TProject::SetFilename(const char* name)
 {
 	if (name == nullptr)
 		return;
-	strncpy(fFilename, name, sizeof(fFilename) - 1);
-	fFilename[sizeof(fFilename) - 1] = '\0';
+	// The name may be this very one.
+	const size_t length = strnlen(name, sizeof(fFilename) - 1);
+	memmove(fFilename, name, length);
+	fFilename[length] = '\0';
 }
 
 

@@ -161,3 +161,12 @@ TEST(DocumentFileTest, AFormFileHasItsTypeAndCode)
 	EXPECT_EQ(file.what, static_cast<uint32>('PFrm'));
 	EXPECT_STREQ(file.FileType(), "application/x-plim-form");
 }
+
+
+TEST(DocumentFileTest, ItsOwnFilenameMayBeSetAgain)
+{
+	TPLIMFile file("application/x-plim-project");
+	file.SetFilename("/a/name.plim");
+	file.SetFilename(file.Filename());
+	EXPECT_STREQ(file.Filename(), "/a/name.plim");
+}

@@ -356,3 +356,17 @@ TEST_F(ProjectTest, AFailedSaveLeavesTheOldDocumentAndTheProjectModified)
 	EXPECT_STREQ(project.Filename(), (fFolder / "test.plim").c_str());
 	EXPECT_TRUE(fFolder.Read("test.plim") == before);
 }
+
+
+TEST_F(ProjectTest, AProjectIsSavedToAndLoadedFromItsOwnFilename)
+{
+	TProject project(FORM_HIDDEN);
+	AddForm(project, "Form1", "1.frm");
+	Save(project, fFolder / "test.plim");
+	CapturedOutput output;
+	EXPECT_TRUE(project.SaveToFile(project.Filename(), true));
+	EXPECT_STREQ(project.Filename(), (fFolder / "test.plim").c_str());
+	EXPECT_TRUE(project.LoadFromFile(project.Filename()));
+	EXPECT_STREQ(project.Filename(), (fFolder / "test.plim").c_str());
+	EXPECT_EQ(FormNames(project), (std::vector<std::string>{"Form1"}));
+}
