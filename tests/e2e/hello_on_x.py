@@ -36,6 +36,8 @@ NOTE_BUTTON = (62, 198)
 QUIT_BUTTON = (298, 250)
 NAME_FIELD = (230, 50)
 SHOUT_BOX = (32, 80)
+# Of the note's: all but this depends on which control has the focus.
+NOTE_PROMPT = (12, 12, 248, 32)
 
 
 def check(condition, message):
@@ -122,7 +124,7 @@ class Session:
         self.click(NOTE_BUTTON)
         window = self.desktop.wait_for_window("Note")
         self.desktop.wait_until_active(window)
-        self.wait_for_picture("note", (0, 0, NOTE[2] - 1, NOTE[3] - 1), NOTE)
+        self.wait_for_picture("note", NOTE_PROMPT, NOTE)
         check_place(self.desktop, window, NOTE)
         self.desktop.key("alt+F4")
         self.desktop.wait_for_no_window("Note")
