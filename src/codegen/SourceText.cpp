@@ -206,6 +206,10 @@ IndentContinuationLines(BString& statement)
 int32
 AppendNormalizedLines(const char* data, size_t length, BString& text)
 {
+	// Without content there may be no data either.
+	if (length == 0)
+		data = "";
+
 	int32 cutLine = 0;
 	size_t position = 0;
 	for (int32 line = 1;; line++) {

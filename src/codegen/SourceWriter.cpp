@@ -3,7 +3,7 @@
 
 #include "codegen/SourceWriter.h"
 
-#include <string.h>
+#include <algorithm>
 
 #include <File.h>
 
@@ -23,7 +23,7 @@ HasContent(const char* path, const BString& text)
 	std::vector<char> content;
 	return ReadContent(path, content) == B_OK
 		&& content.size() == static_cast<size_t>(text.Length())
-		&& memcmp(content.data(), text.String(), content.size()) == 0;
+		&& std::equal(content.begin(), content.end(), text.String());
 }
 
 

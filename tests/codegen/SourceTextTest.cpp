@@ -332,3 +332,11 @@ TEST(FunctionBodyTest, OfAStartOutsideTheTextIsEmptyOrTheWhole)
 	EXPECT_EQ(Body("{}", -5), "{}");
 	EXPECT_EQ(Body(""), "");
 }
+
+
+TEST(NormalizedLinesTest, OfNoDataAtAllAreAnEmptyLine)
+{
+	BString text;
+	EXPECT_EQ(AppendNormalizedLines(nullptr, 0, text), 0);
+	EXPECT_EQ(std::string(text.String()), Normalized(""));
+}
