@@ -124,13 +124,17 @@ TEST(LooperStressTest, IdleLoopersUseNoProcessorTime)
 	for (RecordingLooper* looper : loopers)
 		ASSERT_TRUE(looper->record.Wait());
 
-	timespec before;
-	timespec after;
-	clock_gettime(CLOCK_PROCESS_CPUTIME_ID, &before);
-	snooze(300000);
-	clock_gettime(CLOCK_PROCESS_CPUTIME_ID, &after);
-	double used = (after.tv_sec - before.tv_sec) + (after.tv_nsec - before.tv_nsec) * 1e-9;
-	EXPECT_LT(used, 0.05);
+	// On a busy machine the loopers may come to rest late, but they have to.
+	double used = 1;
+	for (int32 i = 0; i < 50 && used > 0.02; i++) {
+		timespec before;
+		timespec after;
+		clock_gettime(CLOCK_PROCESS_CPUTIME_ID, &before);
+		snooze(200000);
+		clock_gettime(CLOCK_PROCESS_CPUTIME_ID, &after);
+		used = (after.tv_sec - before.tv_sec) + (after.tv_nsec - before.tv_nsec) * 1e-9;
+	}
+	EXPECT_LT(used, 0.02);
 	for (RecordingLooper* looper : loopers)
 		QuitLooper(looper);
 }

@@ -97,7 +97,9 @@ public:
 	status_t Archive(BMessage* into, bool deep = true) const override
 	{
 		status_t status = BArchivable::Archive(into, deep);
-		return status == B_OK ? into->AddInt32("value", fValue) : status;
+		if (status != B_OK || into == nullptr)
+			return status;
+		return into->AddInt32("value", fValue);
 	}
 	static BArchivable* Instantiate(BMessage* archive);
 
