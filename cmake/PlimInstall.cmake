@@ -47,6 +47,8 @@ install(DIRECTORY ${PROJECT_SOURCE_DIR}/src/model DESTINATION ${PLIM_INSTALL_INC
   FILES_MATCHING PATTERN "*.h")
 install(DIRECTORY ${PROJECT_SOURCE_DIR}/src/props DESTINATION ${PLIM_INSTALL_INCLUDEDIR}/designer
   FILES_MATCHING PATTERN "*Property.h" PATTERN "PropertyEditor.h" PATTERN "StringList.h")
+install(FILES ${PROJECT_SOURCE_DIR}/src/app/TypedMessage.h
+  DESTINATION ${PLIM_INSTALL_INCLUDEDIR}/designer/app)
 install(FILES ${PROJECT_SOURCE_DIR}/src/palette/PaletteEntry.h
   DESTINATION ${PLIM_INSTALL_INCLUDEDIR}/designer/palette)
 
