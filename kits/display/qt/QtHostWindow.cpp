@@ -38,6 +38,8 @@ QtHostWindow::~QtHostWindow()
 	bool removed = fDisplay.Thread().Run([&] {
 		fDisplay.Remove(this);
 		fWindow.reset();
+		// The host's events that were under way, word of the focus above all, have named it again.
+		fDisplay.Hub().RemoveWindow(&fStacked);
 	});
 	// Without its thread the host's window cannot be taken apart.
 	if (!removed)
