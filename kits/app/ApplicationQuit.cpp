@@ -10,6 +10,7 @@
 
 #include "app/LooperPort.h"
 #include "app/Registry.h"
+#include "kernel/Kernel.h"
 
 using BPrivate::CurrentThread;
 using BPrivate::LooperAccess;
@@ -17,6 +18,9 @@ using BPrivate::LooperPort;
 using BPrivate::Registry;
 
 typedef std::shared_ptr<LooperPort> PortRef;
+
+// Nobody is to wait for the destructor of a looper that hangs.
+static constexpr bigtime_t kLeavingLimit = 5'000'000;
 
 
 /// The ports of the program's windows that \a wanted holds for, the oldest first.
@@ -178,5 +182,9 @@ BApplication::QuitRegisteredLoopers()
 		if (looper->Lock())
 			looper->Quit();
 	}
+	// Some have quit by themselves, and nobody has waited for their threads. The program may end right after this, and
+	// destroys the static objects of the host's libraries then: a thread that has used these, as every window's has,
+	// must not clean up at the same time.
+	BPrivate::wait_for_announced_ends(kLeavingLimit);
 	LooperAccess::LockAgain(this, levels);
 }

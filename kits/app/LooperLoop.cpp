@@ -12,6 +12,7 @@
 #include "app/LooperPort.h"
 #include "app/MessagePrivate.h"
 #include "app/Registry.h"
+#include "kernel/Kernel.h"
 
 using BPrivate::CurrentThread;
 using BPrivate::LooperPort;
@@ -324,6 +325,9 @@ BLooper::DeleteAndLeave()
 {
 	LoopFrame* frame = LoopFrame::Find(this);
 	fTerminating = true;
+	// Before it is unregistered: who finds it gone has to know of the thread.
+	if (!fLoopsInCaller)
+		BPrivate::announce_thread_end();
 	delete this;
 	LoopFrame::ReturnTo(frame);
 	_longjmp(frame->place, 1);

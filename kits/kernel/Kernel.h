@@ -112,6 +112,8 @@ struct Thread {
 	WaitQueue senders;
 	WaitQueue receivers;
 
+	/// On its way out: its work is done.
+	bool leaving = false;
 	bool dead = false;
 	status_t result = B_OK;
 	WaitQueue joiners;
@@ -167,6 +169,13 @@ void remove_thread_record(const std::shared_ptr<Thread>& thread);
 void end_thread_record(Thread* thread);
 /// All threads that have not ended, in the order of their ids.
 std::vector<std::shared_ptr<Thread>> live_threads();
+
+/// Says that the calling thread, if made by spawn_thread(), has done its work and is about to end.
+void announce_thread_end();
+/// Waits until nothing is left of the other threads that have announced their end.
+///
+/// \a timeout: microseconds, for all of them. Returns B_OK, B_TIMED_OUT or B_INTERRUPTED.
+status_t wait_for_announced_ends(bigtime_t timeout);
 
 /// Makes \a thread the calling one's record until its end.
 void adopt_thread_record(const std::shared_ptr<Thread>& thread);

@@ -242,6 +242,32 @@ wait_for_thread_etc(thread_id id, uint32 flags, bigtime_t timeout, status_t* _re
 }
 
 
+void
+BPrivate::announce_thread_end()
+{
+	KernelSection section;
+	Thread* thread = section.Current();
+	thread->leaving = thread->kind == Thread::Kind::kSpawned;
+}
+
+
+status_t
+BPrivate::wait_for_announced_ends(bigtime_t timeout)
+{
+	KernelSection section;
+	Deadline deadline(B_RELATIVE_TIMEOUT, timeout);
+	for (const std::shared_ptr<Thread>& thread : live_threads()) {
+		if (!thread->leaving || thread->dead || thread.get() == section.Current())
+			continue;
+		Waiter waiter;
+		status_t status = section.Wait(thread->joiners, waiter, deadline, B_THREAD_WAITING);
+		if (status != B_OK)
+			return status;
+	}
+	return B_OK;
+}
+
+
 status_t
 on_exit_thread(void (*callback)(void*), void* data)
 {

@@ -373,3 +373,36 @@ TEST(ApplicationQuitTest, AQuitRequestThatIsRefusedLeavesTheLoopRunning)
 	EXPECT_TRUE(second);
 	EXPECT_EQ(gone.Count(), 1);
 }
+
+
+TEST(ApplicationTest, DeletingItWaitsForTheThreadsOfLoopersThatQuitThemselves)
+{
+	static std::atomic<bool> sIsGone;
+	sIsGone = false;
+	struct SlowCleanup {
+		~SlowCleanup()
+		{
+			snooze(200'000);
+			sIsGone = true;
+		}
+	};
+	class CleaningLooper : public BLooper {
+	public:
+		void MessageReceived(BMessage*) override
+		{
+			static thread_local SlowCleanup sCleanup;
+			(void)&sCleanup;
+			PostMessage(B_QUIT_REQUESTED);
+		}
+	};
+
+	auto application = new BApplication(kSignature);
+	auto looper = new CleaningLooper;
+	BMessenger messenger(looper);
+	looper->Run();
+	looper->PostMessage('clen');
+	while (messenger.IsValid())
+		snooze(1000);
+	delete application;
+	EXPECT_TRUE(sIsGone);
+}
