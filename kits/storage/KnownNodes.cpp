@@ -155,11 +155,14 @@ FindCurrentDirectory(const node_key& key, std::string* path)
 bool
 FindMountPoint(const node_key& key, std::string* path)
 {
+	// The list of mounts does not have the root of a program that was given another one.
+	bool found = IsNodeAt("/", key);
+	if (found)
+		*path = "/";
 	FILE* mounts = setmntent("/proc/self/mounts", "re");
 	if (mounts == nullptr)
-		return false;
+		return found;
 
-	bool found = false;
 	char buffer[4 * PATH_MAX];
 	struct mntent entry;
 	while (!found && getmntent_r(mounts, &entry, buffer, sizeof(buffer)) != nullptr) {

@@ -24,6 +24,24 @@ IsOneOf(const std::string& type, std::initializer_list<const char*> types)
 		types.begin(), types.end(), [&type](const char* candidate) { return type == candidate; });
 }
 
+/// Puts the root in front when it is no mount point of its own, as for a program that was given
+/// another root: it stands for its whole device.
+void
+AddMissingRoot(std::vector<mount_point>& mounts)
+{
+	struct stat stat;
+	const auto isRoot = [](const mount_point& mount) { return mount.path == "/"; };
+	if (std::any_of(mounts.begin(), mounts.end(), isRoot) || ::stat("/", &stat) != 0)
+		return;
+
+	const auto sameDevice = [&](const mount_point& mount) { return mount.device == stat.st_dev; };
+	const auto same = std::find_if(mounts.begin(), mounts.end(), sameDevice);
+	const std::string type = same != mounts.end() ? same->type : std::string();
+	if (same != mounts.end())
+		mounts.erase(same);
+	mounts.insert(mounts.begin(), {stat.st_dev, "/", type});
+}
+
 } // namespace
 
 
@@ -48,6 +66,7 @@ list_mounts()
 			mounts.push_back({stat.st_dev, entry.mnt_dir, entry.mnt_type});
 	}
 	endmntent(list);
+	AddMissingRoot(mounts);
 	return mounts;
 }
 
