@@ -4,6 +4,8 @@
 
 #include <vector>
 
+#include <sys/stat.h>
+
 #include <Entry.h>
 #include <OS.h>
 #include <Path.h>
@@ -97,6 +99,10 @@ TReplacementFile::OpenBeside(const char* path)
 	fPath = resolved.Path();
 
 	if (entry.Exists()) {
+		// Opening a pipe would wait for somebody to read from it.
+		struct stat kind;
+		if (entry.GetStat(&kind) == B_OK && S_ISFIFO(kind.st_mode))
+			return B_NOT_ALLOWED;
 		// A file that may not be written is not replaced either, though its folder would allow it.
 		BFile present(&entry, B_WRITE_ONLY);
 		if (present.InitCheck() != B_OK)

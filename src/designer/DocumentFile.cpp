@@ -4,6 +4,7 @@
 
 #include <cstring>
 
+#include <Entry.h>
 #include <File.h>
 #include <NodeInfo.h>
 
@@ -60,6 +61,12 @@ TPLIMFile::OpenFile()
 	if (fStatus != B_OK)
 		return false;
 
+	// Opening a pipe would wait for somebody to write into it.
+	BEntry entry(fPath.Path(), true);
+	if (entry.Exists() && !entry.IsFile()) {
+		fStatus = entry.IsDirectory() ? B_IS_A_DIRECTORY : B_NOT_ALLOWED;
+		return false;
+	}
 	BFile file(fPath.Path(), B_READ_ONLY);
 	fStatus = file.InitCheck();
 	if (fStatus != B_OK)

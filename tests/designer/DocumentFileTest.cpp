@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include <sys/stat.h>
+
 #include <filesystem>
 
 #include <Node.h>
@@ -127,6 +129,19 @@ TEST(DocumentFileTest, AFailedSaveLeavesTheOldFile)
 	file.SetFilename("/dev/full");
 	EXPECT_FALSE(file.SaveFile());
 	EXPECT_EQ(file.InitCheck(), B_DEVICE_FULL);
+}
+
+
+TEST(DocumentFileTest, APipeIsNeitherReadNorWritten)
+{
+	TemporaryFolder folder;
+	ASSERT_EQ(mkfifo((folder / "pipe").c_str(), 0600), 0);
+	TPLIMFile file(kType);
+	file.SetFilename((folder / "pipe").c_str());
+	EXPECT_FALSE(file.OpenFile());
+	EXPECT_EQ(file.InitCheck(), B_NOT_ALLOWED);
+	EXPECT_FALSE(file.SaveFile());
+	EXPECT_EQ(file.InitCheck(), B_NOT_ALLOWED);
 }
 
 
