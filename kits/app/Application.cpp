@@ -18,6 +18,7 @@
 #include "app/Registry.h"
 #include "app/RosterPrivate.h"
 #include "app/StartArguments.h"
+#include "kernel/Heap.h"
 
 using BPrivate::CurrentThread;
 using BPrivate::LooperPort;
@@ -322,6 +323,7 @@ BApplication::InitData(const char* signature, status_t* error)
 	if (fInitError != B_OK)
 		return;
 
+	BPrivate::PrepareHeap();
 	SetName(fSignature + strlen("application/"));
 	fPort->SetThread(CurrentThread());
 	Registry::Default().SetApplicationPort(fPort->Id());

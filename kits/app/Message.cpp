@@ -381,9 +381,12 @@ BMessage::SetData(const char* name, type_code type, const void* data, ssize_t nu
 	bool isFixedSize, int32 count)
 {
 	const status_t status = ReplaceData(name, type, data, numBytes);
-	if (status == B_NAME_NOT_FOUND)
+	if (status != B_NAME_NOT_FOUND)
+		return status;
+	// Bytes of this message's own move while it grows.
+	if (Owns(name) || Owns(data))
 		return AddData(name, type, data, numBytes, isFixedSize, count);
-	return status;
+	return AddField(name, type, isFixedSize, data, uint32(numBytes));
 }
 
 

@@ -26,18 +26,13 @@ TPropertyStore::SetString(const char* name, const char* value)
 	if (value == nullptr)
 		value = "";
 
-	const char* present;
-	const bool replaces = FindString(name, &present) == B_OK;
-	if (replaces && strcmp(present, value) == 0)
-		return B_OK;
-
 	// A text of this store moves when the store grows. Most texts are short enough for the stack.
 	char copy[256];
 	const size_t size = strlen(value) + 1;
 	if (size <= sizeof(copy)) {
 		memcpy(copy, value, size);
-		return replaces ? ReplaceString(name, copy) : AddString(name, copy);
+		return BMessage::SetString(name, copy);
 	}
 	const BString longCopy(value);
-	return replaces ? ReplaceString(name, longCopy.String()) : AddString(name, longCopy.String());
+	return BMessage::SetString(name, longCopy.String());
 }
