@@ -17,6 +17,7 @@
 
 #include "app/Preferences.h"
 #include "codegen/GenerationRun.h"
+#include "model/Diagnostics.h"
 
 namespace {
 
@@ -90,6 +91,7 @@ TakeStandardOutput()
 	if (out == nullptr || freopen("/dev/null", "w", stdout) == nullptr)
 		return nullptr;
 	sDiscardsOutput = true;
+	DiscardCalls();
 	return out;
 }
 

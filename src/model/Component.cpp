@@ -186,7 +186,7 @@ TComponent::GetPropertyValue(const char* name)
 void
 TComponent::SetPropertyValue(const char* name, const char* value)
 {
-	printf("TComponent::SetPropertyValue('%s', '%s')\n", ShownText(name), ShownText(value));
+	PrintCall("TComponent::SetPropertyValue", name, value);
 	if (name == nullptr || value == nullptr)
 		return;
 	if (strcmp(name, "Name") == 0)

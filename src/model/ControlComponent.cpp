@@ -70,7 +70,7 @@ TControlComponent::GetPropertyValue(const char* name)
 void
 TControlComponent::SetPropertyValue(const char* name, const char* value)
 {
-	printf("TControlComponent::SetPropertyValue('%s', '%s')\n", ShownText(name), ShownText(value));
+	PrintCall("TControlComponent::SetPropertyValue", name, value);
 	if (name == nullptr || value == nullptr)
 		return;
 
