@@ -52,6 +52,19 @@ find_first(std::string_view text, std::string_view sought, int32 from, Case lett
 		return found == std::string_view::npos ? B_ERROR : static_cast<int32>(found);
 	}
 
+	// A first byte that is no letter is found by itself, which is much faster.
+	const char first = sought.empty() ? 'a' : ascii_lower(sought[0]);
+	if (first < 'a' || first > 'z') {
+		size_t at = text.find(first, from);
+		for (; at != std::string_view::npos; at = text.find(first, at + 1)) {
+			if (text.size() - at < sought.size())
+				break;
+			if (std::equal(sought.begin(), sought.end(), text.begin() + at, same_ignoring_case))
+				return static_cast<int32>(at);
+		}
+		return B_ERROR;
+	}
+
 	auto found = std::search(
 		text.begin() + from, text.end(), sought.begin(), sought.end(), same_ignoring_case);
 	// An empty text is found at the very end too.

@@ -243,6 +243,16 @@ TEST(StringTest, FindsFromAnOffset)
 	EXPECT_EQ(string.IFindFirst("BC", 2), 4);
 	EXPECT_EQ(string.IFindFirst(BString("CA")), 2);
 	EXPECT_EQ(string.IFindFirst("x"), B_ERROR);
+
+	const BString marked("/ //A //aB \xc3\xa4/");
+	EXPECT_EQ(marked.IFindFirst("//Ab"), 6);
+	EXPECT_EQ(marked.IFindFirst("//A", 3), 6);
+	EXPECT_EQ(marked.IFindFirst(" //a", 2), 5);
+	EXPECT_EQ(marked.IFindFirst("\xc3\xa4/"), 11);
+	EXPECT_EQ(marked.IFindFirst("//x"), B_ERROR);
+	EXPECT_EQ(marked.IFindFirst("/", 14), B_ERROR);
+	EXPECT_EQ(marked.IFindFirst("/ab"), 7);
+	EXPECT_EQ(marked.IFindFirst("//AAAAAAAAAAAAAAA"), B_ERROR);
 	EXPECT_EQ(string.IFindFirst(static_cast<const char*>(nullptr)), B_BAD_VALUE);
 }
 
