@@ -45,7 +45,7 @@ ReserveHeap()
 	free(block);
 	mallopt(M_TOP_PAD, kGrowth);
 
-	// Loading a form touches new memory all the time. In small pages, that takes as long as a third of the load.
+	// Loading a form touches new memory all the time, which costs a lot in small pages.
 	const uintptr_t end = reinterpret_cast<uintptr_t>(sbrk(0)) & ~(kLargePage - 1);
 	const uintptr_t start = (oldEnd + kLargePage - 1) & ~(kLargePage - 1);
 	if (start < end)
