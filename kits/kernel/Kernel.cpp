@@ -180,10 +180,10 @@ WaitQueue::WakeAll(status_t result)
 }
 
 
-// #pragma mark - Deadline
+// #pragma mark - KernelDeadline
 
 
-Deadline::Deadline(uint32 flags, bigtime_t timeout)
+KernelDeadline::KernelDeadline(uint32 flags, bigtime_t timeout)
 {
 	if ((flags & (B_RELATIVE_TIMEOUT | B_ABSOLUTE_TIMEOUT)) == 0 || timeout == B_INFINITE_TIMEOUT)
 		return;
@@ -203,7 +203,7 @@ Deadline::Deadline(uint32 flags, bigtime_t timeout)
 
 
 int
-Deadline::Wait(std::atomic<uint32>* word, uint32 value) const
+KernelDeadline::Wait(std::atomic<uint32>* word, uint32 value) const
 {
 	int operation = FUTEX_WAIT_BITSET | (fIsRealTime ? FUTEX_CLOCK_REALTIME : 0);
 	return futex(word, operation, value, fIsInfinite ? nullptr : &fTime) == 0 ? 0 : errno;
@@ -251,7 +251,7 @@ KernelSection::~KernelSection()
 
 status_t
 KernelSection::Wait(
-	WaitQueue& queue, Waiter& waiter, const Deadline& deadline, thread_state activity)
+	WaitQueue& queue, Waiter& waiter, const KernelDeadline& deadline, thread_state activity)
 {
 	if (deadline.IsImmediate())
 		return deadline.Status();
@@ -299,7 +299,7 @@ stop_if_asked()
 	if (thread == nullptr)
 		return;
 
-	Deadline never;
+	KernelDeadline never;
 	while (thread->suspended != 0 && !thread->killed)
 		never.Wait(&thread->suspended, 1);
 	if (thread->killed && thread->killable)

@@ -52,12 +52,12 @@ private:
 
 
 /// When a wait ends without success, and with which status.
-class Deadline {
+class KernelDeadline {
 public:
 	/// Never.
-	Deadline() = default;
+	KernelDeadline() = default;
 	/// \a flags: as acquire_sem_etc() takes them; \a timeout: microseconds.
-	Deadline(uint32 flags, bigtime_t timeout);
+	KernelDeadline(uint32 flags, bigtime_t timeout);
 
 	bool IsImmediate() const { return fIsImmediate; }
 	status_t Status() const { return fIsImmediate ? B_WOULD_BLOCK : B_TIMED_OUT; }
@@ -151,7 +151,7 @@ public:
 	/// \a activity: what get_thread_info() tells. Returns the status of the waking, of the
 	/// deadline, or B_INTERRUPTED. Afterwards the waiter is in no queue.
 	status_t Wait(
-		WaitQueue& queue, Waiter& waiter, const Deadline& deadline, thread_state activity);
+		WaitQueue& queue, Waiter& waiter, const KernelDeadline& deadline, thread_state activity);
 
 private:
 	StopShield fShield;

@@ -59,7 +59,7 @@ find_port_record(port_id id)
 
 /// Waits until the port has a message; B_BAD_PORT_ID when none can come any more.
 status_t
-wait_for_message(KernelSection& section, Port& port, const Deadline& deadline)
+wait_for_message(KernelSection& section, Port& port, const KernelDeadline& deadline)
 {
 	while (port.messages.empty()) {
 		if (port.closed)
@@ -74,7 +74,7 @@ wait_for_message(KernelSection& section, Port& port, const Deadline& deadline)
 
 
 status_t
-wait_for_room(KernelSection& section, Port& port, const Deadline& deadline)
+wait_for_room(KernelSection& section, Port& port, const KernelDeadline& deadline)
 {
 	while (!port.closed && port.messages.size() >= port.capacity) {
 		Waiter waiter;
@@ -137,7 +137,7 @@ read_port_etc(
 	std::shared_ptr<Port> port = find_port_record(id);
 	if (port == nullptr)
 		return B_BAD_PORT_ID;
-	status_t status = wait_for_message(section, *port, Deadline(flags, timeout));
+	status_t status = wait_for_message(section, *port, KernelDeadline(flags, timeout));
 	if (status != B_OK)
 		return status;
 
@@ -172,7 +172,7 @@ write_port_etc(
 	std::shared_ptr<Port> port = find_port_record(id);
 	if (port == nullptr)
 		return B_BAD_PORT_ID;
-	status_t status = wait_for_room(section, *port, Deadline(flags, timeout));
+	status_t status = wait_for_room(section, *port, KernelDeadline(flags, timeout));
 	if (status != B_OK)
 		return status;
 
@@ -227,7 +227,7 @@ port_buffer_size_etc(port_id id, uint32 flags, bigtime_t timeout)
 	std::shared_ptr<Port> port = find_port_record(id);
 	if (port == nullptr)
 		return B_BAD_PORT_ID;
-	status_t status = wait_for_message(section, *port, Deadline(flags, timeout));
+	status_t status = wait_for_message(section, *port, KernelDeadline(flags, timeout));
 	if (status != B_OK)
 		return status;
 	return port->messages.front().data.size();

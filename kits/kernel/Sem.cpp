@@ -110,7 +110,7 @@ acquire_sem_etc(sem_id id, int32 count, uint32 flags, bigtime_t timeout)
 		return B_OK;
 	}
 
-	Deadline deadline(flags, timeout);
+	KernelDeadline deadline(flags, timeout);
 	if (deadline.IsImmediate())
 		return deadline.Status();
 

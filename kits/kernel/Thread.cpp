@@ -232,7 +232,7 @@ wait_for_thread_etc(thread_id id, uint32 flags, bigtime_t timeout, status_t* _re
 		resume(thread.get());
 		Waiter waiter;
 		status_t status =
-			section.Wait(thread->joiners, waiter, Deadline(flags, timeout), B_THREAD_WAITING);
+			section.Wait(thread->joiners, waiter, KernelDeadline(flags, timeout), B_THREAD_WAITING);
 		if (status != B_OK)
 			return status;
 	}
@@ -255,7 +255,7 @@ status_t
 BPrivate::wait_for_announced_ends(bigtime_t timeout)
 {
 	KernelSection section;
-	Deadline deadline(B_RELATIVE_TIMEOUT, timeout);
+	KernelDeadline deadline(B_RELATIVE_TIMEOUT, timeout);
 	for (const std::shared_ptr<Thread>& thread : live_threads()) {
 		if (!thread->leaving || thread->dead || thread.get() == section.Current())
 			continue;

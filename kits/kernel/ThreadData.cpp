@@ -33,7 +33,7 @@ send_data(thread_id id, int32 code, const void* buffer, size_t bufferSize)
 
 	while (thread->hasData) {
 		Waiter waiter;
-		status_t status = section.Wait(thread->senders, waiter, Deadline(), B_THREAD_WAITING);
+		status_t status = section.Wait(thread->senders, waiter, KernelDeadline(), B_THREAD_WAITING);
 		if (status != B_OK)
 			return status;
 		if (thread->dead)
@@ -60,7 +60,8 @@ receive_data(thread_id* sender, void* buffer, size_t bufferSize)
 	Thread* thread = section.Current();
 	while (!thread->hasData) {
 		Waiter waiter;
-		status_t status = section.Wait(thread->receivers, waiter, Deadline(), B_THREAD_RECEIVING);
+		status_t status =
+			section.Wait(thread->receivers, waiter, KernelDeadline(), B_THREAD_RECEIVING);
 		if (status != B_OK)
 			return status;
 	}
