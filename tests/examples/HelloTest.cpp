@@ -91,7 +91,8 @@ TEST_F(HelloTest, TheGeneratedProgramCompilesRunsAndReactsToClicks)
 	ASSERT_EQ(Generate(fFolder / "hello.plim", fFolder.Path()).code, 0);
 	const command_result built =
 		RunCommand("cmake -S " + fFolder.Path() + " -B " + (fFolder / "build")
-			+ " -G Ninja -DOrmi_DIR=" PLIM_BUILD_DIR " && cmake --build " + (fFolder / "build"));
+			+ " -G Ninja -DOrmi_DIR=" PLIM_BUILD_DIR " " GENERATED_FLAGS " && cmake --build "
+			+ (fFolder / "build"));
 	ASSERT_EQ(built.code, 0) << built.output;
 
 	const command_result ran = RunCommand("PICTURES=" + fFolder.Path()
