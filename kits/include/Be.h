@@ -9,8 +9,6 @@
 #include <KernelKit.h>
 #include <StorageKit.h>
 #include <SupportKit.h>
-#if __has_include(<TranslationKit.h>)
 #include <TranslationKit.h>
-#endif
 
 #endif // _BE_H

@@ -8,6 +8,7 @@
 #include <Box.h>
 #include <Button.h>
 #include <CheckBox.h>
+#include <ColorControl.h>
 #include <Control.h>
 #include <Font.h>
 #include <GraphicsDefs.h>
@@ -17,6 +18,7 @@
 #include <MenuField.h>
 #include <MenuItem.h>
 #include <Picture.h>
+#include <PictureButton.h>
 #include <Point.h>
 #include <Polygon.h>
 #include <PopUpMenu.h>
@@ -27,7 +29,10 @@
 #include <SeparatorItem.h>
 #include <Shape.h>
 #include <Size.h>
+#include <Slider.h>
+#include <StatusBar.h>
 #include <StringView.h>
+#include <TabView.h>
 #include <TextControl.h>
 #include <TextView.h>
 #include <View.h>
