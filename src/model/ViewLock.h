@@ -5,26 +5,19 @@
 
 #include <View.h>
 
+#include "app/WindowGuard.h"
+
 /// A design-time view with its window locked, or nothing: without a view, without a window, or when the
-/// window is gone.
+/// window is gone. The lock of another window that the thread holds is given up meanwhile.
 class TViewLock {
 public:
 	explicit TViewLock(BView* view)
-		: fView(view != nullptr && view->LockLooper() ? view : nullptr)
+		: fGuard(view != nullptr ? view->Looper() : nullptr)
 	{
 	}
 
-	~TViewLock()
-	{
-		if (fView != nullptr)
-			fView->UnlockLooper();
-	}
-
-	TViewLock(const TViewLock&) = delete;
-	TViewLock& operator=(const TViewLock&) = delete;
-
-	bool IsLocked() const { return fView != nullptr; }
+	bool IsLocked() const { return fGuard.IsLocked(); }
 
 private:
-	BView* fView;
+	WindowGuard fGuard;
 };

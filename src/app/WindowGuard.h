@@ -1,0 +1,46 @@
+// SPDX-License-Identifier: MIT
+// Reaching for another window without ever holding two window locks.
+
+#pragma once
+
+#include <SupportDefs.h>
+
+class BLooper;
+
+/// The lock of a window (or another looper) for the length of a block.
+///
+/// The lock that the thread holds so far, with all its levels, is given up before the other is taken, and
+/// taken back afterwards. So a thread that reaches other windows only through guards never holds two window
+/// locks, and windows that reach for each other cannot deadlock. Guards nest.
+///
+/// While a guard lives, and until its constructor returns, other threads may change what the given-up lock
+/// protects: look such things up again. The lock that is given up is that of the guard around this one or,
+/// outside any, of the looper whose thread this is; a lock that a thread took on some other looper by itself
+/// is not known here and must not be held. A looper that the thread has locked already is locked once more,
+/// and nothing is given up.
+class WindowGuard {
+public:
+	/// Long enough for a window that is busy drawing or loading, short enough for a user who waits; in microseconds.
+	static constexpr bigtime_t kPatience = 10 * 1000000;
+
+	/// Waits for \a target's lock up to \a patience microseconds. \a target may be gone, or null.
+	explicit WindowGuard(BLooper* target, bigtime_t patience = kPatience);
+	~WindowGuard();
+
+	WindowGuard(const WindowGuard&) = delete;
+	WindowGuard& operator=(const WindowGuard&) = delete;
+
+	/// False when the target is none, is gone, or was not to be had in time: leave it alone then.
+	bool IsLocked() const { return fIsLocked; }
+
+private:
+	static BLooper* HeldLooper();
+	void GiveUp(BLooper* looper);
+	void TakeBack();
+
+	BLooper* fTarget;
+	bool fIsLocked;
+	BLooper* fGivenUp;
+	int32 fLevels;
+	WindowGuard* fOuter;
+};
