@@ -50,8 +50,9 @@ WriteEdges(TComponent* component, BRect frame)
 
 } // namespace
 
-TDesignForm::TDesignForm(const char* name, form_visibility visibility)
+TDesignForm::TDesignForm(const char* name, form_visibility visibility, TFormHost* host)
 	: BWindow(kFirstFrame, name, B_TITLED_WINDOW, 0),
+	  fHost(host),
 	  fDesignView(nullptr),
 	  fClosing(false)
 {

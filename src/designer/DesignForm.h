@@ -9,6 +9,7 @@
 #include "model/FormDesigner.h"
 
 class TDesignFormView;
+class TFormHost;
 class TLoadReport;
 
 enum {
@@ -27,8 +28,10 @@ enum form_visibility { FORM_SHOWN, FORM_HIDDEN };
 /// that made it.
 class TDesignForm : public BWindow, public TFormComponent, public TFormDesigner {
 public:
-	/// \a name: the form's name and first title; null leaves both empty.
-	explicit TDesignForm(const char* name, form_visibility visibility = FORM_SHOWN);
+	/// \a name: the form's name and first title; null leaves both empty. \a host: the project that the form
+	/// belongs to and that lives longer; may be null.
+	explicit TDesignForm(
+		const char* name, form_visibility visibility = FORM_SHOWN, TFormHost* host = nullptr);
 	virtual ~TDesignForm();
 
 	// BWindow
@@ -82,6 +85,9 @@ public:
 
 	TDesignFormView* View() const { return fDesignView; }
 
+	/// The project that the form belongs to; null when it belongs to none.
+	TFormHost* Host() const { return fHost; }
+
 private:
 	void InitControls();
 	bool ApplyEdge(const char* name, const char* value);
@@ -89,6 +95,7 @@ private:
 	void ReplyToLoad(BMessage* message);
 	void ReplyToSave(BMessage* message);
 
+	TFormHost* fHost;
 	TDesignFormView* fDesignView;
 	bool fClosing;
 };

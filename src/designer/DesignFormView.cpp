@@ -6,6 +6,7 @@
 #include <cstring>
 
 #include "designer/DesignForm.h"
+#include "designer/FormHost.h"
 #include "designer/FormReader.h"
 #include "designer/FormWriter.h"
 #include "palette/PaletteCatalog.h"
@@ -59,8 +60,11 @@ TDesignFormView::Draw(BRect updateRect)
 bool
 TDesignFormView::PropertyModified(const char* name, const char*, const char* newValue)
 {
-	if (name != nullptr && newValue != nullptr && strcmp(name, "Name") == 0)
-		fForm->SetComponentName(newValue);
+	if (name == nullptr || newValue == nullptr || strcmp(name, "Name") != 0)
+		return true;
+	fForm->SetComponentName(newValue);
+	if (fForm->Host() != nullptr)
+		fForm->Host()->ObjectNameChanged(fForm);
 	return true;
 }
 

@@ -115,7 +115,7 @@ TProject::SetFilename(const char* name)
 TDesignForm*
 TProject::NewForm()
 {
-	TDesignForm* form = new TDesignForm("Form", fVisibility);
+	TDesignForm* form = new TDesignForm("Form", fVisibility, this);
 	char name[kNameSize];
 	GetNewComponentName(form, fApp.get(), name, sizeof(name));
 	form->SetComponentName(name);
@@ -124,6 +124,23 @@ TProject::NewForm()
 	fApp->AddComponent(form);
 	fApp->SetModified(true);
 	return form;
+}
+
+
+std::vector<TDesignForm*>
+TProject::Forms() const
+{
+	std::vector<TDesignForm*> forms;
+	for (const form_entry& entry : fForms)
+		forms.push_back(entry.form);
+	return forms;
+}
+
+
+void
+TProject::ObjectNameChanged(TComponent*)
+{
+	// The names are the components' own.
 }
 
 
@@ -163,7 +180,7 @@ TProject::SetMainForm(TDesignForm* form)
 TDesignForm*
 TProject::AddForm(const char* name)
 {
-	TDesignForm* form = new TDesignForm(name, fVisibility);
+	TDesignForm* form = new TDesignForm(name, fVisibility, this);
 	fForms.push_back({form, BString(), BString()});
 	fApp->AddComponent(form);
 	return form;

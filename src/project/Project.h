@@ -9,6 +9,7 @@
 #include <String.h>
 
 #include "designer/DesignForm.h"
+#include "designer/FormHost.h"
 
 class BMessage;
 class TAppComponent;
@@ -24,7 +25,7 @@ class TPLIMFile;
 /// project's folder. Which form is the main form is the file's attribute "PLIM:MainForm" (a string).
 ///
 /// Use a project from one thread; operations lock its forms one at a time.
-class TProject {
+class TProject : public TFormHost {
 public:
 	/// \a visibility: of the forms that the project makes.
 	explicit TProject(form_visibility visibility = FORM_SHOWN);
@@ -61,6 +62,10 @@ public:
 
 	/// Adds a new, empty form with the first free name of "Form1", "Form2", ... and returns it.
 	TDesignForm* NewForm();
+
+	// TFormHost
+	std::vector<TDesignForm*> Forms() const override;
+	void ObjectNameChanged(TComponent* object) override;
 
 	int32 CountForms() const;
 	TDesignForm* FormAt(int32 index) const;
