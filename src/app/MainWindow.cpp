@@ -1,0 +1,10 @@
+// SPDX-License-Identifier: MIT
+
+#include "app/MainWindow.h"
+
+
+PlimWin*
+MainWindow()
+{
+	return nullptr;
+}
