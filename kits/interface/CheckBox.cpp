@@ -4,19 +4,20 @@
 
 #include <Window.h>
 
+#include "ClickTracking.h"
 #include "ControlLook.h"
 
 BCheckBox::BCheckBox(BRect frame, const char* name, const char* label, BMessage* message,
 	uint32 resizingMode, uint32 flags)
 	: BControl(frame, name, label, message, resizingMode, flags | B_FULL_UPDATE_ON_RESIZE),
-	  fPressed(false)
+	  fTracking(std::make_unique<BPrivate::ClickTracking>(this))
 {
 }
 
 
 BCheckBox::BCheckBox(const char* name, const char* label, BMessage* message, uint32 flags)
 	: BControl(name, label, message, flags | B_FULL_UPDATE_ON_RESIZE),
-	  fPressed(false)
+	  fTracking(std::make_unique<BPrivate::ClickTracking>(this))
 {
 }
 
@@ -29,7 +30,7 @@ BCheckBox::BCheckBox(const char* label, BMessage* message)
 
 BCheckBox::BCheckBox(BMessage* archive)
 	: BControl(archive),
-	  fPressed(false)
+	  fTracking(std::make_unique<BPrivate::ClickTracking>(this))
 {
 }
 
@@ -47,7 +48,8 @@ BCheckBox::Instantiate(BMessage* archive)
 void
 BCheckBox::Draw(BRect)
 {
-	const BPrivate::ControlState state = {IsEnabled(), IsFocus() && Window()->IsActive(), fPressed};
+	const BPrivate::ControlState state = {
+		IsEnabled(), IsFocus() && Window()->IsActive(), fTracking->IsPressed()};
 	const BRect box = BPrivate::MarkFrame(this);
 	BPrivate::DrawFieldSurface(this, box, state);
 	if (Value() != B_CONTROL_OFF)
@@ -59,7 +61,7 @@ BCheckBox::Draw(BRect)
 void
 BCheckBox::DetachedFromWindow()
 {
-	fPressed = false;
+	fTracking->Cancel();
 	BControl::DetachedFromWindow();
 }
 
@@ -67,24 +69,14 @@ BCheckBox::DetachedFromWindow()
 void
 BCheckBox::MouseDown(BPoint)
 {
-	if (!IsEnabled())
-		return;
-	SetMouseEventMask(B_POINTER_EVENTS, B_NO_POINTER_HISTORY | B_SUSPEND_VIEW_FOCUS);
-	SetTracking(true);
-	fPressed = true;
-	Invalidate();
+	fTracking->MouseDown();
 }
 
 
 void
 BCheckBox::MouseUp(BPoint where)
 {
-	if (!IsTracking())
-		return;
-	SetTracking(false);
-	fPressed = false;
-	Invalidate();
-	if (IsEnabled() && Bounds().Contains(where))
+	if (fTracking->MouseUp(where))
 		Toggle();
 }
 
@@ -92,24 +84,16 @@ BCheckBox::MouseUp(BPoint where)
 void
 BCheckBox::MouseMoved(BPoint where, uint32, const BMessage*)
 {
-	if (!IsTracking())
-		return;
-	const bool inside = Bounds().Contains(where);
-	if (inside != fPressed) {
-		fPressed = inside;
-		Invalidate();
-	}
+	fTracking->MouseMoved(where);
 }
 
 
 void
 BCheckBox::KeyDown(const char* bytes, int32 numBytes)
 {
-	if (numBytes != 1 || (bytes[0] != B_ENTER && bytes[0] != B_SPACE)) {
+	if (!BPrivate::ClickTracking::IsClickKey(bytes, numBytes))
 		BView::KeyDown(bytes, numBytes);
-		return;
-	}
-	if (IsEnabled())
+	else if (IsEnabled())
 		Toggle();
 }
 

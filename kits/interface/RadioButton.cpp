@@ -4,19 +4,20 @@
 
 #include <Window.h>
 
+#include "ClickTracking.h"
 #include "ControlLook.h"
 
 BRadioButton::BRadioButton(BRect frame, const char* name, const char* label, BMessage* message,
 	uint32 resizingMode, uint32 flags)
 	: BControl(frame, name, label, message, resizingMode, flags | B_FULL_UPDATE_ON_RESIZE),
-	  fPressed(false)
+	  fTracking(std::make_unique<BPrivate::ClickTracking>(this))
 {
 }
 
 
 BRadioButton::BRadioButton(const char* name, const char* label, BMessage* message, uint32 flags)
 	: BControl(name, label, message, flags | B_FULL_UPDATE_ON_RESIZE),
-	  fPressed(false)
+	  fTracking(std::make_unique<BPrivate::ClickTracking>(this))
 {
 }
 
@@ -29,7 +30,7 @@ BRadioButton::BRadioButton(const char* label, BMessage* message)
 
 BRadioButton::BRadioButton(BMessage* archive)
 	: BControl(archive),
-	  fPressed(false)
+	  fTracking(std::make_unique<BPrivate::ClickTracking>(this))
 {
 }
 
@@ -48,7 +49,8 @@ void
 BRadioButton::Draw(BRect)
 {
 	BPrivate::DrawRoundField(this, BPrivate::MarkFrame(this),
-		{IsEnabled(), IsFocus() && Window()->IsActive(), fPressed}, Value() != B_CONTROL_OFF);
+		{IsEnabled(), IsFocus() && Window()->IsActive(), fTracking->IsPressed()},
+		Value() != B_CONTROL_OFF);
 	BPrivate::DrawMarkLabel(this, Label(), IsEnabled());
 }
 
@@ -56,7 +58,7 @@ BRadioButton::Draw(BRect)
 void
 BRadioButton::DetachedFromWindow()
 {
-	fPressed = false;
+	fTracking->Cancel();
 	BControl::DetachedFromWindow();
 }
 
@@ -64,24 +66,14 @@ BRadioButton::DetachedFromWindow()
 void
 BRadioButton::MouseDown(BPoint)
 {
-	if (!IsEnabled())
-		return;
-	SetMouseEventMask(B_POINTER_EVENTS, B_NO_POINTER_HISTORY | B_SUSPEND_VIEW_FOCUS);
-	SetTracking(true);
-	fPressed = true;
-	Invalidate();
+	fTracking->MouseDown();
 }
 
 
 void
 BRadioButton::MouseUp(BPoint where)
 {
-	if (!IsTracking())
-		return;
-	SetTracking(false);
-	fPressed = false;
-	Invalidate();
-	if (IsEnabled() && Bounds().Contains(where))
+	if (fTracking->MouseUp(where))
 		Choose();
 }
 
@@ -89,24 +81,16 @@ BRadioButton::MouseUp(BPoint where)
 void
 BRadioButton::MouseMoved(BPoint where, uint32, const BMessage*)
 {
-	if (!IsTracking())
-		return;
-	const bool inside = Bounds().Contains(where);
-	if (inside != fPressed) {
-		fPressed = inside;
-		Invalidate();
-	}
+	fTracking->MouseMoved(where);
 }
 
 
 void
 BRadioButton::KeyDown(const char* bytes, int32 numBytes)
 {
-	if (numBytes != 1 || (bytes[0] != B_ENTER && bytes[0] != B_SPACE)) {
+	if (!BPrivate::ClickTracking::IsClickKey(bytes, numBytes))
 		BView::KeyDown(bytes, numBytes);
-		return;
-	}
-	if (IsEnabled())
+	else if (IsEnabled())
 		Choose();
 }
 

@@ -3,6 +3,8 @@
 #ifndef _CHECK_BOX_H
 #define _CHECK_BOX_H
 
+#include <memory>
+
 #include <Control.h>
 
 /// A check box: a click toggles its value between 0 and 1 and sends its message.
@@ -32,7 +34,7 @@ public:
 private:
 	void Toggle();
 
-	bool fPressed;
+	std::unique_ptr<BPrivate::ClickTracking> fTracking;
 };
 
 #endif // _CHECK_BOX_H

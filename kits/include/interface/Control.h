@@ -7,6 +7,10 @@
 #include <String.h>
 #include <View.h>
 
+namespace BPrivate {
+class ClickTracking;
+}
+
 enum {
 	B_CONTROL_OFF = 0,
 	B_CONTROL_ON = 1,
@@ -68,6 +72,8 @@ protected:
 	void SetValueNoUpdate(int32 value);
 
 private:
+	friend class BPrivate::ClickTracking;
+
 	BString fLabel;
 	int32 fValue;
 	bool fEnabled;

@@ -3,6 +3,8 @@
 #ifndef _RADIO_BUTTON_H
 #define _RADIO_BUTTON_H
 
+#include <memory>
+
 #include <Control.h>
 
 /// A radio button: a click turns it on, the others of its group off, and sends its message.
@@ -34,7 +36,7 @@ public:
 private:
 	void Choose();
 
-	bool fPressed;
+	std::unique_ptr<BPrivate::ClickTracking> fTracking;
 };
 
 #endif // _RADIO_BUTTON_H
