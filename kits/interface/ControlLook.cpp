@@ -31,16 +31,6 @@ StrokeRoundFrame(BView* view, BRect frame, float radius, rgb_color color)
 
 
 rgb_color
-BorderColor(ControlState state)
-{
-	if (state.enabled && state.focused)
-		return ui_color(B_KEYBOARD_NAVIGATION_COLOR);
-	const rgb_color border = tint_color(ui_color(B_CONTROL_BORDER_COLOR), B_DARKEN_2_TINT);
-	return StrengthOf(state.enabled, border, ui_color(B_PANEL_BACKGROUND_COLOR));
-}
-
-
-rgb_color
 MarkColor(ControlState state)
 {
 	return StrengthOf(state.enabled, ui_color(B_CONTROL_MARK_COLOR), FieldColor(state));
@@ -103,11 +93,21 @@ FieldColor(ControlState state)
 }
 
 
+rgb_color
+ControlBorderColor(ControlState state)
+{
+	if (state.enabled && state.focused)
+		return ui_color(B_KEYBOARD_NAVIGATION_COLOR);
+	const rgb_color border = tint_color(ui_color(B_CONTROL_BORDER_COLOR), B_DARKEN_2_TINT);
+	return StrengthOf(state.enabled, border, ui_color(B_PANEL_BACKGROUND_COLOR));
+}
+
+
 void
 DrawButtonSurface(BView* view, BRect frame, ControlState state, bool isDefault)
 {
 	if (isDefault) {
-		const rgb_color mark = BorderColor({state.enabled, false, false});
+		const rgb_color mark = ControlBorderColor({state.enabled, false, false});
 		const BRect around = view->Bounds();
 		StrokeRoundFrame(view, around, kButtonRadius + 2, mark);
 		StrokeRoundFrame(view, around.InsetByCopy(1, 1), kButtonRadius + 1,
@@ -116,9 +116,10 @@ DrawButtonSurface(BView* view, BRect frame, ControlState state, bool isDefault)
 
 	view->SetHighColor(ButtonSurfaceColor(state));
 	view->FillRoundRect(frame, kButtonRadius, kButtonRadius);
-	StrokeRoundFrame(view, frame, kButtonRadius, BorderColor(state));
+	StrokeRoundFrame(view, frame, kButtonRadius, ControlBorderColor(state));
 	if (state.enabled && state.focused) {
-		const rgb_color ring = BlendColors(ButtonSurfaceColor(state), BorderColor(state), 0.5f);
+		const rgb_color ring =
+			BlendColors(ButtonSurfaceColor(state), ControlBorderColor(state), 0.5f);
 		StrokeRoundFrame(view, frame.InsetByCopy(1, 1), kButtonRadius - 1, ring);
 	}
 }
@@ -129,7 +130,7 @@ DrawFieldSurface(BView* view, BRect frame, ControlState state)
 {
 	view->SetHighColor(FieldColor(state));
 	view->FillRect(frame);
-	view->SetHighColor(BorderColor(state));
+	view->SetHighColor(ControlBorderColor(state));
 	view->StrokeRect(frame);
 }
 
@@ -139,7 +140,7 @@ DrawRoundField(BView* view, BRect frame, ControlState state, bool on)
 {
 	view->SetHighColor(FieldColor(state));
 	view->FillEllipse(frame);
-	view->SetHighColor(BorderColor(state));
+	view->SetHighColor(ControlBorderColor(state));
 	view->StrokeEllipse(frame);
 	if (!on)
 		return;

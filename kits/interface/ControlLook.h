@@ -30,6 +30,9 @@ rgb_color ControlTextColor(bool enabled, rgb_color background);
 rgb_color ButtonSurfaceColor(ControlState state);
 rgb_color FieldColor(ControlState state);
 
+/// The border of a button or a field.
+rgb_color ControlBorderColor(ControlState state);
+
 /// The surface of a push button with its border and its focus ring.
 void DrawButtonSurface(BView* view, BRect frame, ControlState state, bool isDefault);
 

@@ -19,7 +19,7 @@ enum color_control_layout {
 /// Four ramps (grey, red, green, blue) and three number fields that choose a colour.
 ///
 /// The value is red << 24 | green << 16 | blue << 8. Clicks and drags on the ramps, keys and edited
-/// numbers send the message each time they change it. The size follows from the layout, the cell size
+/// numbers send the message each time they change it. Below the ramps is the chosen colour. The size follows from the layout, the cell size
 /// and the font: read Frame().
 class BColorControl : public BControl {
 public:
@@ -48,7 +48,6 @@ public:
 	color_control_layout Layout() const;
 
 	void AttachedToWindow() override;
-	void DetachedFromWindow() override;
 	void MessageReceived(BMessage* message) override;
 	void Draw(BRect updateRect) override;
 	void MouseDown(BPoint where) override;
@@ -63,14 +62,14 @@ public:
 private:
 	void Build();
 	void LayOut();
-	void ShowValue();
+	void ShowNumbers();
 	void ChangeValue(int32 value);
 	void NumberEntered();
 
 	bool IsUpright() const;
-	BRect PaletteFrame() const;
+	float PaletteWidth() const;
+	float PaletteHeight() const;
 	BRect RampFrame(int32 ramp) const;
-	BRect SampleFrame() const;
 	int32 RampAt(BPoint where) const;
 	int32 LevelAt(int32 ramp, BPoint where) const;
 	int32 LevelOf(int32 ramp) const;
@@ -82,7 +81,8 @@ private:
 	color_control_layout fLayout;
 	float fCellSize;
 	bool fUseOffscreen;
-	BTextControl* fNumbers[3];
+	BTextControl* fNumbers[3] = {};
+	BRect fSampleFrame;
 	int32 fCurrentRamp;
 	int32 fTrackedRamp;
 };

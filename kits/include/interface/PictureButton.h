@@ -16,7 +16,7 @@ enum picture_button_behavior {
 /// A button with a picture for each of its states, drawn at (0, 0).
 ///
 /// A button with one state has the value 1 while it is pressed; one with two toggles its value at each
-/// click. Pictures are copied; a picture that a state lacks is drawn by the one for the enabled state.
+/// click. Pictures are copied; without a picture for the disabled state the enabled one's is shown faded.
 class BPictureButton : public BControl {
 public:
 	BPictureButton(BRect frame, const char* name, BPicture* off, BPicture* on, BMessage* message,
@@ -34,7 +34,6 @@ public:
 	void MouseDown(BPoint where) override;
 	void MouseUp(BPoint where) override;
 	void MouseMoved(BPoint where, uint32 code, const BMessage* dragMessage) override;
-	void SetValue(int32 value) override;
 	status_t Invoke(BMessage* message = NULL) override;
 
 	/// Copied; null takes the picture away.
@@ -54,8 +53,7 @@ public:
 
 private:
 	void SetPicture(std::unique_ptr<BPicture>* place, BPicture* picture);
-	const BPicture* PresentPicture() const;
-	void Click();
+	int32 PressedValue() const;
 
 	std::unique_ptr<BPicture> fEnabledOff;
 	std::unique_ptr<BPicture> fEnabledOn;

@@ -44,14 +44,13 @@ public:
 	static BArchivable* Instantiate(BMessage* archive);
 	status_t Archive(BMessage* archive, bool deep = true) const override;
 
-	void AttachedToWindow() override;
 	void DetachedFromWindow() override;
 	void KeyDown(const char* bytes, int32 numBytes) override;
 	void KeyUp(const char* bytes, int32 numBytes) override;
 	void MouseDown(BPoint where) override;
 	void MouseUp(BPoint where) override;
 	void MouseMoved(BPoint where, uint32 code, const BMessage* dragMessage) override;
-	void FrameResized(float newWidth, float newHeight) override;
+	void MakeFocus(bool focus = true) override;
 	void GetPreferredSize(float* _width, float* _height) override;
 	void ResizeToPreferred() override;
 	void SetFont(const BFont* font, uint32 mask = B_FONT_ALL) override;
@@ -99,7 +98,8 @@ public:
 	/// Takes over the message.
 	virtual void SetModificationMessage(BMessage* message);
 	BMessage* ModificationMessage() const;
-	/// The least time between two changes while the thumb is dragged, in microseconds.
+	/// Microseconds, at most a second. The thumb follows the pointer's messages and needs no such
+	/// pauses: it is kept for those who ask.
 	virtual void SetSnoozeAmount(int32 microSeconds);
 	int32 SnoozeAmount() const;
 	virtual void SetKeyIncrementValue(int32 value);
@@ -125,16 +125,19 @@ public:
 	virtual void SetBarThickness(float thickness);
 
 private:
-	void Init();
-	void SendModification();
-	void FinishChange(int32 before);
+	void BeginChange();
+	void ChangeValue(int32 value);
+	void FinishChange();
 	void TrackTo(BPoint where);
-	bool HasUpdateText() const;
-	float LineHeight() const;
-	float ThumbLength() const;
-	float ThumbMiddle() const;
-	rgb_color SurfaceColor(rgb_color color) const;
-	void DrawHashMarkRow(float from, float to);
+	void Redraw();
+
+	bool IsHorizontal() const;
+	bool HasTitleLine() const;
+	bool HasLimitLine() const;
+	int32 TopLines() const;
+	int32 BottomLines() const;
+	BPoint ThumbPoint() const;
+	void DrawTextIn(float top, alignment align, const char* text);
 
 	BMessage* fModificationMessage;
 	int32 fSnoozeAmount;
@@ -152,9 +155,10 @@ private:
 	rgb_color fFillColor;
 	bool fUsesBarColor;
 	bool fUsesFillColor;
+	bool fHasFillColor;
+	bool fIsChanging;
 	int32 fValueBefore;
 	float fGrabOffset;
-	bigtime_t fNextChange;
 };
 
 #endif // _SLIDER_H

@@ -24,7 +24,6 @@ public:
 
 	void AttachedToWindow() override;
 	void MessageReceived(BMessage* message) override;
-	void FrameResized(float newWidth, float newHeight) override;
 	void Draw(BRect updateRect) override;
 	void GetPreferredSize(float* _width, float* _height) override;
 	void SetFont(const BFont* font, uint32 mask = B_FONT_ALL) override;
@@ -56,15 +55,14 @@ public:
 	const char* TrailingLabel() const;
 
 private:
-	void SetValue(float value);
+	void SetCurrent(float value);
 	void SetString(BString* text, const char* string);
-	bool HasText() const;
+	void NoteTexts();
+	void FitHeight();
 	float TextHeight() const;
-	float DefaultBarHeight() const;
 	float FilledWidth(float value) const;
 	BRect BarFrame() const;
 	void DrawTexts();
-	void DrawBar();
 
 	BString fLabel;
 	BString fTrailingLabel;
@@ -75,6 +73,7 @@ private:
 	float fBarHeight;
 	rgb_color fBarColor;
 	bool fUsesBarColor;
+	bool fKeepsTextLine;
 };
 
 #endif // _STATUS_BAR_H

@@ -58,9 +58,12 @@ public:
 private:
 	friend class BTabView;
 
+	void SetContents(BView* view);
+
 	BString fLabel;
 	BView* fView;
 	BTabView* fTabView;
+	BRect fContainerSize;
 	bool fEnabled;
 	bool fSelected;
 	bool fFocus;
@@ -70,7 +73,7 @@ private:
 /// A row of tabs and a container in which the selected one's view lies, at its own frame.
 ///
 /// Only the selected tab's view is attached. Tabs that do not fit are reached by two arrows at the end
-/// of the row. With the focus, the arrow keys move the focus mark and Space or Enter selects.
+/// of the row. With the focus, the arrow keys select the next enabled tab, Home and End the outer ones.
 class BTabView : public BView {
 public:
 	enum tab_side {
@@ -95,11 +98,8 @@ public:
 	status_t Archive(BMessage* archive, bool deep = true) const override;
 
 	void AttachedToWindow() override;
-	void AllAttached() override;
-	void DetachedFromWindow() override;
 	void KeyDown(const char* bytes, int32 numBytes) override;
 	void MouseDown(BPoint where) override;
-	void MouseMoved(BPoint where, uint32 code, const BMessage* dragMessage) override;
 	void WindowActivated(bool active) override;
 	void MakeFocus(bool focus = true) override;
 	void Draw(BRect updateRect) override;
@@ -150,14 +150,21 @@ private:
 	friend class BTab;
 
 	void Init(button_width width);
-	void LayOutContainer();
 	void TabChanged();
+	void Deselect();
+	void AttachContents(BTab* tab);
+	void SelectByKey(int32 index);
+	int32 NextEnabledTab(int32 from, int32 step) const;
+	void Redraw();
 
+	void LayOutContainer();
 	bool IsSideways() const;
 	float BorderWidth() const;
-	float StripThickness() const;
+	float DefaultTabHeight() const;
 	float WidthOfTab(int32 index) const;
+	float StripThickness() const;
 	float LengthOfTab(int32 index) const;
+	float LengthOfStrip() const;
 	BRect StripFrame() const;
 	BRect BoxFrame() const;
 	bool NeedsArrows() const;
@@ -166,17 +173,15 @@ private:
 	int32 LastFirstTab() const;
 	void ScrollTabs(int32 direction);
 	void ShowTab(int32 index);
-	void DrawArrow(int32 direction);
-	int32 NextEnabledTab(int32 from, int32 step) const;
+	void DrawFocus(int32 index, BRect frame);
 
 	BList fTabs;
-	BView* fContainer;
+	BView* fContainer = NULL;
 	button_width fTabWidth;
 	float fTabHeight;
 	tab_side fTabSide;
 	border_style fBorder;
 	int32 fSelection;
-	int32 fArchivedSelection;
 	int32 fFocusTab;
 	int32 fFirstTab;
 };
