@@ -19,8 +19,10 @@ WindowGuard::WindowGuard(BLooper* target, bigtime_t patience)
 	  fOuter(sInnermost)
 {
 	BLooper* held = HeldLooper();
-	if (target != nullptr && target != held)
-		GiveUp(held);
+	if (target != nullptr && target != held) {
+		fGivenUp = held;
+		fLevels = GiveUp(held);
+	}
 	if (target != nullptr)
 		fIsLocked = target->LockWithTimeout(patience) == B_OK;
 	sInnermost = this;
@@ -33,7 +35,7 @@ WindowGuard::~WindowGuard()
 	// The block may have quit the target, whose lock is gone with it.
 	if (fIsLocked && fTarget->IsLocked())
 		fTarget->Unlock();
-	TakeBack();
+	TakeBack(fGivenUp, fLevels);
 }
 
 
@@ -50,22 +52,36 @@ WindowGuard::HeldLooper()
 }
 
 
-void
+int32
 WindowGuard::GiveUp(BLooper* looper)
 {
 	if (looper == nullptr)
-		return;
-	fGivenUp = looper;
-	for (fLevels = looper->CountLocks(); fLevels > 0 && looper->IsLocked(); looper->Unlock()) {
-	}
+		return 0;
+	const int32 levels = looper->CountLocks();
+	for (int32 i = levels; i > 0 && looper->IsLocked(); i--)
+		looper->Unlock();
+	return levels;
 }
 
 
 void
-WindowGuard::TakeBack()
+WindowGuard::TakeBack(BLooper* looper, int32 levels)
 {
-	for (; fLevels > 0; fLevels--) {
-		if (!fGivenUp->Lock())
+	for (; levels > 0; levels--) {
+		if (!looper->Lock())
 			return;
 	}
+}
+
+
+WindowRelease::WindowRelease()
+	: fGivenUp(WindowGuard::HeldLooper()),
+	  fLevels(WindowGuard::GiveUp(fGivenUp))
+{
+}
+
+
+WindowRelease::~WindowRelease()
+{
+	WindowGuard::TakeBack(fGivenUp, fLevels);
 }

@@ -34,13 +34,33 @@ public:
 	bool IsLocked() const { return fIsLocked; }
 
 private:
+	friend class WindowRelease;
+
 	static BLooper* HeldLooper();
-	void GiveUp(BLooper* looper);
-	void TakeBack();
+	/// Unlocks \a looper completely; returns how often it was locked.
+	static int32 GiveUp(BLooper* looper);
+	static void TakeBack(BLooper* looper, int32 levels);
 
 	BLooper* fTarget;
 	bool fIsLocked;
 	BLooper* fGivenUp;
 	int32 fLevels;
 	WindowGuard* fOuter;
+};
+
+/// Gives up the lock that the thread holds, as far as guards know it, for the length of a block.
+///
+/// For what must be done with no window's lock held: waiting for another thread's answer, making a window that
+/// shows itself. Guards within the block work as ever. Look up again afterwards what the lock protects.
+class WindowRelease {
+public:
+	WindowRelease();
+	~WindowRelease();
+
+	WindowRelease(const WindowRelease&) = delete;
+	WindowRelease& operator=(const WindowRelease&) = delete;
+
+private:
+	BLooper* fGivenUp;
+	int32 fLevels;
 };

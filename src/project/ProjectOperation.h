@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include <SupportDefs.h>
+#include <OS.h>
 
 class TProject;
 

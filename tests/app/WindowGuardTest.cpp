@@ -259,3 +259,84 @@ TEST_F(WindowGuardTest, TwoWindowsReachForEachOtherThousandsOfTimes)
 	Close(left);
 	Close(right);
 }
+
+
+TEST_F(WindowGuardTest, AReleaseGivesUpTheLockOfTheGuardAroundIt)
+{
+	BLooper* looper = new BLooper("target");
+	looper->Run();
+	{
+		WindowGuard guard(looper);
+		WindowGuard again(looper);
+		{
+			WindowRelease release;
+			EXPECT_FALSE(looper->IsLocked());
+			WindowGuard inside(looper);
+			EXPECT_TRUE(inside.IsLocked());
+			EXPECT_EQ(looper->CountLocks(), 1);
+		}
+		EXPECT_EQ(looper->CountLocks(), 2);
+	}
+	EXPECT_FALSE(looper->IsLocked());
+	looper->Lock();
+	looper->Quit();
+}
+
+
+TEST_F(WindowGuardTest, AReleaseGivesUpTheLockOfTheWindowWhoseThreadItIs)
+{
+	class WaitingLooper : public BLooper {
+	public:
+		void MessageReceived(BMessage* message) override
+		{
+			WindowRelease release;
+			wasFree = !IsLocked();
+			BMessage reply;
+			BMessenger(other).SendMessage(message, &reply);
+		}
+		BLooper* other = nullptr;
+		bool wasFree = false;
+	};
+	class LockingLooper : public BLooper {
+	public:
+		void MessageReceived(BMessage* message) override
+		{
+			WindowGuard guard(other);
+			reached = guard.IsLocked();
+			message->SendReply(kMsgReach);
+		}
+		BLooper* other = nullptr;
+		bool reached = false;
+	};
+
+	// The one that answers needs the lock of the one that waits.
+	WaitingLooper* waiting = new WaitingLooper;
+	LockingLooper* locking = new LockingLooper;
+	waiting->other = locking;
+	locking->other = waiting;
+	waiting->Run();
+	locking->Run();
+	BMessage reply;
+	BMessenger(waiting).SendMessage(kMsgReach, &reply);
+	ASSERT_TRUE(waiting->Lock());
+	EXPECT_TRUE(waiting->wasFree);
+	waiting->Quit();
+	ASSERT_TRUE(locking->Lock());
+	EXPECT_TRUE(locking->reached);
+	locking->Quit();
+}
+
+
+TEST_F(WindowGuardTest, AReleaseWithoutALockDoesNothing)
+{
+	BLooper* looper = new BLooper("target");
+	looper->Run();
+	{
+		WindowRelease release;
+		WindowGuard guard(looper);
+		EXPECT_TRUE(guard.IsLocked());
+	}
+	EXPECT_FALSE(looper->IsLocked());
+	looper->Lock();
+	looper->Quit();
+}
