@@ -10,6 +10,7 @@
 #include <String.h>
 
 #include "model/Component.h"
+#include "props/PropertyWatch.h"
 
 /// The longest set statement, in bytes.
 static const int32 kMaxSetStatement = 1103;
@@ -55,6 +56,12 @@ TProperty::TProperty(const TProperty& other)
 	fDefValue.SetTo(other.fDefValue.Text());
 	fSetStatement.SetTo(other.fSetStatement.Text());
 	fGetStatement.SetTo(other.fGetStatement.Text());
+}
+
+
+TProperty::~TProperty()
+{
+	TPropertyWatch::PropertyGone(this);
 }
 
 

@@ -28,6 +28,8 @@ public:
 
 	/// A copy refers to the same component and the same editor.
 	TProperty(const TProperty& other);
+	/// Watches of this property (TPropertyWatch) refer to none from now on.
+	~TProperty();
 	TProperty& operator=(const TProperty&) = delete;
 
 	/// The class's own pair, so that deleting a derived property through this class does not tell the
