@@ -17,6 +17,8 @@ public:
 	virtual void TargetScrolled(float value) = 0;
 	/// The wheel was turned by \a delta notches, positive towards the end.
 	virtual void WheelTurned(float delta) = 0;
+	/// The target is about to go; the bar forgets it.
+	virtual void TargetGone() = 0;
 
 protected:
 	~ScrollBarLink() = default;

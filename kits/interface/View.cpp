@@ -52,6 +52,10 @@ BView::BView(BRect frame, const char* name, uint32 resizingMode, uint32 flags)
 BView::~BView()
 {
 	RemoveSelf();
+	for (BPrivate::ScrollBarLink* bar : {fHorizontalBar, fVerticalBar}) {
+		if (bar != nullptr)
+			bar->TargetGone();
+	}
 	while (fFirstChild != nullptr)
 		delete fFirstChild;
 }

@@ -61,7 +61,10 @@ private:
 	BListItem(const BListItem&) = delete;
 	BListItem& operator=(const BListItem&) = delete;
 
+	// The list that it was put in last, at that time.
+	uint64 fStamp;
 	float fTop;
+	float fRowHeight;
 	float fHeight;
 	float fWidth;
 	uint32 fLevel;

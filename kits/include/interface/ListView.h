@@ -171,62 +171,70 @@ private:
 	virtual bool SwapChecked(int32 a, int32 b);
 	virtual bool MoveChecked(int32 from, int32 to);
 	virtual bool ReplaceChecked(int32 index, BListItem* item);
-	virtual bool ContainsAnywhere(BListItem* item) const;
-	// Where rows begin, and how much wider they are than the item.
+	virtual const std::vector<BListItem*>& ArchivedItems() const;
+	// How far right of the list's edge a row begins.
 	virtual float RowIndent(const BListItem* item) const;
 
 	// Items
+	void Stamp(BListItem* item);
+	bool IsStamped(const BListItem* item) const;
+	bool StampAll(const BList* list, std::vector<BListItem*>* items);
 	void InsertAt(int32 index, BListItem* const* items, int32 count);
 	void RemoveRange(int32 index, int32 count);
-	void ItemsMoved(int32 first, int32 last);
-	void UpdateItem(BListItem* item, const BFont& font);
-	void UpdateAllItems();
+	void ReplaceAt(int32 index, BListItem* item);
+	void OrderChanged(int32 first, int32 last);
+	void ForgetAll();
 
 	// Rows
+	void UpdateItem(BListItem* item, const BFont& font);
+	void UpdateAllItems();
+	bool FitRow(BListItem* item);
 	float TopOf(int32 index) const;
 	float ContentHeight() const;
 	float ContentWidth() const;
 	int32 RowAt(float y) const;
 	void InvalidateFrom(int32 index);
 	void InvalidateRows(int32 first, int32 last);
-	void ContentChanged(bool heightChanged);
 	void FixScrollBars();
-	bool ShowsFocus() const;
+	bool DrawsOwnFocus() const;
 	void FocusChanged();
 
 	// Selection
-	bool SelectRange(int32 from, int32 to, bool extend);
+	bool SelectRange(int32 from, int32 to);
 	bool DeselectRange(int32 from, int32 to);
-	void NoteSelection(int32 index);
-	void TrimSelection();
+	bool SelectOnly(int32 from, int32 to);
+	void FindSelectionAgain();
 	void TellSelectionChanged();
+	BMessage* AddSelection(BMessage* message) const;
 
 	// Input
 	void SelectByMouse(int32 index, uint32 modifiers);
 	bool MoveByKey(char key, uint32 modifiers);
 	void MoveCursor(int32 to, uint32 modifiers);
-	int32 NextEnabled(int32 from, int32 step) const;
+	void SetCursor(int32 index, bool shown);
+	int32 EnabledFrom(int32 index, int32 step) const;
+	int32 KeyboardRow() const;
 	void ScrollByPage(int32 direction);
-	void ToggleCursorRow();
 	bool SelectByTyping(const char* bytes, int32 numBytes);
 
 	std::vector<BListItem*> fItems;
 	std::unique_ptr<BMessage> fSelectMessage;
 	std::unique_ptr<BPrivate::ListTyping> fTyping;
 	BScrollView* fScrollView;
+	uint64 fStamp;
 	Press fPress;
 	list_view_type fListType;
 	// Rows before this one have their tops.
 	mutable int32 fValidTops;
+	double fContentHeight;
+	// Below 0 when it must be looked for.
 	mutable float fWidest;
-	mutable bool fWidestValid;
 	// All selected items lie between these two; -1 without.
 	int32 fFirstSelected;
 	int32 fLastSelected;
 	int32 fAnchor;
 	int32 fCursor;
 	bool fShowsCursor;
-	bool fFontReady;
 };
 
 #endif // _LIST_VIEW_H

@@ -99,32 +99,36 @@ protected:
 	void DrawItem(BListItem* item, BRect itemRect, bool complete = false) override;
 
 private:
-	struct Branch;
-
 	void SortAll(int (*cmp)(const void*, const void*)) override;
 	bool SwapChecked(int32 a, int32 b) override;
 	bool MoveChecked(int32 from, int32 to) override;
 	bool ReplaceChecked(int32 index, BListItem* item) override;
-	bool ContainsAnywhere(BListItem* item) const override;
+	const std::vector<BListItem*>& ArchivedItems() const override;
 	float RowIndent(const BListItem* item) const override;
 
-	// The end, in the full list, of the items under the one at an index; -1 stands for the whole list.
+	// Places in the full list
 	int32 EndOfBranch(int32 fullIndex) const;
 	int32 SuperIndex(int32 fullIndex) const;
-	bool GetUnder(BListItem* superItem, int32* first, int32* end, uint32* level) const;
-	bool IsUnder(int32 fullIndex, uint32 level, bool oneLevelOnly) const;
-	bool ShouldShow(int32 fullIndex) const;
-	int32 VisibleIndexFor(int32 fullIndex) const;
+	bool GetUnder(BListItem* superItem, int32* first, int32* end) const;
+	int32 NextUnder(int32 fullIndex, bool oneLevelOnly) const;
 	void InsertFull(int32 fullIndex, BListItem* item);
-	void UpdateSubitemFlag(int32 fullIndex);
 	void TakeOut(int32 first, int32 count);
-	void RebuildRows();
+	void FindSubitems(int32 fullIndex);
 	template <typename Less>
-	void SortBranches(int32 first, int32 end, bool oneLevelOnly, Less less);
+	void SortBranches(int32 first, int32 end, bool oneLevelOnly, const Less& less);
+
+	// Rows
+	bool ShouldShow(int32 fullIndex) const;
+	int32 RowFor(int32 fullIndex) const;
+	int32 CountRows(int32 first, int32 end) const;
+	void GetShown(int32 first, int32 end, std::vector<BListItem*>* shown) const;
+	void RebuildRows();
+	void ShowBranch(int32 fullIndex);
+	void HideBranch(int32 fullIndex);
 
 	bool MoveByOutlineKey(char key);
-	void TrackLatch(BPoint where);
-	void InvalidateLatch();
+	BListItem* LatchAt(BPoint where);
+	void ReleaseLatch();
 
 	std::vector<BListItem*> fFullItems;
 	mutable int32 fLastFound;

@@ -74,6 +74,8 @@ public:
 private:
 	enum Part { kNoPart, kArrowBack, kPageBack, kThumb, kPageForward, kArrowForward };
 
+	friend class BScrollView;
+
 	class Link;
 
 	void Connect(BView* target);
@@ -104,8 +106,7 @@ private:
 	void StartRepeat(bigtime_t delay);
 	void StopTracking();
 	void DragThumb(BPoint where);
-	void TurnWheel(float delta);
-	void ApplyValue(float value);
+	bool TurnWheel(float delta);
 
 	std::unique_ptr<Link> fLink;
 	std::unique_ptr<BMessageRunner> fRepeat;
@@ -122,7 +123,6 @@ private:
 	BPoint fPointer;
 	orientation fOrientation;
 	Part fPressed;
-	bool fHighlighted;
 };
 
 #endif // _SCROLL_BAR_H

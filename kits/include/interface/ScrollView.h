@@ -30,6 +30,8 @@ public:
 	void AttachedToWindow() override;
 	void DetachedFromWindow() override;
 	void Draw(BRect updateRect) override;
+	/// The border lies over the edges of the bars.
+	void DrawAfterChildren(BRect updateRect) override;
 	void FrameMoved(BPoint newPosition) override;
 	void FrameResized(float newWidth, float newHeight) override;
 	void MessageReceived(BMessage* message) override;
@@ -57,9 +59,6 @@ public:
 	BView* Target() const;
 
 private:
-	BScrollView(const char* name, BView* target, uint32 resizingMode, uint32 flags,
-		border_style border, bool horizontal, bool vertical);
-
 	float BorderSize() const;
 	BRect TargetFrame() const;
 	BRect BarFrame(orientation direction) const;

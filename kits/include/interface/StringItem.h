@@ -18,7 +18,7 @@ public:
 	status_t Archive(BMessage* archive, bool deep = true) const override;
 
 	void DrawItem(BView* owner, BRect frame, bool complete = false) override;
-	/// A line and 4 pixels high, and as wide as the text.
+	/// A line and 4 pixels high, and as wide as the text with a margin at both sides.
 	void Update(BView* owner, const BFont* font) override;
 
 	/// Shows after BListView::InvalidateItem(); the width stays until the next Update().
