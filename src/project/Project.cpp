@@ -2,101 +2,111 @@
 
 #include "project/Project.h"
 
-#include <cstdio>
+#include <algorithm>
 #include <cstring>
 
-#include <Entry.h>
-#include <Node.h>
-#include <Path.h>
+#include <Messenger.h>
 
-#include "app/Dialogs.h"
+#include "app/WindowGuard.h"
 #include "designer/DesignFormView.h"
-#include "designer/FormFile.h"
-#include "designer/LoadReport.h"
-#include "model/AppComponent.h"
-#include "model/Event.h"
-#include "model/Property.h"
+#include "project/InspectorLink.h"
+#include "project/ProjectObserver.h"
+#include "project/ProjectOperation.h"
 
 namespace {
 
-constexpr const char* kMainFormAttribute = "PLIM:MainForm";
 constexpr int32 kNameSize = 80;
+constexpr size_t kFilenameSize = 256;
+// To no window: answered when the messages before it have been handled.
+constexpr uint32 kMsgAreYouDone = '_don';
+
+
+/// Whether the form was changed since it was saved. Its window is locked.
+bool
+IsChanged(const TDesignForm* form)
+{
+	return form->Modified() || form->TFormComponent::Modified();
+}
 
 } // namespace
 
+TProject::AppOwner::AppOwner(TProject* project)
+	: fProject(project)
+{
+}
+
+
+bool
+TProject::AppOwner::ComponentPropertyModified(
+	TComponent* component, const char* name, const char*, const char* newValue)
+{
+	TProjectObserver* observer = fProject->fObserver;
+	if (observer != nullptr && newValue != nullptr && strcmp(name, "Name") == 0)
+		observer->NameChanged(component, newValue);
+	return true;
+}
+
+
 TProject::TProject(form_visibility visibility)
 	: fVisibility(visibility),
-	  fFilename(),
+	  fOperation("project operation"),
+	  fObserver(nullptr),
+	  fAppLooper(nullptr),
+	  fAppOwner(this),
+	  fApp(MakeApp()),
+	  fCurrentApp(fApp.get()),
+	  fFilename(&*fFilenames.emplace().first),
 	  fStatus(B_NO_INIT)
 {
-	NewProject(false);
 }
 
 
 TProject::~TProject()
 {
-	CloseForms();
+	Close(Forms());
+}
+
+
+void
+TProject::SetObserver(TProjectObserver* observer, BLooper* appLooper)
+{
+	fObserver = observer;
+	fAppLooper = appLooper;
 }
 
 
 void
 TProject::NewProject(bool withForm)
 {
-	CloseForms();
-	fApp = std::make_unique<TAppComponent>();
-	fApp->SetClassName("TMyApplication");
-	fApp->SetComponentName("Application");
-	fApp->SetPropertyValue("Name", "Application");
+	TProjectOperation operation(this);
+	const std::vector<TDesignForm*> oldForms = Forms();
+	StopServing(oldForms);
+
+	std::unique_ptr<TAppComponent> oldApp = std::move(fApp);
+	fApp = MakeApp();
+	fCurrentApp = fApp.get();
+	{
+		std::lock_guard<std::mutex> lock(fListLock);
+		fForms.clear();
+	}
+	// It shows the new application, in the property window too, which so lets go of what is about to go.
+	if (fObserver != nullptr)
+		fObserver.load()->ProjectStarted(fApp.get());
+	Quit(oldForms);
+	oldApp.reset();
+
 	SetFilename("");
 	if (withForm)
-		AddForm("Form1")->SetAsMainForm(true);
-	fApp->SetModified(false);
+		SetMainForm(AddForm({nullptr, BString(), BString()}, "Form1"));
+	MarkApp(false);
 }
 
 
-bool
-TProject::LoadFromFile(const char* path, TLoadReport* report)
+const char*
+TProject::Filename() const
 {
-	printf("** filename = '%s'\n", path);
-	TPLIMFile document(kProjectFileType);
-	document.SetFilename(path);
-	// The path may be the project's own, which a new project forgets.
-	const BString filename(path);
-	NewProject(false);
-	const bool opened = document.OpenFile();
-	fStatus = document.InitCheck();
-	if (!opened)
-		return false;
-
-	SetFilename(filename.String());
-	LoadApp(document);
-	LoadForms(document, report);
-	ReadMainForm();
-	fApp->SetModified(false);
-	return true;
-}
-
-
-bool
-TProject::SaveToFile(const char* path, bool saveForms)
-{
-	TPLIMFile document(kProjectFileType);
-	document.what = 'PPrj';
-	if (!AddAppTo(&document))
-		return false;
-	if (saveForms)
-		SaveForms(&document);
-
-	document.SetFilename(path);
-	const bool saved = document.SaveFile();
-	fStatus = document.InitCheck();
-	if (!saved)
-		return false;
-
-	SetFilename(path);
-	WriteMainForm();
-	fApp->SetModified(false);
-	return true;
+	std::lock_guard<std::mutex> lock(fListLock);
+	return fFilename->c_str();
 }
 
 
@@ -105,32 +115,97 @@ TProject::SetFilename(const char* name)
 {
 	if (name == nullptr)
 		return;
-	// The name may be this very one.
-	const size_t length = strnlen(name, sizeof(fFilename) - 1);
-	memmove(fFilename, name, length);
-	fFilename[length] = '\0';
+	std::lock_guard<std::mutex> lock(fListLock);
+	fFilename = &*fFilenames.emplace(name, strnlen(name, kFilenameSize - 1)).first;
+}
+
+
+bool
+TProject::IsDirty()
+{
+	TProjectOperation operation(this);
+	{
+		WindowGuard guard(fAppLooper);
+		if (fApp->Modified())
+			return true;
+	}
+	for (TDesignForm* form : Forms()) {
+		WindowGuard guard(form, B_INFINITE_TIMEOUT);
+		if (guard.IsLocked() && (IsChanged(form) || *form->Filename() == '\0'))
+			return true;
+	}
+	return false;
+}
+
+
+bool
+TProject::HasUnsavedForms()
+{
+	TProjectOperation operation(this);
+	for (TDesignForm* form : Forms()) {
+		WindowGuard guard(form, B_INFINITE_TIMEOUT);
+		if (guard.IsLocked() && IsChanged(form) && *form->Filename() != '\0')
+			return true;
+	}
+	return false;
+}
+
+
+BString
+TProject::AppName()
+{
+	TProjectOperation operation(this);
+	WindowGuard guard(fAppLooper);
+	return fApp->ComponentName();
 }
 
 
 TDesignForm*
 TProject::NewForm()
 {
-	TDesignForm* form = new TDesignForm("Form", fVisibility, this);
-	char name[kNameSize];
-	GetNewComponentName(form, fApp.get(), name, sizeof(name));
-	form->SetComponentName(name);
-	form->SetPropertyValue("Name", name);
-	fForms.push_back({form, BString(), BString()});
-	fApp->AddComponent(form);
-	fApp->SetModified(true);
+	TProjectOperation operation(this);
+	TDesignForm* form = MakeForm("Form");
+	const BString name = FreeNameFor(form);
+	{
+		WindowGuard guard(form, B_INFINITE_TIMEOUT);
+		form->SetComponentName(name.String());
+		form->SetPropertyValue("Name", name.String());
+	}
+	Enter({form, BString(), BString()}, name.String());
+	MarkApp(true);
 	return form;
+}
+
+
+bool
+TProject::RemoveForm(TDesignForm* form)
+{
+	TProjectOperation operation(this);
+	if (!HasForm(form))
+		return false;
+	{
+		std::lock_guard<std::mutex> lock(fListLock);
+		fForms.erase(std::find_if(fForms.begin(), fForms.end(),
+			[form](const form_entry& entry) { return entry.form == form; }));
+	}
+	if (fObserver != nullptr)
+		fObserver.load()->FormRemoved(form);
+	{
+		WindowGuard guard(form, B_INFINITE_TIMEOUT);
+		if (guard.IsLocked())
+			fApp->RemoveComponent(form);
+	}
+	Close({form});
+	return true;
 }
 
 
 std::vector<TDesignForm*>
 TProject::Forms() const
 {
+	std::lock_guard<std::mutex> lock(fListLock);
 	std::vector<TDesignForm*> forms;
+	forms.reserve(fForms.size());
 	for (const form_entry& entry : fForms)
 		forms.push_back(entry.form);
 	return forms;
@@ -138,15 +213,17 @@ TProject::Forms() const
 
 
 void
-TProject::ObjectNameChanged(TComponent*)
+TProject::ObjectNameChanged(TComponent* object)
 {
-	// The names are the components' own.
+	if (fObserver != nullptr)
+		fObserver.load()->NameChanged(object, object->ComponentName());
 }
 
 
 int32
 TProject::CountForms() const
 {
+	std::lock_guard<std::mutex> lock(fListLock);
 	return static_cast<int32>(fForms.size());
 }
 
@@ -154,16 +231,27 @@ TProject::CountForms() const
 TDesignForm*
 TProject::FormAt(int32 index) const
 {
-	return index >= 0 && index < CountForms() ? fForms[index].form : nullptr;
+	std::lock_guard<std::mutex> lock(fListLock);
+	const bool exists = index >= 0 && index < static_cast<int32>(fForms.size());
+	return exists ? fForms[index].form : nullptr;
+}
+
+
+bool
+TProject::HasForm(const TDesignForm* form) const
+{
+	const std::vector<TDesignForm*> forms = Forms();
+	return std::find(forms.begin(), forms.end(), form) != forms.end();
 }
 
 
 TDesignForm*
 TProject::FindForm(const char* name) const
 {
-	for (const form_entry& entry : fForms) {
-		if (strcmp(entry.form->ComponentName(), name) == 0)
-			return entry.form;
+	for (TDesignForm* form : Forms()) {
+		WindowGuard guard(form, B_INFINITE_TIMEOUT);
+		if (guard.IsLocked() && strcmp(form->ComponentName(), name) == 0)
+			return form;
 	}
 	return nullptr;
 }
@@ -172,178 +260,172 @@ TProject::FindForm(const char* name) const
 void
 TProject::SetMainForm(TDesignForm* form)
 {
-	for (const form_entry& entry : fForms)
-		entry.form->SetAsMainForm(entry.form == form);
-}
-
-
-TDesignForm*
-TProject::AddForm(const char* name)
-{
-	TDesignForm* form = new TDesignForm(name, fVisibility, this);
-	fForms.push_back({form, BString(), BString()});
-	fApp->AddComponent(form);
-	return form;
-}
-
-
-void
-TProject::CloseForms()
-{
-	if (fApp != nullptr)
-		fApp->ClearComponents(false);
-	for (const form_entry& entry : fForms) {
-		entry.form->OKToClose(true);
-		if (entry.form->Lock())
-			entry.form->Quit();
-	}
-	fForms.clear();
-}
-
-
-void
-TProject::LoadApp(const BMessage& document)
-{
-	char* name;
-	type_code type;
-	BMessage properties;
-	if (document.FindMessage("AppProperties", &properties) != B_OK)
-		printf("Warning: Unable to load app properties.\n");
-	for (int32 i = 0; properties.GetInfo(B_STRING_TYPE, i, &name, &type) == B_OK; i++) {
-		const char* value = nullptr;
-		TProperty* property = fApp->FindProperty(name);
-		if (properties.FindString(name, &value) == B_OK && property != nullptr)
-			property->SetValue(value);
-		fApp->SetPropertyValue(name, value);
-	}
-
-	BMessage events;
-	if (document.FindMessage("AppEvents", &events) != B_OK)
-		printf("Warning: Unable to load app events.\n");
-	for (int32 i = 0; events.GetInfo(B_BOOL_TYPE, i, &name, &type) == B_OK; i++) {
-		bool selected;
-		if (events.FindBool(name, &selected) == B_OK)
-			fApp->SetEventSelection(name, selected);
+	TProjectOperation operation(this);
+	for (TDesignForm* each : Forms()) {
+		WindowGuard guard(each, B_INFINITE_TIMEOUT);
+		if (guard.IsLocked())
+			each->SetAsMainForm(each == form);
 	}
 }
 
 
 void
-TProject::LoadForms(const BMessage& document, TLoadReport* report)
+TProject::SetFormsClosing(bool closing)
 {
-	char* name;
-	type_code type;
-	for (int32 i = 0; document.GetInfo(B_STRING_TYPE, i, &name, &type) == B_OK; i++) {
-		const char* path;
-		if (document.FindString(name, &path) != B_OK)
-			continue;
-		AddForm(name);
-		form_entry& entry = fForms.back();
-		entry.storedPath = path;
-		entry.resolvedPath = ResolvePath(path);
-		LoadForm(entry, report);
+	for (TDesignForm* form : Forms()) {
+		WindowGuard guard(form, B_INFINITE_TIMEOUT);
+		if (guard.IsLocked())
+			form->OKToClose(closing);
 	}
-}
-
-
-void
-TProject::LoadForm(form_entry& entry, TLoadReport* report)
-{
-	const char* path = entry.resolvedPath.String();
-	if (entry.form->LoadFromFile(path, report))
-		return;
-
-	BString text;
-	text << "the form '" << entry.form->ComponentName() << "' cannot be read";
-	if (report != nullptr)
-		report->Add(LOAD_FILE_UNREADABLE, path, text);
-	text = "";
-	text << "Unable to load the file '" << path << "'. Sorry.";
-	MsgBox("Error", text.String(), "OK");
 }
 
 
 bool
-TProject::AddAppTo(TPLIMFile* document)
+TProject::BeginOperation(bigtime_t patience)
 {
-	BMessage properties('appP');
-	for (int32 i = 0; i < fApp->CountProperties(); i++) {
-		TProperty* property = fApp->PropertyAt(i);
-		properties.AddString(property->Name(), property->Value());
-	}
-	BMessage events('appE');
-	for (int32 i = 0; i < fApp->CountEvents(); i++) {
-		TEvent* event = fApp->EventAt(i);
-		events.AddBool(event->name, event->selected);
-	}
-
-	if (document->AddMessage("AppProperties", &properties) != B_OK) {
-		printf("Warning: Unable to save app properties.\n");
+	if (fOperation.LockWithTimeout(0) == B_OK)
+		return true;
+	if (patience <= 0)
 		return false;
-	}
-	if (document->AddMessage("AppEvents", &events) != B_OK) {
-		printf("Warning: Unable to save app events.\n");
-		return false;
-	}
-	return true;
+	// The other thread may need the window whose lock this one has.
+	WindowRelease release;
+	return fOperation.LockWithTimeout(patience) == B_OK;
 }
 
 
 void
-TProject::SaveForms(TPLIMFile* document)
+TProject::EndOperation()
 {
-	for (const form_entry& entry : fForms) {
-		const BString path(entry.form->Filename());
-		if (path.IsEmpty()) {
-			MsgBox("Information", "There's a form with no filename. Better save that.", "OK");
-			continue;
-		}
-		if (!entry.form->SaveToFile(path.String()))
-			MsgBox("Warning", "Unable to save the form.", "OK");
-		const bool asRead = path == entry.resolvedPath;
-		document->AddString(entry.form->ComponentName(), asRead ? entry.storedPath : path);
-	}
+	const bool isOver = fOperation.CountLocks() == 1;
+	fOperation.Unlock();
+	if (isOver && fObserver != nullptr)
+		fObserver.load()->OperationEnded();
+}
+
+
+std::unique_ptr<TAppComponent>
+TProject::MakeApp()
+{
+	std::unique_ptr<TAppComponent> app = std::make_unique<TAppComponent>();
+	app->SetClassName("TMyApplication");
+	app->SetComponentName("Application");
+	app->SetPropertyValue("Name", "Application");
+	app->SetModified(false);
+	app->SetOwner(&fAppOwner);
+	return app;
 }
 
 
 void
-TProject::ReadMainForm()
+TProject::MarkApp(bool modified)
 {
-	BNode node(fFilename);
-	char name[1024];
-	const ssize_t length =
-		node.ReadAttr(kMainFormAttribute, B_STRING_TYPE, 0, name, sizeof(name) - 1);
-	if (length <= 0)
-		return;
-	name[length] = '\0';
-	SetMainForm(FindForm(name));
+	WindowGuard guard(fAppLooper);
+	fApp->SetModified(modified);
 }
 
 
+/// A new form, which is not in the list yet. It shows itself, and so must be made with no window locked.
+TDesignForm*
+TProject::MakeForm(const char* name)
+{
+	WindowRelease release;
+	return new TDesignForm(name, fVisibility, this);
+}
+
+
+/// Puts a form at the end of the list, called \a name there.
 void
-TProject::WriteMainForm()
+TProject::Enter(const form_entry& entry, const char* name)
 {
-	BNode node(fFilename);
-	node.RemoveAttr(kMainFormAttribute);
-	for (const form_entry& entry : fForms) {
-		if (!entry.form->IsMainForm())
-			continue;
-		const char* name = entry.form->ComponentName();
-		node.WriteAttr(kMainFormAttribute, B_STRING_TYPE, 0, name, strlen(name) + 1);
-		return;
+	{
+		WindowGuard guard(entry.form, B_INFINITE_TIMEOUT);
+		fApp->AddComponent(entry.form);
 	}
+	{
+		std::lock_guard<std::mutex> lock(fListLock);
+		fForms.push_back(entry);
+	}
+	if (fObserver != nullptr)
+		fObserver.load()->FormAdded(entry.form, name);
 }
 
 
-/// A form's path as the document has it, made to start at the project's folder unless it is absolute.
+/// Makes the entry's form, and puts it in the list.
+TDesignForm*
+TProject::AddForm(const form_entry& entry, const char* name)
+{
+	TDesignForm* form = MakeForm(name);
+	Enter({form, entry.storedPath, entry.resolvedPath}, name);
+	return form;
+}
+
+
+std::vector<TProject::form_entry>
+TProject::Entries() const
+{
+	std::lock_guard<std::mutex> lock(fListLock);
+	return fForms;
+}
+
+
+/// The form's present name with the first number that makes it a new one among the project's forms.
 BString
-TProject::ResolvePath(const char* path) const
+TProject::FreeNameFor(const TDesignForm* form) const
 {
-	BPath file(fFilename);
-	BPath folder;
-	BPath resolved;
-	if (*path == '/' || file.GetParent(&folder) != B_OK
-		|| resolved.SetTo(folder.Path(), path) != B_OK)
-		return path;
-	return resolved.Path();
+	// The names, taken from each form with its lock.
+	TComponentOwner taken;
+	std::vector<std::unique_ptr<TComponent>> names;
+	for (TDesignForm* each : Forms()) {
+		WindowGuard guard(each, B_INFINITE_TIMEOUT);
+		if (!guard.IsLocked())
+			continue;
+		names.push_back(std::make_unique<TComponent>(nullptr, nullptr, CT_VISUAL));
+		names.back()->SetComponentName(each->ComponentName());
+		taken.AddComponent(names.back().get());
+	}
+	char name[kNameSize];
+	GetNewComponentName(form, &taken, name, sizeof(name));
+	return name;
+}
+
+
+/// Ends the windows of forms that are in no list any longer.
+void
+TProject::Close(const std::vector<TDesignForm*>& forms)
+{
+	StopServing(forms);
+	for (TDesignForm* form : forms)
+		ForgetInInspector(form);
+	Quit(forms);
+}
+
+
+/// From here on the forms do not turn to other windows any more: what forgets them now does so for good.
+void
+TProject::StopServing(const std::vector<TDesignForm*>& forms)
+{
+	for (TDesignForm* form : forms) {
+		WindowGuard guard(form, B_INFINITE_TIMEOUT);
+		if (guard.IsLocked())
+			form->OKToClose(true);
+	}
+	if (fVisibility == FORM_HIDDEN)
+		return;
+	// A form may be in the middle of a message, and have asked before whether it is closing.
+	WindowRelease release;
+	for (TDesignForm* form : forms) {
+		BMessage reply;
+		BMessenger(form).SendMessage(kMsgAreYouDone, &reply);
+	}
+}
+
+
+void
+TProject::Quit(const std::vector<TDesignForm*>& forms)
+{
+	for (TDesignForm* form : forms) {
+		WindowGuard guard(form, B_INFINITE_TIMEOUT);
+		if (guard.IsLocked())
+			form->Quit();
+	}
 }

@@ -26,6 +26,9 @@ public:
 	/// none, wait for none.
 	virtual void NameChanged(TComponent* object, const char* name) = 0;
 
+	/// The thread that worked on the project is done. Any thread, with any window locked: lock none, wait for none.
+	virtual void OperationEnded() = 0;
+
 protected:
 	~TProjectObserver() = default;
 };

@@ -77,6 +77,7 @@ private:
 	void FormAdded(TDesignForm* form, const char* name) override;
 	void FormRemoved(TDesignForm* form) override;
 	void NameChanged(TComponent* object, const char* name) override;
+	void OperationEnded() override;
 
 	void PlaceOnScreen();
 	void InitControls();
