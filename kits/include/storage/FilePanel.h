@@ -4,6 +4,8 @@
 #ifndef _FILE_PANEL_H
 #define _FILE_PANEL_H
 
+#include <memory>
+
 #include <sys/stat.h>
 
 #include <Entry.h>
@@ -14,6 +16,10 @@ class BMessenger;
 class BNode;
 class BRefFilter;
 class BWindow;
+
+namespace BPrivate {
+struct PanelLink;
+} // namespace BPrivate
 
 /// The status of a node as a filter gets it: the host's own.
 struct stat_beos : public stat {};
@@ -64,12 +70,14 @@ public:
 
 	void SetTarget(BMessenger target);
 	void SetMessage(BMessage* message);
-	/// Call Refresh() to have the shown folder filtered anew.
+	/// The folder is read anew through \a filter, null for none. Call Refresh() when a filter accepts other
+	/// entries than before. On return the old filter is not in use any more.
 	void SetRefFilter(BRefFilter* filter);
-	/// The proposed name, which is selected.
+	/// The proposed name of a save panel, which is selected.
 	void SetSaveText(const char* text);
 	void SetButtonLabel(file_panel_button button, const char* label);
 	void SetNodeFlavors(uint32 flavors);
+	/// What is no folder, or cannot be read, changes nothing; the panel says so. Links are followed.
 	void SetPanelDirectory(const BEntry* newDirectory);
 	void SetPanelDirectory(const BDirectory* newDirectory);
 	void SetPanelDirectory(const entry_ref* newDirectory);
@@ -88,6 +96,8 @@ private:
 	BFilePanel(const BFilePanel&) = delete;
 	BFilePanel& operator=(const BFilePanel&) = delete;
 
+	std::shared_ptr<BPrivate::PanelLink> fLink;
+	const file_panel_mode fMode;
 	BWindow* fWindow;
 };
 

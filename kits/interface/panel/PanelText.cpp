@@ -9,6 +9,8 @@
 
 #include <locale.h>
 
+#include <Errors.h>
+
 namespace BPrivate {
 
 namespace {
@@ -209,6 +211,36 @@ TimeText(time_t time)
 	if (localtime_r(&time, &local) == nullptr
 		|| strftime(text, sizeof(text), "%Y-%m-%d %H:%M", &local) == 0)
 		return "";
+	return text;
+}
+
+
+std::string
+StatusSentence(status_t status)
+{
+	const struct {
+		status_t status;
+		const char* sentence;
+	} kSentences[] = {
+		{B_PERMISSION_DENIED, "Permission denied."},
+		{B_NOT_ALLOWED, "This is not allowed."},
+		{B_ENTRY_NOT_FOUND, "It does not exist."},
+		{B_NOT_A_DIRECTORY, "It is no folder."},
+		{B_FILE_EXISTS, "Something with this name is there already."},
+		{B_NAME_TOO_LONG, "The name is too long."},
+		{B_DEVICE_FULL, "The disk is full."},
+		{B_READ_ONLY_DEVICE, "The disk cannot be written to."},
+		{B_LINK_LIMIT, "Its links lead in a circle."},
+		{B_IO_ERROR, "The disk could not be read or written."},
+		{B_NO_MORE_FDS, "Too many files are open."},
+		{B_NO_MEMORY, "There is not enough memory."},
+	};
+	for (const auto& known : kSentences) {
+		if (known.status == status)
+			return known.sentence;
+	}
+	char text[40];
+	snprintf(text, sizeof(text), "Error 0x%08" PRIx32 ".", static_cast<uint32>(status));
 	return text;
 }
 

@@ -36,6 +36,9 @@ std::string SizeText(off_t size);
 /// The local date and time, "2024-03-09 17:05".
 std::string TimeText(time_t time);
 
+/// Why something about a file failed, "Permission denied." and the like.
+std::string StatusSentence(status_t status);
+
 } // namespace BPrivate
 
 #endif // INTERFACE_PANEL_TEXT_H
