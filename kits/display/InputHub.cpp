@@ -161,7 +161,9 @@ void
 InputHub::AddToSubset(StackedWindow* window, const StackedWindow* member)
 {
 	std::lock_guard<std::mutex> lock(fMutex);
-	window->subset.push_back(member);
+	if (std::find(window->subset.begin(), window->subset.end(), member) == window->subset.end())
+		window->subset.push_back(member);
+	fStack.Reorder();
 }
 
 
@@ -195,7 +197,8 @@ InputHub::Activate(StackedWindow* window)
 	std::lock_guard<std::mutex> lock(fMutex);
 	if (!window->isVisible)
 		return;
-	fStack.Raise(window);
+	if ((window->style.flags & B_AVOID_FRONT) == 0)
+		fStack.Raise(window);
 	ActivateLocked(window);
 }
 
@@ -269,6 +272,23 @@ InputHub::Deliver(StackedWindow* window, std::unique_ptr<BMessage> message)
 
 
 void
+InputHub::RequestClose(StackedWindow* window)
+{
+	std::lock_guard<std::mutex> lock(fMutex);
+	StackedWindow* blocker = fStack.BlockerOf(window);
+	if (blocker == nullptr) {
+		auto message = std::make_unique<BMessage>(B_QUIT_REQUESTED);
+		message->AddInt64("when", system_time());
+		window->client->Deliver(std::move(message));
+		return;
+	}
+	fStack.Raise(blocker);
+	if (fRaiseListener)
+		fRaiseListener(blocker);
+}
+
+
+void
 InputHub::NeedsRedraw(StackedWindow* window)
 {
 	std::lock_guard<std::mutex> lock(fMutex);
@@ -306,8 +326,7 @@ InputHub::SendMove(StackedWindow* window)
 	if (fStack.BlockerOf(window) != nullptr)
 		return;
 	auto message = MakePointerMessage(B_MOUSE_MOVED, window);
-	if (fDrag != nullptr)
-		message->AddMessage("be:drag_message", &fDrag->message);
+	AddDragged(message.get());
 	window->client->Deliver(std::move(message));
 }
 
@@ -322,8 +341,7 @@ InputHub::LeaveWindow(StackedWindow* next)
 
 	auto message = MakePointerMessage(B_MOUSE_MOVED, left);
 	message->AddInt32("be:transit", B_EXITED_VIEW);
-	if (fDrag != nullptr)
-		message->AddMessage("be:drag_message", &fDrag->message);
+	AddDragged(message.get());
 	left->client->Deliver(std::move(message));
 }
 
@@ -435,19 +453,6 @@ InputHub::Released(StackedWindow* under)
 
 
 void
-InputHub::FinishDrag(StackedWindow* under)
-{
-	if (fDrag == nullptr)
-		return;
-	std::unique_ptr<DragState> drag = std::move(fDrag);
-	OverlayMayHaveChanged();
-	if (under == nullptr || fStack.BlockerOf(under) != nullptr)
-		return;
-	under->client->Dropped(std::make_unique<BMessage>(drag->message), fWhere, drag->offset);
-}
-
-
-void
 InputHub::PointerLeft()
 {
 	std::lock_guard<std::mutex> lock(fMutex);
@@ -473,17 +478,6 @@ InputHub::Wheel(float deltaX, float deltaY, std::optional<StackedWindow*> known)
 
 
 void
-InputHub::Drop(std::unique_ptr<BMessage> message, BPoint screenWhere)
-{
-	std::lock_guard<std::mutex> lock(fMutex);
-	fWhere = screenWhere;
-	StackedWindow* under = fStack.WindowAt(screenWhere);
-	if (under != nullptr && fStack.BlockerOf(under) == nullptr)
-		under->client->Dropped(std::move(message), screenWhere, BPoint(0, 0));
-}
-
-
-void
 InputHub::GetPointer(BPoint* screenWhere, uint32* buttons) const
 {
 	std::lock_guard<std::mutex> lock(fMutex);
@@ -497,74 +491,6 @@ InputHub::IdleTime() const
 {
 	std::lock_guard<std::mutex> lock(fMutex);
 	return system_time() - fLastInput;
-}
-
-
-// #pragma mark - tracking and dragging
-
-
-void
-InputHub::BeginTracking(BRect rect, uint32 style)
-{
-	std::lock_guard<std::mutex> lock(fMutex);
-	fTracking = TrackingState{rect, fWhere, style};
-	OverlayMayHaveChanged();
-}
-
-
-void
-InputHub::EndTracking()
-{
-	std::lock_guard<std::mutex> lock(fMutex);
-	fTracking.reset();
-	if (fOverlayListener)
-		fOverlayListener();
-}
-
-
-void
-InputHub::BeginDrag(
-	const BMessage& message, BRect rect, std::shared_ptr<const Picture> image, BPoint offset)
-{
-	std::lock_guard<std::mutex> lock(fMutex);
-	fDrag = std::make_unique<DragState>(DragState{message, std::move(image), rect, offset});
-	if (!fDrag->message.HasInt32("buttons"))
-		fDrag->message.AddInt32("buttons", static_cast<int32>(fButtons));
-	if (fButtons == 0) {
-		FinishDrag(fStack.WindowAt(fWhere));
-		return;
-	}
-	OverlayMayHaveChanged();
-}
-
-
-InputOverlay
-InputHub::Overlay() const
-{
-	std::lock_guard<std::mutex> lock(fMutex);
-	InputOverlay overlay;
-	if (fTracking.has_value()) {
-		BPoint moved = fWhere - fTracking->start;
-		overlay.tracking = fTracking->rect;
-		if (fTracking->style == B_TRACK_RECT_CORNER)
-			overlay.tracking.SetRightBottom(fTracking->rect.RightBottom() + moved);
-		else
-			overlay.tracking.OffsetBy(moved);
-	}
-	if (fDrag != nullptr) {
-		overlay.image = fDrag->image;
-		overlay.dragged = fDrag->rect;
-		overlay.dragged.OffsetTo(fWhere - fDrag->offset);
-	}
-	return overlay;
-}
-
-
-void
-InputHub::OverlayMayHaveChanged()
-{
-	if (fOverlayListener)
-		fOverlayListener();
 }
 
 } // namespace BPrivate

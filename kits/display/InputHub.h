@@ -43,7 +43,7 @@ struct InputOverlay {
 ///
 /// Any thread: one lock inside, held while clients are told, so that a removed window hears nothing more.
 /// While a button is held, moves and the release go to the window of the press. A press in a window that a
-/// modal one blocks brings the modal one to the front and is lost.
+/// modal one blocks brings the modal one to the front and is lost. Escape ends a drag without a drop.
 class InputHub {
 public:
 	/// \a managesFocus: nobody else raises and activates windows, so showing and pressing do.
@@ -77,6 +77,8 @@ public:
 	/// Delivers a message that is about one window, such as B_WINDOW_MOVED.
 	void Deliver(StackedWindow* window, std::unique_ptr<BMessage> message);
 	void NeedsRedraw(StackedWindow* window);
+	/// The close button: B_QUIT_REQUESTED, or the modal window that blocks it comes to the front.
+	void RequestClose(StackedWindow* window);
 
 	/// \a under: the window under the pointer if the host knows it.
 	void PointerAt(BPoint screenWhere, uint32 buttons, std::optional<StackedWindow*> under);
@@ -86,7 +88,14 @@ public:
 	void Key(const KeyInput& key, bool down);
 	void InjectKey(const InjectedKey& key, bool down);
 	void SetModifiers(uint32 modifiers);
-	void Drop(std::unique_ptr<BMessage> message, BPoint screenWhere);
+	/// Drops what another program gave, B_SIMPLE_DATA or a message of its own; ends its visit.
+	void Drop(std::unique_ptr<BMessage> message, BPoint screenWhere,
+		std::optional<StackedWindow*> under = std::nullopt);
+	/// Another program drags over \a window. \a message: what it drags; null: the same as before.
+	/// False when a drop would be refused.
+	bool VisitorAt(StackedWindow* window, std::unique_ptr<BMessage> message, BPoint screenWhere);
+	/// What another program drags has left, or is dragged no more.
+	void VisitorLeft();
 
 	void GetPointer(BPoint* screenWhere, uint32* buttons) const;
 	void GetKeys(key_info* info) const;
@@ -94,8 +103,12 @@ public:
 
 	void BeginTracking(BRect rect, uint32 style);
 	void EndTracking();
-	void BeginDrag(
-		const BMessage& message, BRect rect, std::shared_ptr<const Picture> image, BPoint offset);
+	/// \a shownByHost: the overlay leaves it out.
+	void BeginDrag(const BMessage& message, BRect rect, std::shared_ptr<const Picture> image,
+		BPoint offset, bool shownByHost = false);
+	bool IsDragging() const;
+	/// Nothing is dropped.
+	void CancelDrag();
 	InputOverlay Overlay() const;
 
 private:
@@ -104,6 +117,7 @@ private:
 		std::shared_ptr<const Picture> image;
 		BRect rect;
 		BPoint offset;
+		bool shownByHost;
 	};
 
 	struct TrackingState {
@@ -118,6 +132,8 @@ private:
 	void Pressed(StackedWindow* under, bool isFirst);
 	void Released(StackedWindow* under);
 	void FinishDrag(StackedWindow* under);
+	void CancelDragLocked();
+	void AddDragged(BMessage* message) const;
 	void LeaveWindow(StackedWindow* next);
 	void ActivateLocked(StackedWindow* window);
 	void SetActiveLocked(StackedWindow* window);
@@ -150,6 +166,8 @@ private:
 	int32 fClicks;
 
 	std::unique_ptr<DragState> fDrag;
+	/// What another program drags over the windows.
+	std::unique_ptr<BMessage> fVisitor;
 	std::optional<TrackingState> fTracking;
 };
 

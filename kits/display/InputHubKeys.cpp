@@ -64,6 +64,10 @@ InputHub::KeyLocked(const KeyInput& key, bool down)
 		state = down ? state | mask : state & ~mask;
 	}
 	SetModifiersLocked(key.modifiers);
+	if (fDrag != nullptr && down && key.rawChar == B_ESCAPE) {
+		CancelDragLocked();
+		return;
+	}
 
 	StackedWindow* target = KeyTarget();
 	if (target == nullptr)

@@ -14,6 +14,8 @@ int
 Layer(const StackedWindow* window)
 {
 	if (window->style.isMenu)
+		return 3;
+	if (window->IsModal())
 		return 2;
 	return window->IsFloating() ? 1 : 0;
 }
@@ -95,11 +97,34 @@ WindowStack::SendBehind(StackedWindow* window, const StackedWindow* other)
 }
 
 
+// Each window keeps its place unless one that it has to stay above is still to come: then it follows that.
 void
 WindowStack::Reorder()
 {
-	std::stable_sort(fWindows.begin(), fWindows.end(),
-		[](const StackedWindow* a, const StackedWindow* b) { return Layer(a) < Layer(b); });
+	std::vector<StackedWindow*> left;
+	left.swap(fWindows);
+	while (!left.empty()) {
+		auto isFree = [&](const StackedWindow* window) {
+			return std::none_of(left.begin(), left.end(),
+				[&](const StackedWindow* other) { return StaysAbove(window, other); });
+		};
+		// The lowest kind that is left is always free.
+		auto next = std::find_if(left.begin(), left.end(), isFree);
+		fWindows.push_back(*next);
+		left.erase(next);
+	}
+}
+
+
+bool
+WindowStack::StaysAbove(const StackedWindow* upper, const StackedWindow* lower)
+{
+	if (Layer(upper) <= Layer(lower))
+		return false;
+	bool hasSubset = !upper->style.isMenu
+		&& (upper->style.feel == B_MODAL_SUBSET_WINDOW_FEEL
+			|| upper->style.feel == B_FLOATING_SUBSET_WINDOW_FEEL);
+	return !hasSubset || HasInSubset(upper, lower);
 }
 
 
@@ -136,7 +161,8 @@ WindowStack::IsFront(const StackedWindow* window) const
 	if (!window->IsShown())
 		return false;
 	for (auto other = fWindows.rbegin(); other != fWindows.rend() && *other != window; ++other) {
-		if ((*other)->IsShown() && Layer(*other) == Layer(window))
+		bool isBeside = (*other)->style.isMenu || ((*other)->IsFloating() && !window->IsFloating());
+		if ((*other)->IsShown() && !isBeside)
 			return false;
 	}
 	return true;

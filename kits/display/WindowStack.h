@@ -28,8 +28,8 @@ struct StackedWindow {
 };
 
 
-/// The order of windows: menus above floating windows above the others, each kind by who came last.
-/// Not locked.
+/// The order of windows: by who came last, but modal windows stay above what they block, floating ones
+/// above what they float over and below modal ones, and menus above all. Not locked.
 class WindowStack {
 public:
 	void Add(StackedWindow* window);
@@ -40,19 +40,21 @@ public:
 	void Raise(StackedWindow* window);
 	/// Below \a other; null: below all of its kind.
 	void SendBehind(StackedWindow* window, const StackedWindow* other);
-	/// After a window's style has changed.
+	/// After a window's style or subset has changed.
 	void Reorder();
 
 	/// The topmost shown window that contains the point, null if none does.
 	StackedWindow* WindowAt(BPoint screenWhere) const;
 	/// The topmost shown window that takes focus and is not blocked.
 	StackedWindow* TopFocus() const;
-	/// No shown window of its kind is above it.
+	/// No shown window is above it but menus and, unless it floats itself, floating ones.
 	bool IsFront(const StackedWindow* window) const;
 	/// The modal window that keeps \a window from input, null if none does.
 	StackedWindow* BlockerOf(const StackedWindow* window) const;
 
 private:
+	static bool StaysAbove(const StackedWindow* upper, const StackedWindow* lower);
+
 	std::vector<StackedWindow*> fWindows;
 };
 

@@ -7,6 +7,7 @@
 
 #include "app/LooperPrivate.h"
 #include "app/MessagePrivate.h"
+#include "display/DragFields.h"
 #include "interface/WindowPrivate.h"
 
 namespace BPrivate {

@@ -17,6 +17,7 @@
 
 #include "app/LooperPrivate.h"
 #include "display/Display.h"
+#include "display/DragFields.h"
 #include "display/HostWindow.h"
 #include "display/PixelBuffer.h"
 #include "interface/DrawableBitmap.h"

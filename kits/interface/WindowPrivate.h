@@ -30,9 +30,6 @@ enum {
 /// Marks what the host reports: "be:host" (bool).
 inline const char* const kFromHost = "be:host";
 
-/// The messenger that gets the answer to a dragged message, while it is dragged.
-inline const char* const kDragReplyTo = "be:drag_reply_to";
-
 /// A call against the rules: says so on standard error, and ends the program where checks are on.
 void ReportMisuse(const char* what, const char* name);
 

@@ -273,6 +273,78 @@ TEST_F(InputHubTest, FloatingWindowsStayAboveAndMenusAboveThem)
 }
 
 
+TEST_F(InputHubTest, AModalWindowStaysAboveWhatItBlocks)
+{
+	TestWindow modal(fHub, BRect(0, 0, 99, 99), B_MODAL_APP_WINDOW_FEEL);
+	TestWindow normal(fHub, BRect(0, 0, 99, 99));
+	TestWindow floating(fHub, BRect(0, 0, 99, 99), B_FLOATING_APP_WINDOW_FEEL);
+	fHub.Raise(&normal.stacked);
+	Forget({&modal, &normal, &floating});
+	Pointer(50, 50);
+	EXPECT_EQ(modal.client.Codes(), "move");
+	EXPECT_TRUE(fHub.IsFront(&modal.stacked));
+	EXPECT_FALSE(fHub.IsFront(&normal.stacked));
+	fHub.SetVisible(&modal.stacked, false);
+	Pointer(51, 50);
+	EXPECT_EQ(floating.client.Codes(), "move");
+	EXPECT_TRUE(fHub.IsFront(&normal.stacked));
+}
+
+
+TEST_F(InputHubTest, SubsetWindowsStayAboveTheirSubsetOnly)
+{
+	for (uint32 feel : {B_FLOATING_SUBSET_WINDOW_FEEL, B_MODAL_SUBSET_WINDOW_FEEL}) {
+		TestWindow upper(fHub, BRect(0, 0, 99, 99), feel);
+		TestWindow member(fHub, BRect(0, 0, 99, 99));
+		TestWindow other(fHub, BRect(0, 0, 99, 99));
+		fHub.AddToSubset(&upper.stacked, &member.stacked);
+		fHub.Raise(&other.stacked);
+		Forget({&upper, &member, &other});
+		Pointer(50, 50);
+		EXPECT_EQ(other.client.Codes(), "move") << feel;
+		fHub.SetVisible(&other.stacked, false);
+		fHub.Raise(&member.stacked);
+		Forget({&upper, &member});
+		Pointer(51, 50);
+		EXPECT_EQ(upper.client.Codes(), "move") << feel;
+
+		fHub.RemoveFromSubset(&upper.stacked, &member.stacked);
+		fHub.Raise(&member.stacked);
+		Forget({&upper, &member});
+		Pointer(52, 50);
+		EXPECT_EQ(member.client.Codes(), "move") << feel;
+		Pointer(300, 300);
+	}
+}
+
+
+TEST_F(InputHubTest, TheCloseButtonOfABlockedWindowBringsTheModalOne)
+{
+	TestWindow window(fHub, BRect(0, 0, 99, 99));
+	fHub.RequestClose(&window.stacked);
+	EXPECT_EQ(window.client.Last().what, B_QUIT_REQUESTED);
+	TestWindow modal(fHub, BRect(100, 0, 199, 99), B_MODAL_APP_WINDOW_FEEL);
+	const StackedWindow* raised = nullptr;
+	fHub.SetRaiseListener([&](StackedWindow* one) { raised = one; });
+	window.client.Codes();
+	fHub.RequestClose(&window.stacked);
+	EXPECT_EQ(window.client.Codes(), "");
+	EXPECT_EQ(raised, &modal.stacked);
+	fHub.RequestClose(&modal.stacked);
+	EXPECT_EQ(modal.client.Last().what, B_QUIT_REQUESTED);
+}
+
+
+TEST_F(InputHubTest, AnActivatedWindowThatAvoidsTheFrontStaysWhereItIs)
+{
+	TestWindow lower(fHub, BRect(0, 0, 99, 99), B_NORMAL_WINDOW_FEEL, B_AVOID_FRONT);
+	TestWindow upper(fHub, BRect(0, 0, 99, 99));
+	fHub.Activate(&lower.stacked);
+	EXPECT_TRUE(fHub.IsFront(&upper.stacked));
+	EXPECT_EQ(lower.client.Codes(), "active inactive active");
+}
+
+
 TEST_F(InputHubTest, AMenuNeverBecomesActive)
 {
 	TestWindow normal(fHub, BRect(0, 0, 99, 99));
@@ -338,6 +410,90 @@ TEST_F(InputHubTest, ADropOutsideOfAllWindowsIsSilent)
 	fHub.BeginDrag(BMessage('drag'), BRect(40, 45, 60, 55), nullptr, BPoint(10, 5));
 	Pointer(500, 500, 0);
 	EXPECT_TRUE(source.client.Drops().empty());
+}
+
+
+TEST_F(InputHubTest, EscapeEndsADragWithoutADrop)
+{
+	TestWindow source(fHub, BRect(0, 0, 99, 99));
+	TestWindow target(fHub, BRect(100, 0, 199, 99));
+	Pointer(50, 50, 1);
+	fHub.BeginDrag(BMessage('drag'), BRect(40, 45, 60, 55), nullptr, BPoint(10, 5));
+	Pointer(150, 60, 1);
+	Forget({&source, &target});
+	BPrivate::InjectedKey escape{BPrivate::KeyForName("escape"), "\x1b", 0};
+	fHub.InjectKey(escape, true);
+	EXPECT_FALSE(fHub.IsDragging());
+	EXPECT_FALSE(fHub.Overlay().dragged.IsValid());
+	// The one that it was over hears that it left, the one of the press that it is over; nobody of the key.
+	EXPECT_EQ(target.client.Codes(), "leave");
+	EXPECT_EQ(source.client.Codes(), "move");
+	EXPECT_FALSE(source.client.Last().HasMessage("be:drag_message"));
+
+	Pointer(150, 60, 0);
+	EXPECT_TRUE(target.client.Drops().empty());
+	EXPECT_TRUE(source.client.Drops().empty());
+}
+
+
+TEST_F(InputHubTest, ADragOntoABlockedWindowIsSilent)
+{
+	TestWindow blocked(fHub, BRect(0, 0, 99, 99));
+	TestWindow modal(fHub, BRect(100, 0, 199, 99), B_MODAL_APP_WINDOW_FEEL);
+	Pointer(150, 50, 1);
+	fHub.BeginDrag(BMessage('drag'), BRect(140, 45, 160, 55), nullptr, BPoint(10, 5));
+	Forget({&blocked, &modal});
+	Pointer(50, 50, 1);
+	Pointer(50, 50, 0);
+	EXPECT_EQ(blocked.client.Codes(), "");
+	EXPECT_TRUE(blocked.client.Drops().empty());
+}
+
+
+TEST_F(InputHubTest, WhatAnotherProgramDragsIsInTheMovesAndThenDropped)
+{
+	TestWindow window(fHub, BRect(0, 0, 99, 99));
+	TestWindow other(fHub, BRect(100, 0, 199, 99));
+	Forget({&window, &other});
+	auto visitor = [] {
+		auto message = std::make_unique<BMessage>(B_SIMPLE_DATA);
+		message->AddString("text", "foreign");
+		return message;
+	};
+	EXPECT_TRUE(fHub.VisitorAt(&window.stacked, visitor(), BPoint(10, 20)));
+	BMessage dragged;
+	ASSERT_EQ(window.client.Last().FindMessage("be:drag_message", &dragged), B_OK);
+	EXPECT_STREQ(dragged.GetString("text", ""), "foreign");
+	EXPECT_TRUE(fHub.VisitorAt(&other.stacked, nullptr, BPoint(110, 20)));
+	EXPECT_EQ(window.client.Codes(), "move leave");
+	EXPECT_TRUE(other.client.Last().HasMessage("be:drag_message"));
+	fHub.VisitorLeft();
+	EXPECT_EQ(other.client.Codes(), "move leave");
+
+	EXPECT_TRUE(fHub.VisitorAt(&window.stacked, visitor(), BPoint(10, 20)));
+	auto dropped = visitor();
+	dropped->AddPoint("be:drag_offset", BPoint(3, 4));
+	fHub.Drop(std::move(dropped), BPoint(11, 21), &window.stacked);
+	ASSERT_EQ(window.client.Drops().size(), 1u);
+	BMessage drop = window.client.Drops()[0];
+	EXPECT_EQ(drop.GetPoint("test:where", BPoint()), BPoint(11, 21));
+	EXPECT_EQ(drop.GetPoint("test:offset", BPoint()), BPoint(3, 4));
+	EXPECT_FALSE(drop.HasPoint("be:drag_offset"));
+	Pointer(12, 21);
+	EXPECT_FALSE(window.client.Last().HasMessage("be:drag_message"));
+}
+
+
+TEST_F(InputHubTest, ABlockedWindowRefusesWhatAnotherProgramDrags)
+{
+	TestWindow blocked(fHub, BRect(0, 0, 99, 99));
+	TestWindow modal(fHub, BRect(100, 0, 199, 99), B_MODAL_APP_WINDOW_FEEL);
+	Forget({&blocked, &modal});
+	auto message = std::make_unique<BMessage>(B_SIMPLE_DATA);
+	EXPECT_FALSE(fHub.VisitorAt(&blocked.stacked, std::move(message), BPoint(10, 20)));
+	fHub.Drop(std::make_unique<BMessage>(B_SIMPLE_DATA), BPoint(10, 20), &blocked.stacked);
+	EXPECT_EQ(blocked.client.Codes(), "");
+	EXPECT_TRUE(blocked.client.Drops().empty());
 }
 
 
