@@ -10,6 +10,7 @@
 #include <string>
 #include <vector>
 
+#include <Application.h>
 #include <Locker.h>
 #include <Message.h>
 
@@ -71,12 +72,26 @@ Exchange()
 }
 
 
-/// Fetches what another program has put on the system clipboard, if it has.
-bool
+/// A program may use the clipboard before it shows anything.
+void
+EnsureExchange()
+{
+	{
+		std::lock_guard<std::mutex> lock(Exchange().mutex);
+		if (Exchange().exchange != nullptr)
+			return;
+	}
+	if (be_app != nullptr)
+		ConnectClipboardExchange();
+}
+
+
+/// Fetches what another program has put on the system clipboard; see ClipboardExchange::Get().
+status_t
 GetFromHost(BMessage* data)
 {
 	std::lock_guard<std::mutex> lock(Exchange().mutex);
-	return Exchange().exchange != nullptr && Exchange().exchange->Get(data) == B_OK;
+	return Exchange().exchange != nullptr ? Exchange().exchange->Get(data) : B_ENTRY_NOT_FOUND;
 }
 
 
@@ -293,12 +308,18 @@ BClipboard::Data() const
 }
 
 
-/// Makes the object's data the shared ones, after asking the host for newer ones.
+/// Makes the object's data the shared ones, after asking the host for newer ones. B_TIMED_OUT, and no data,
+/// when the program that has them does not answer.
 status_t
 BClipboard::Fetch()
 {
 	BMessage foreign;
-	bool isForeign = fState->name == BPrivate::kSystemName && BPrivate::GetFromHost(&foreign);
+	status_t status = B_ENTRY_NOT_FOUND;
+	if (fState->name == BPrivate::kSystemName) {
+		BPrivate::EnsureExchange();
+		status = BPrivate::GetFromHost(&foreign);
+	}
+	bool isForeign = status == B_OK || status == B_TIMED_OUT;
 
 	std::lock_guard<std::mutex> lock(fStore->mutex);
 	if (isForeign) {
@@ -311,5 +332,5 @@ BClipboard::Fetch()
 	}
 	fState->data = fStore->data;
 	fState->count = fStore->count;
-	return B_OK;
+	return status == B_TIMED_OUT ? status : B_OK;
 }

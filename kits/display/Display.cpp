@@ -114,6 +114,13 @@ Display::IsConnected()
 }
 
 
+void
+ConnectClipboardExchange()
+{
+	Display::Get();
+}
+
+
 int32
 Display::ScreenAt(BRect frame)
 {

@@ -235,7 +235,8 @@ DisplayThread::Stop(std::function<void()> ending)
 	bool isQueued = Post([this, ending = std::move(ending)] {
 		Refuse();
 		ending();
-		QCoreApplication::quit();
+		// quit() would have Qt close what windows it has of its own, those of a drag for one.
+		QCoreApplication::exit();
 	});
 	if (isQueued)
 		fThread.join();

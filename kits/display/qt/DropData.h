@@ -12,15 +12,18 @@ class QMimeData;
 
 namespace BPrivate {
 
-/// Whether there are files or text.
+/// Whether there is a message, files or text.
 bool IsUsableDrop(const QMimeData& data);
 
-/// B_SIMPLE_DATA with "refs" for local files that are there, and "text/plain" (B_MIME_TYPE).
+/// The whole message when another program of these kits drags; else B_SIMPLE_DATA with "refs" for local
+/// files and "text/plain" (B_MIME_TYPE).
 std::unique_ptr<BMessage> MakeDropMessage(const QMimeData& data);
 
-/// A field of type B_MIME_TYPE for each form, the type its name. B_ENTRY_NOT_FOUND without any.
+/// The whole message of another program of these kits, else a field of type B_MIME_TYPE for each form, the
+/// type its name. B_ENTRY_NOT_FOUND without any; B_TIMED_OUT when who has the data does not answer.
 status_t ReadMimeData(const QMimeData& data, BMessage* message);
-/// The caller owns the result.
+/// The message for programs of these kits; for others its fields of type B_MIME_TYPE, and "refs" as the
+/// files they name. The caller owns the result.
 QMimeData* MakeMimeData(const BMessage& message);
 
 } // namespace BPrivate

@@ -9,6 +9,7 @@
 
 #include <QBuffer>
 #include <QClipboard>
+#include <QDrag>
 #include <QGuiApplication>
 #include <QImage>
 #include <QImageReader>
@@ -61,7 +62,10 @@ QtDisplay::QtDisplay(bool managesFocus)
 	  fLastRepeatKey(0),
 	  fRepeats(0),
 	  fIsActive(true),
-	  fOverlayIsPending(false)
+	  fIsDraggingOut(false),
+	  fWindowUnderDrag(nullptr),
+	  fOverlayIsPending(false),
+	  fIsLost(false)
 {
 }
 
@@ -104,7 +108,15 @@ QtDisplay::Connect()
 void
 QtDisplay::Stop()
 {
+	// The program cannot say any more that it failed: its threads may be in the middle of anything.
+	if (fIsLost) {
+		fflush(nullptr);
+		_exit(1);
+	}
 	fThread.Stop([this] {
+		// A window must not go under its own drag.
+		if (fIsDraggingOut)
+			QDrag::cancel();
 		for (QtHostWindow* window : fWindows)
 			window->Detach();
 	});
@@ -114,6 +126,7 @@ QtDisplay::Stop()
 void
 QtDisplay::Lost()
 {
+	fIsLost = true;
 	fThread.Abandon([] {
 		fprintf(stderr, "libbe: the connection to the display is broken; the program quits\n");
 		if (be_app != nullptr)
@@ -181,6 +194,8 @@ void
 QtDisplay::Remove(QtHostWindow* window)
 {
 	std::erase(fWindows, window);
+	if (window->Window() != nullptr && window->Window()->Stacked() == fWindowUnderDrag)
+		fWindowUnderDrag = nullptr;
 }
 
 
@@ -360,20 +375,6 @@ QtDisplay::EndRectTracking()
 
 
 void
-QtDisplay::BeginDrag(const BMessage& message, BRect rect, const PixelBuffer* image, BPoint offset)
-{
-	std::shared_ptr<Picture> picture;
-	if (image != nullptr && image->bits != nullptr) {
-		QtCanvas canvas(fFonts, *image);
-		picture = std::make_shared<Picture>(canvas.ReadPicture());
-	}
-	if (picture != nullptr)
-		rect = BRect(0, 0, picture->width - 1, picture->height - 1);
-	fHub.BeginDrag(message, rect, std::move(picture), offset);
-}
-
-
-void
 QtDisplay::OverlayChanged()
 {
 	// Called with the hub locked, so the painting, which asks the hub, comes later.
@@ -522,6 +523,10 @@ QtDisplay::Get(BMessage* data)
 		if (content != nullptr && !clipboard->ownsClipboard())
 			status = ReadMimeData(*content, data);
 	});
+	if (status == B_TIMED_OUT) {
+		data->MakeEmpty();
+		fprintf(stderr, "libbe: the program that has the clipboard does not answer\n");
+	}
 	return status;
 }
 

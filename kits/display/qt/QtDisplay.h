@@ -33,6 +33,7 @@ public:
 
 	/// False when Qt cannot have any of \a platforms.
 	bool Start(const std::string& platforms);
+	/// At the program's end. When the connection was lost, that is with code 1 and at once.
 	void Stop();
 	/// Display thread: the connection to the host is broken. Asks the program to quit; does not return.
 	[[noreturn]] void Lost();
@@ -87,6 +88,11 @@ public:
 	QWindow* WindowForTransients(const QtWindow* window) const;
 	uint32 ModifiersNow(int qtModifiers);
 	void HandleKey(const QKeyEvent& event);
+	/// Whether the host shows what this program drags, and would give it to other programs.
+	bool IsDraggingOut() const { return fIsDraggingOut; }
+	/// The program's window that the host's drag is over.
+	StackedWindow* WindowUnderDrag() const { return fWindowUnderDrag; }
+	void SetWindowUnderDrag(StackedWindow* window) { fWindowUnderDrag = window; }
 	/// An obscured cursor shows again.
 	void PointerMoved();
 	void UpdateCursor(QtWindow& window);
@@ -101,6 +107,9 @@ private:
 	void HideFloatingWindows();
 	void OverlayChanged();
 	void RepaintOverlay();
+	bool CanDragOut() const;
+	void DragOut(
+		const BMessage& message, BRect rect, std::shared_ptr<const Picture> image, BPoint offset);
 	void UpdateCursors();
 
 	const bool fManagesFocus;
@@ -119,11 +128,14 @@ private:
 	int32 fLastRepeatKey;
 	int32 fRepeats;
 	bool fIsActive;
+	bool fIsDraggingOut;
+	StackedWindow* fWindowUnderDrag;
 
 	/// Where the last overlay was painted; screen coordinates.
 	BRect fOverlayArea;
 
 	std::atomic<bool> fOverlayIsPending;
+	std::atomic<bool> fIsLost;
 };
 
 } // namespace BPrivate

@@ -32,24 +32,6 @@ const int kWheelStep = 120;
 const int kLargestSize = 32767;
 
 
-uint32
-ButtonsOf(Qt::MouseButtons pressed)
-{
-	uint32 buttons = 0;
-	if ((pressed & Qt::LeftButton) != 0)
-		buttons |= B_PRIMARY_MOUSE_BUTTON;
-	if ((pressed & Qt::RightButton) != 0)
-		buttons |= B_SECONDARY_MOUSE_BUTTON;
-	if ((pressed & Qt::MiddleButton) != 0)
-		buttons |= B_TERTIARY_MOUSE_BUTTON;
-	if ((pressed & Qt::BackButton) != 0)
-		buttons |= B_MOUSE_BUTTON(4);
-	if ((pressed & Qt::ForwardButton) != 0)
-		buttons |= B_MOUSE_BUTTON(5);
-	return buttons;
-}
-
-
 BPoint
 PointOf(QPointF point)
 {
@@ -100,10 +82,6 @@ void
 PaintOverlay(QPainter& painter, const InputOverlay& overlay, BPoint leftTop)
 {
 	painter.translate(-leftTop.x, -leftTop.y);
-	// Black and white by turns, to be seen on everything.
-	QPen light(Qt::white, 1);
-	QPen dark(Qt::black, 1, Qt::CustomDashLine);
-	dark.setDashPattern({3, 3});
 	bool showsImage = overlay.image != nullptr;
 	if (showsImage) {
 		const Picture& picture = *overlay.image;
@@ -116,11 +94,8 @@ PaintOverlay(QPainter& painter, const InputOverlay& overlay, BPoint leftTop)
 	for (const BRect& rect : {overlay.tracking, showsImage ? BRect() : overlay.dragged}) {
 		if (!rect.IsValid())
 			continue;
-		QRectF outline(rect.left + 0.5, rect.top + 0.5, rect.Width(), rect.Height());
-		for (const QPen& pen : {light, dark}) {
-			painter.setPen(pen);
-			painter.drawRect(outline);
-		}
+		QtWindow::PaintOutline(
+			painter, QRectF(rect.left + 0.5, rect.top + 0.5, rect.Width(), rect.Height()));
 	}
 }
 
@@ -147,6 +122,38 @@ BRect
 QtWindow::RectOf(const QRect& geometry)
 {
 	return BRect(geometry.left(), geometry.top(), geometry.right(), geometry.bottom());
+}
+
+
+uint32
+QtWindow::ButtonsOf(Qt::MouseButtons pressed)
+{
+	uint32 buttons = 0;
+	if ((pressed & Qt::LeftButton) != 0)
+		buttons |= B_PRIMARY_MOUSE_BUTTON;
+	if ((pressed & Qt::RightButton) != 0)
+		buttons |= B_SECONDARY_MOUSE_BUTTON;
+	if ((pressed & Qt::MiddleButton) != 0)
+		buttons |= B_TERTIARY_MOUSE_BUTTON;
+	if ((pressed & Qt::BackButton) != 0)
+		buttons |= B_MOUSE_BUTTON(4);
+	if ((pressed & Qt::ForwardButton) != 0)
+		buttons |= B_MOUSE_BUTTON(5);
+	return buttons;
+}
+
+
+void
+QtWindow::PaintOutline(QPainter& painter, const QRectF& rect)
+{
+	// Black and white by turns.
+	QPen light(Qt::white, 1);
+	QPen dark(Qt::black, 1, Qt::CustomDashLine);
+	dark.setDashPattern({3, 3});
+	for (const QPen& pen : {light, dark}) {
+		painter.setPen(pen);
+		painter.drawRect(rect);
+	}
 }
 
 
@@ -394,7 +401,7 @@ QtWindow::event(QEvent* event)
 		case QEvent::Close:
 			// The program decides.
 			event->ignore();
-			hub.Deliver(fStacked, std::make_unique<BMessage>(B_QUIT_REQUESTED));
+			hub.RequestClose(fStacked);
 			return true;
 
 		case QEvent::MouseButtonPress:
@@ -419,20 +426,19 @@ QtWindow::event(QEvent* event)
 
 		case QEvent::DragEnter:
 		case QEvent::DragMove:
-		{
-			auto move = static_cast<QDragMoveEvent*>(event);
-			move->setAccepted(IsUsableDrop(*move->mimeData()));
+			HandleDragOver(static_cast<QDragMoveEvent*>(event));
 			return true;
-		}
+
+		case QEvent::DragLeave:
+			if (fDisplay.IsDraggingOut())
+				fDisplay.SetWindowUnderDrag(nullptr);
+			else
+				hub.VisitorLeft();
+			return true;
 
 		case QEvent::Drop:
-		{
-			auto drop = static_cast<QDropEvent*>(event);
-			BPoint where = PointOf(drop->position());
-			drop->acceptProposedAction();
-			hub.Drop(MakeDropMessage(*drop->mimeData()), hub.Frame(fStacked).LeftTop() + where);
+			HandleDrop(static_cast<QDropEvent*>(event));
 			return true;
-		}
 
 		case QEvent::WindowStateChange:
 			HandleState();
@@ -453,6 +459,9 @@ QtWindow::HandleMouse(QMouseEvent* event)
 	BPoint before;
 	uint32 held;
 	hub.GetPointer(&before, &held);
+	// Qt repeats the release of a drag, at a place of its own.
+	if (event->type() == QEvent::MouseButtonRelease && held == 0)
+		return;
 	fDisplay.PointerMoved();
 	hub.SetModifiers(fDisplay.ModifiersNow(event->modifiers()));
 	// Without a button it is surely over this window; with one, the host sends it here all the same.
@@ -460,6 +469,42 @@ QtWindow::HandleMouse(QMouseEvent* event)
 		hub.PointerAt(where, buttons, fStacked);
 	else
 		hub.PointerAt(where, buttons, fDisplay.WindowUnder(event->globalPosition().toPoint()));
+}
+
+
+// What this program drags itself the hub follows already. Of other programs nothing is moved away: a copy.
+void
+QtWindow::HandleDragOver(QDragMoveEvent* event)
+{
+	event->setDropAction(Qt::CopyAction);
+	if (fDisplay.IsDraggingOut()) {
+		fDisplay.SetWindowUnderDrag(fStacked);
+		event->accept();
+		return;
+	}
+	if (!IsUsableDrop(*event->mimeData())) {
+		event->ignore();
+		return;
+	}
+	InputHub& hub = fDisplay.Hub();
+	std::unique_ptr<BMessage> message;
+	if (event->type() == QEvent::DragEnter)
+		message = MakeDropMessage(*event->mimeData());
+	BPoint where = hub.Frame(fStacked).LeftTop() + PointOf(event->position());
+	event->setAccepted(hub.VisitorAt(fStacked, std::move(message), where));
+}
+
+
+void
+QtWindow::HandleDrop(QDropEvent* event)
+{
+	event->setDropAction(Qt::CopyAction);
+	event->accept();
+	if (fDisplay.IsDraggingOut())
+		return;
+	InputHub& hub = fDisplay.Hub();
+	BPoint where = hub.Frame(fStacked).LeftTop() + PointOf(event->position());
+	hub.Drop(MakeDropMessage(*event->mimeData()), where, fStacked);
 }
 
 

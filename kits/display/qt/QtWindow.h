@@ -12,7 +12,10 @@
 
 #include "display/HostWindow.h"
 
+class QDragMoveEvent;
+class QDropEvent;
 class QMouseEvent;
+class QPainter;
 class QWheelEvent;
 
 namespace BPrivate {
@@ -43,6 +46,10 @@ public:
 
 	BRect FrameWithBorder() const;
 	static BRect RectOf(const QRect& geometry);
+	/// B_PRIMARY_MOUSE_BUTTON, ...
+	static uint32 ButtonsOf(Qt::MouseButtons pressed);
+	/// To be seen on everything.
+	static void PaintOutline(QPainter& painter, const QRectF& rect);
 
 	/// The shape over this window, null: the application's.
 	std::shared_ptr<const CursorShape> cursorShape;
@@ -60,6 +67,8 @@ private:
 	void HandleMouse(QMouseEvent* event);
 	void HandleWheel(QWheelEvent* event);
 	void HandleState();
+	void HandleDragOver(QDragMoveEvent* event);
+	void HandleDrop(QDropEvent* event);
 
 	QtDisplay& fDisplay;
 	QBackingStore fBackingStore;

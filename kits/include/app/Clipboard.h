@@ -40,6 +40,8 @@ public:
 	status_t StartWatching(BMessenger target);
 	status_t StopWatching(BMessenger target);
 
+	/// Asks the program that has the system clipboard. When that does not answer the data are empty; it takes a few
+	/// seconds then.
 	bool Lock();
 	void Unlock();
 	/// Whether the calling thread holds the lock.
@@ -51,7 +53,7 @@ public:
 	/// Lock().
 	status_t Commit();
 	status_t Commit(bool failIfChanged);
-	/// Fetches the content again.
+	/// Fetches the content again. B_TIMED_OUT, and empty data, when the program that has it does not answer.
 	status_t Revert();
 
 	/// The application that committed last, invalid when another program did.

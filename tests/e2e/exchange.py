@@ -1,0 +1,103 @@
+# SPDX-License-Identifier: MIT
+"""What the tests of programs that exchange data share: the programs, and the run of a test."""
+
+import signal
+import subprocess
+import sys
+import tempfile
+import traceback
+from pathlib import Path
+
+from xdesktop import Desktop, Failure, missing_tools, wait_for
+
+SKIPPED = 77
+WHOLE_LIMIT = 220
+
+
+class Program:
+    """A running exchange_program, or any other that prints lines."""
+
+    def __init__(self, desktop, command, name):
+        self.name = name
+        self.seen = 0
+        self.output_file = desktop.output_of(name)
+        self.process = desktop.start(command, name, stdin=subprocess.PIPE)
+
+    def lines(self):
+        text = self.output_file.read_text(encoding="utf-8", errors="replace")
+        return text.splitlines()[:text.count("\n")]
+
+    def tell(self, command):
+        self.process.stdin.write((command + "\n").encode())
+        self.process.stdin.flush()
+
+    def expect(self, line):
+        """Waits for a line that begins so, after those that were waited for before; returns it."""
+        def found():
+            lines = self.lines()
+            for number in range(self.seen, len(lines)):
+                if lines[number].startswith(line):
+                    self.seen = number + 1
+                    return lines[number]
+            check(self.process.poll() is None, f"{self.name} ended with {self.process.poll()}: {lines}")
+            return None
+        return wait_for(f"{self.name} prints \"{line}\" after {self.lines()[:self.seen][-3:]}", found)
+
+    def ask(self, command, answer):
+        self.tell(command)
+        return self.expect(answer)
+
+    def expect_exactly(self, line):
+        found = self.expect(line)
+        check(found == line, f"{self.name} prints \"{found}\", not \"{line}\"")
+
+    def forget(self):
+        self.seen = len(self.lines())
+
+    def check_silent_about(self, word):
+        new = self.lines()[self.seen:]
+        check(not any(word in line for line in new), f"{self.name} prints \"{word}\": {new}")
+
+    def quit(self):
+        self.tell("quit")
+        wait_for(f"{self.name} ends", lambda: self.process.poll() is not None)
+        check(self.process.returncode == 0, f"{self.name} ended with {self.process.returncode}: {self.lines()}")
+
+
+def check(condition, message):
+    if not condition:
+        raise Failure(message)
+
+
+def interrupted(number, _):
+    signal.signal(number, signal.SIG_IGN)
+    raise Failure("the whole took too long" if number == signal.SIGALRM else f"signal {number} came")
+
+
+def main(use):
+    """Calls \\a use with a desktop, the two programs and a folder; the exit code."""
+    if len(sys.argv) != 4:
+        print(f"usage: {sys.argv[0]} EXCHANGE_PROGRAM XDND_CLIENT FOLDER", file=sys.stderr)
+        return 2
+    missing = missing_tools()
+    if missing:
+        print(f"skipped: not installed here: {', '.join(missing)} (scripts/setup test installs it)")
+        return SKIPPED
+
+    for number in (signal.SIGALRM, signal.SIGTERM, signal.SIGINT, signal.SIGHUP):
+        signal.signal(number, interrupted)
+    signal.alarm(WHOLE_LIMIT)
+    program, client, pictures = (Path(word).resolve() for word in sys.argv[1:])
+    with tempfile.TemporaryDirectory(prefix="exchange.") as folder, Desktop(folder) as desktop:
+        try:
+            use(desktop, program, client)
+        except Exception:
+            traceback.print_exc()
+            picture = pictures / (Path(sys.argv[0]).stem + ".png")
+            desktop.picture().save(picture)
+            print(f"the screen then: {picture}", file=sys.stderr)
+            for file in sorted(Path(folder).glob("*.output")):
+                text = file.read_text(encoding="utf-8", errors="replace")
+                print(f"{file.name}: {text[-3000:]}", file=sys.stderr)
+            return 1
+    return 0
