@@ -13,7 +13,7 @@ from pathlib import Path
 from exchange import Program, check, main
 from xdesktop import wait_for
 
-MEASURED = 3  # seconds
+MEASURED = 2  # seconds
 LOST = "libbe: the connection to the display is broken; the program quits"
 
 
