@@ -5,8 +5,10 @@
 
 #include <stdio.h>
 
+#include "app/WindowGuard.h"
 #include "codegen/FormParts.h"
 #include "codegen/HandlerNames.h"
+#include "designer/DesignForm.h"
 #include "model/AppComponent.h"
 #include "model/Event.h"
 
@@ -28,6 +30,9 @@ TAppHeaderEmitter::EmitHeaderIncludes(BString& text)
 		if (form == nullptr)
 			continue;
 
+		WindowGuard guard(form);
+		if (!guard.IsLocked())
+			continue;
 		char buffer[kGeneratedNameSize];
 		content << "#include \"" << BaseFormFilename(form, buffer) << ".h\"\n";
 	}

@@ -3,6 +3,7 @@
 
 #include "codegen/AppSourceEmitter.h"
 
+#include "app/WindowGuard.h"
 #include "codegen/FormParts.h"
 #include "codegen/HandlerIndex.h"
 #include "codegen/HandlerNames.h"
@@ -59,7 +60,8 @@ TAppSourceEmitter::EmitAppConstructor(BString& text)
 			<< ": BApplication(APP_SIG)\n"
 			<< "{\n";
 	TDesignForm* mainForm = FindMainForm(App());
-	if (mainForm != nullptr) {
+	WindowGuard guard(mainForm);
+	if (guard.IsLocked()) {
 		content << "$TABm_MainForm = new T" << mainForm->ComponentName() << "();\n"
 				<< "$TABm_MainForm->MakeMainForm(true);\n"
 				<< "$TABm_MainForm->Show();\n";

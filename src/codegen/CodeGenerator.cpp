@@ -8,8 +8,10 @@
 #include <memory>
 
 #include "app/Dialogs.h"
+#include "app/WindowGuard.h"
 #include "codegen/AppHeaderEmitter.h"
 #include "codegen/AppSourceEmitter.h"
+#include "codegen/ConfirmGenerateWin.h"
 #include "codegen/FormHeaderEmitter.h"
 #include "codegen/FormParts.h"
 #include "codegen/FormSourceEmitter.h"
@@ -94,6 +96,13 @@ TCodeGenerator::ProjectEmitter(TAppComponent*)
 bool
 TCodeGenerator::ConfirmSettings()
 {
+	ConfirmGenerateWin* dialog = new ConfirmGenerateWin(this, fAppComponent);
+	if (!dialog->IsComplete()) {
+		dialog->Quit();
+		return true;
+	}
+	fDialog = BMessenger(dialog);
+	dialog->Show();
 	return true;
 }
 
@@ -115,7 +124,11 @@ TCodeGenerator::GenerateApp()
 	bool result = false;
 	for (int32 i = 0; i < fAppComponent->CountComponents(); i++) {
 		TDesignForm* form = FormAt(fAppComponent, i);
-		if (form != nullptr)
+		if (form == nullptr)
+			continue;
+		// The form's window lives on while its form is read.
+		WindowGuard guard(form);
+		if (guard.IsLocked())
 			result = GenerateForm(form) && result;
 	}
 	result = GenerateAppHeader() && result;
@@ -350,4 +363,12 @@ TCodeGenerator::RemarkSkippedSections(const BString& path, const BStringList& se
 			<< " was left as it is, for want of a marker; put both markers back to have it updated";
 		fWriter.AddRemark(path.String(), sentence);
 	}
+}
+
+
+TCodeGenerator*
+Generator()
+{
+	static TCodeGenerator sGenerator;
+	return &sGenerator;
 }

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include <Messenger.h>
+
 #include "codegen/SourceWriter.h"
 
 class BStringList;
@@ -20,7 +22,8 @@ class TProjectEmitter;
 ///
 /// Each file is read when it exists, edited by a new emitter, rid of its placeholders and written. A generator
 /// for another dialect of the runtime library overrides the operations that make the emitters. Use it from one
-/// thread; it reads the forms without locking them.
+/// thread at a time; it locks the forms one by one, so call it with no window locked but by a WindowGuard or from
+/// a window's own hooks.
 class TCodeGenerator {
 public:
 	TCodeGenerator();
@@ -36,7 +39,7 @@ public:
 	virtual TAppSourceEmitter* AppSourceEmitter(TAppComponent* app);
 	virtual TProjectEmitter* ProjectEmitter(TAppComponent* app);
 
-	/// Lets the user confirm the settings, and generates when he does; true at once.
+	/// Shows the dialog in which the user confirms the settings, and which then generates; true at once.
 	virtual bool ConfirmSettings();
 
 	/// Generates every form and the application, creating the folder when it is missing.
@@ -61,6 +64,9 @@ public:
 	const char* GenerationPath() const { return fGenerationPath; }
 	void SetGenerationPath(const char* path);
 
+	/// Whether the dialog is open. The application component must stay until it is closed.
+	bool IsConfirming() const { return fDialog.IsValid(); }
+
 	/// What writes the files, and knows what happened to them.
 	TSourceWriter& Writer() { return fWriter; }
 
@@ -76,4 +82,8 @@ private:
 	void* fReserved[5];
 	char fGenerationPath[256];
 	TSourceWriter fWriter;
+	BMessenger fDialog;
 };
+
+/// The generator of this program.
+TCodeGenerator* Generator();

@@ -3,6 +3,7 @@
 
 #include "codegen/FormParts.h"
 
+#include "app/WindowGuard.h"
 #include "designer/DesignForm.h"
 #include "designer/DesignFormView.h"
 #include "model/AppComponent.h"
@@ -56,7 +57,8 @@ FindMainForm(const TAppComponent* app)
 	const int32 count = app->CountComponents();
 	for (int32 i = 0; i < count; i++) {
 		TDesignForm* form = FormAt(app, i);
-		if (form != nullptr && form->IsMainForm())
+		WindowGuard guard(form);
+		if (guard.IsLocked() && form->IsMainForm())
 			return form;
 	}
 	if (count == 0)

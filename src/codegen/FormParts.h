@@ -26,5 +26,5 @@ BString PropertyText(const TComponent* component, const char* name);
 TDesignForm* FormAt(const TAppComponent* app, int32 index);
 
 /// The form that the generated program opens: the first that is marked as main form; with none marked
-/// the last item of the list, and when that is no form, the first. Null when there is none.
+/// the last item of the list, and when that is no form, the first. Null when there is none. Locks the forms one by one.
 TDesignForm* FindMainForm(const TAppComponent* app);
