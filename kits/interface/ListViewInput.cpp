@@ -96,7 +96,9 @@ BListView::MouseUp(BPoint where)
 {
 	const bool select = fPress.selectOnRelease;
 	const int32 index = fPress.index;
-	// The row stays: the next press may be the second of a double click.
+	// The row stays: the next press may be the second of a double click. Not after the pointer was moved.
+	if (!fPress.mayDrag)
+		fPress = Press();
 	fPress.selectOnRelease = false;
 	fPress.mayDrag = false;
 	BView::MouseUp(where);

@@ -49,6 +49,16 @@ SurfaceColor(bool pressed)
 	return tint_color(thumb, pressed ? B_DARKEN_1_TINT : 0.6f);
 }
 
+
+// A held thumb must not look like the track.
+rgb_color
+ThumbColor(bool pressed)
+{
+	const rgb_color surface = SurfaceColor(false);
+	return pressed ? BPrivate::BlendColors(surface, ui_color(B_CONTROL_HIGHLIGHT_COLOR), 0.4f)
+				   : surface;
+}
+
 } // namespace
 
 
@@ -126,7 +136,8 @@ BScrollBar::DrawThumb()
 		frame.InsetBy(-1, 0);
 	else
 		frame.InsetBy(0, -1);
-	SetHighColor(SurfaceColor(fPressed == kThumb));
+	const rgb_color surface = ThumbColor(fPressed == kThumb);
+	SetHighColor(surface);
 	FillRect(frame);
 	SetHighColor(tint_color(EdgeColor(true), B_DARKEN_1_TINT));
 	StrokeRect(frame);
@@ -137,7 +148,7 @@ BScrollBar::DrawThumb()
 		return;
 	const BPoint middle(
 		std::floor((frame.left + frame.right) / 2), std::floor((frame.top + frame.bottom) / 2));
-	SetHighColor(tint_color(SurfaceColor(fPressed == kThumb), B_DARKEN_2_TINT));
+	SetHighColor(tint_color(surface, B_DARKEN_2_TINT));
 	for (float offset = -3; offset <= 3; offset += 3) {
 		if (IsVertical()) {
 			StrokeLine(BPoint(frame.left + 4, middle.y + offset),

@@ -6,6 +6,7 @@
 #include <Window.h>
 
 #include "display/Display.h"
+#include "display/KeyMap.h"
 #include "display/Robot.h"
 
 rgb_color
@@ -134,6 +135,25 @@ void
 Robot::Drag(BPoint from, BPoint to, int32 steps)
 {
 	fRobot->Drag(OnScreen(from), OnScreen(to), steps);
+}
+
+
+void
+Robot::Hold(uint32 modifiers)
+{
+	const struct {
+		uint32 bits;
+		int32 rawKey;
+	} keys[] = {{B_SHIFT_KEY, BPrivate::kRawLeftShift}, {B_COMMAND_KEY, BPrivate::kRawLeftCommand},
+		{B_CONTROL_KEY, BPrivate::kRawLeftControl}, {B_OPTION_KEY, BPrivate::kRawLeftOption}};
+	for (const auto& key : keys) {
+		const bool down = (modifiers & key.bits) != 0;
+		if (down == ((fHeld & key.bits) != 0))
+			continue;
+		fHeld ^= key.bits;
+		BPrivate::Display::Get().InjectKey({key.rawKey, "", fHeld}, down);
+	}
+	Settle();
 }
 
 

@@ -59,6 +59,8 @@ public:
 	void Click(BPoint where, int32 count = 1, uint32 button = 1);
 	void Drag(BPoint from, BPoint to, int32 steps = 8);
 	void Wheel(float down, float right = 0);
+	/// B_SHIFT_KEY, B_COMMAND_KEY, ... are held during what follows, until Hold(0).
+	void Hold(uint32 modifiers);
 	/// A view's name, or the label of a control.
 	bool ClickView(const char* view, int32 count = 1);
 	/// The middle of the view's visible part; false when there is none.
@@ -82,6 +84,7 @@ private:
 
 	std::unique_ptr<BPrivate::Robot> fRobot;
 	BMessenger fWindow;
+	uint32 fHeld = 0;
 };
 
 #endif // TESTS_SUPPORT_ROBOT_H
