@@ -24,8 +24,7 @@ rgb_color TabColor(const BView* view, bool selected, bool enabled);
 /// The border of tabs and of the box they belong to.
 rgb_color TabBorderColor(const BView* view);
 /// A tab whose side away from the box has round corners. It is open to the box when it is selected.
-void DrawTabSurface(
-	BView* view, BRect frame, BTabView::tab_side side, bool selected, bool enabled);
+void DrawTabSurface(BView* view, BRect frame, BTabView::tab_side side, bool selected, bool enabled);
 
 /// A small arrow in the middle of \a frame; \a dx and \a dy, one of them 0, are where it points.
 void DrawArrow(BView* view, BRect frame, int32 dx, int32 dy, bool enabled);

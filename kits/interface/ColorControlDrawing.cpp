@@ -78,7 +78,10 @@ BColorControl::Draw(BRect)
 	if (focused) {
 		SetHighColor(ui_color(B_KEYBOARD_NAVIGATION_COLOR));
 		StrokeRect(bevel);
+		// White inside: one of the two lines is seen on any ramp.
 		StrokeRect(RampFrame(fCurrentRamp));
+		SetHighColor(make_color(255, 255, 255));
+		StrokeRect(RampFrame(fCurrentRamp).InsetByCopy(1, 1));
 	}
 
 	SetHighColor(BPrivate::StrengthOf(IsEnabled(), ValueAsColor(), ViewColor()));

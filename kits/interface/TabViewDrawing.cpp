@@ -223,7 +223,18 @@ BTabView::DrawBox(BRect selectedTabRect)
 void
 BTabView::LayOutContainer()
 {
-	const BRect inner = BoxFrame().InsetByCopy(BorderWidth(), BorderWidth());
+	BRect inner = BoxFrame().InsetByCopy(BorderWidth(), BorderWidth());
+	if (fBorder == B_NO_BORDER) {
+		// The line that the tabs stand on is left free.
+		if (fTabSide == kBottomSide)
+			inner.bottom--;
+		else if (fTabSide == kLeftSide)
+			inner.left++;
+		else if (fTabSide == kRightSide)
+			inner.right--;
+		else
+			inner.top++;
+	}
 	fContainer->MoveTo(inner.LeftTop());
 	fContainer->ResizeTo(inner.Width(), inner.Height());
 }

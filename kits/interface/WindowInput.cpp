@@ -370,7 +370,9 @@ WindowInput::HandleSpecialKey(BMessage* message)
 		fWindow->fData->OpenKeyMenuBar();
 		return true;
 	}
-	if (key == B_TAB && (modifiers & B_OPTION_KEY) != 0) {
+	// Where no view has the focus, none of them could navigate on a Tab.
+	const bool hasNoFocus = fWindow->CurrentFocus() == nullptr && !isCommand;
+	if (key == B_TAB && ((modifiers & B_OPTION_KEY) != 0 || hasNoFocus)) {
 		NavigateByKeyboard();
 		return true;
 	}
