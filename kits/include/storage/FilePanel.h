@@ -9,6 +9,7 @@
 #include <sys/stat.h>
 
 #include <Entry.h>
+#include <StorageDefs.h>
 
 class BDirectory;
 class BMessage;
