@@ -3,14 +3,15 @@
 #ifndef _BITMAP_STREAM_H
 #define _BITMAP_STREAM_H
 
+#include <memory>
 #include <vector>
 
 #include <DataIO.h>
 
 class BBitmap;
 
-/// The bitmap as the platform's translators pass it: a header of ten words (magic 'bits', bounds as
-/// four floats, bytes a row, colour space, bytes of pixels; high byte first), then the pixels.
+/// The bitmap as translators pass it on: a header of eight words, high byte first ('bits', the bounds
+/// as four floats, bytes a row, colour space, bytes of pixels), then the pixels.
 class BBitmapStream : public BPositionIO {
 public:
 	/// Takes over \a bitmap. Null: what is written becomes the bitmap.
@@ -26,10 +27,15 @@ public:
 	status_t SetSize(off_t size) override;
 
 	/// The bitmap becomes the caller's and the stream empty. Returns B_OK; B_BAD_VALUE for null;
-	/// B_BAD_DATA, with null in \a _bitmap, when the stream holds no whole bitmap; B_ERROR when it was detached before.
+	/// B_BAD_DATA when the stream holds no whole bitmap; B_ERROR when it was detached before.
 	status_t DetachBitmap(BBitmap** _bitmap);
 
 private:
+	bool IsWritten() const;
+	void BeginWriting();
+
+	std::unique_ptr<BBitmap> fBitmap;
+	std::vector<uint8> fHeader;
 	std::vector<uint8> fData;
 	off_t fPosition;
 	bool fDetached;

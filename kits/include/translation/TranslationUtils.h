@@ -13,8 +13,8 @@ struct entry_ref;
 
 /// Reads what the display's picture readers know: PNG, JPEG, BMP, GIF, PPM, XPM.
 ///
-/// A bitmap is new and the caller's (B_RGBA32); null when there is none or the display has no pixels. Needs an
-/// application object. The roster is not asked: null stands for the system's.
+/// A bitmap is new and the caller's, B_RGBA32; null when there is none, or on a display without pixels,
+/// which reads no pictures. The roster is not asked.
 class BTranslationUtils {
 public:
 	/// A file, else a resource 'bits' of this name in the program.
@@ -26,14 +26,16 @@ public:
 	/// From the stream's present position to its end.
 	static BBitmap* GetBitmap(BPositionIO* stream, BTranslatorRoster* roster = NULL);
 
-	/// Inserts a stream of the styled text format, or plain UTF-8 text, at the view's caret. The view's window must be locked.
-	/// Returns B_OK; B_BAD_VALUE for null; B_BAD_DATA or the stream's error, nothing inserted.
+	/// Inserts styled text ('STXT') or plain UTF-8 text at the view's caret, in the view's own font.
+	/// Lock the view's window. Returns B_OK; B_BAD_VALUE for null; B_BAD_DATA or the stream's error,
+	/// nothing inserted.
 	static status_t GetStyledText(
 		BPositionIO* fromStream, BTextView* intoView, BTranslatorRoster* roster = NULL);
 	/// \a encoding: null or "UTF-8"; B_BAD_VALUE for another.
 	static status_t GetStyledText(BPositionIO* fromStream, BTextView* intoView,
 		const char* encoding, BTranslatorRoster* roster = NULL);
-	/// Writes the view's text with its fonts and colours. Returns B_OK; B_BAD_VALUE for null; the stream's error.
+	/// Writes the view's text as styled text with its font and colour. Lock the view's window. Returns
+	/// B_OK; B_BAD_VALUE for null; the stream's error.
 	static status_t PutStyledText(
 		BTextView* fromView, BPositionIO* intoStream, BTranslatorRoster* roster = NULL);
 };
