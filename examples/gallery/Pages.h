@@ -14,6 +14,8 @@ BView* MakeSlidersPage(BRect frame);
 BView* MakeBarsPage(BRect frame);
 BView* MakeColorsPage(BRect frame);
 BView* MakeTabsPage(BRect frame);
+BView* MakeListsPage(BRect frame);
+BView* MakeDialogsPage(BRect frame);
 
 /// A view for a page, in the panel's colour.
 BView* MakePage(BRect frame, const char* name);
