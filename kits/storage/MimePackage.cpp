@@ -7,6 +7,7 @@
 #include "storage/MimePackage.h"
 
 #include <algorithm>
+#include <cctype>
 
 #include <fnmatch.h>
 #include <stdlib.h>
@@ -305,14 +306,23 @@ mime_magic::Holds(std::string_view content) const
 bool
 mime_glob::Holds(const std::string& name) const
 {
-	const std::string rest = pattern.substr(pattern[0] == '*' ? 1 : 0);
-	if (rest.find_first_of("*?[") != std::string::npos)
+	// Hundreds of patterns are asked about each name: most differ in the last letter already.
+	if (pattern.empty())
+		return name.empty();
+	const unsigned char last = pattern.back();
+	const bool isLetter = last < 0x80 && strchr("*?]", last) == nullptr;
+	if (isLetter
+		&& (name.empty() || tolower(last) != tolower(static_cast<unsigned char>(name.back()))))
+		return false;
+
+	const std::string_view rest = std::string_view(pattern).substr(pattern[0] == '*' ? 1 : 0);
+	if (rest.find_first_of("*?[") != std::string_view::npos)
 		return fnmatch(pattern.c_str(), name.c_str(), isCaseSensitive ? 0 : FNM_CASEFOLD) == 0;
 
 	if (name.size() < rest.size() || (pattern[0] != '*' && name.size() != rest.size()))
 		return false;
 	const char* end = name.c_str() + (name.size() - rest.size());
-	return (isCaseSensitive ? strcmp(end, rest.c_str()) : strcasecmp(end, rest.c_str())) == 0;
+	return (isCaseSensitive ? strcmp(end, rest.data()) : strcasecmp(end, rest.data())) == 0;
 }
 
 
