@@ -180,7 +180,7 @@ PanelList::Draw(BRect updateRect)
 		return;
 
 	const std::string text = fStatus == B_OK
-		? "There is nothing to choose in this folder."
+		? "There is nothing to show in this folder."
 		: "This folder cannot be read: " + StatusSentence(fStatus);
 	font_height height;
 	GetFontHeight(&height);

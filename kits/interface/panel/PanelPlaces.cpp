@@ -37,7 +37,7 @@ PanelPlaces::SetPlaces(const std::vector<std::string>& recent)
 	BPath desktop;
 	if (find_directory(B_DESKTOP_DIRECTORY, &desktop) == B_OK)
 		AddPlace("Desktop", desktop.Path(), PanelIcon::kDesktop);
-	AddPlace("Documents", xdg_user_directory("DOCUMENTS", "Documents"), PanelIcon::kFolder);
+	AddPlace("Documents", xdg_user_directory("DOCUMENTS", "/Documents"), PanelIcon::kFolder);
 	AddPlace("File system", "/", PanelIcon::kDisk);
 	for (const std::string& folder : recent)
 		AddPlace(DisplayName(LeafName(folder)), folder, PanelIcon::kFolder);
