@@ -33,6 +33,8 @@ constexpr bigtime_t kReadSlice = 10000;
 constexpr bigtime_t kFirstPublish = 300000;
 // Changes that follow each other closely cost one reading.
 constexpr bigtime_t kChangeDelay = 150000;
+// What takes no longer is read again whenever it may have changed.
+constexpr bigtime_t kShortReading = 100000;
 
 
 /// When the names in the folder changed last; 0 for one that is gone or another node.
@@ -64,7 +66,8 @@ PanelList::PanelList(BRect frame, list_view_type type, PanelLink* link, PanelLis
 	  fReadTime(0),
 	  fNextPublish(0),
 	  fPublishing(false),
-	  fWatching(false)
+	  fWatching(false),
+	  fResting(true)
 {
 	SetInvocationMessage(new BMessage(kMsgEntryInvoked));
 }
@@ -103,12 +106,21 @@ PanelList::Reread()
 void
 PanelList::CheckForChanges()
 {
-	if (fFolder.empty() || IsReading())
+	if (fResting || IsReading())
 		return;
+	// Sizes and times of files change without a sign, as does what follows a change within its second.
 	const time_t changed = ChangeTime(fFolder, fNode);
-	// Within the second of the last change there may be another one.
-	if (changed != fFolderChanged || changed + 1 >= time(nullptr))
+	if (fReadTime < kShortReading || changed != fFolderChanged || changed + 1 >= time(nullptr))
 		StartReading();
+}
+
+
+void
+PanelList::Rest()
+{
+	StopWatching();
+	fReader.Close();
+	fResting = true;
 }
 
 
@@ -239,6 +251,8 @@ PanelList::MessageReceived(BMessage* message)
 
 		case kMsgReread:
 			fRereadScheduled = false;
+			if (fResting)
+				break;
 			if (IsReading())
 				fChangedWhileReading = true;
 			else
@@ -246,7 +260,8 @@ PanelList::MessageReceived(BMessage* message)
 			break;
 
 		case B_NODE_MONITOR:
-			NodeChanged(*message);
+			if (!fResting)
+				NodeChanged(*message);
 			break;
 
 		case B_SELECT_ALL:
@@ -291,6 +306,7 @@ PanelList::SelectedNames() const
 void
 PanelList::StartReading()
 {
+	fResting = false;
 	fReadStart = system_time();
 	fNextPublish = fReadStart + kFirstPublish;
 	fStatus = fReader.Open(fFolder);

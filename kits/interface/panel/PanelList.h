@@ -52,8 +52,10 @@ public:
 	const node_ref& FolderNode() const { return fNode; }
 	/// Reads the folder again.
 	void Reread();
-	/// Reads it again if it is another than it was.
+	/// Reads it again unless that takes long and no names in it have changed.
 	void CheckForChanges();
+	/// Nobody looks: neither reads on nor follows changes until Reread() or SetFolder().
+	void Rest();
 	/// Selects the entry of this name as soon as it is there.
 	void SelectNamed(const std::string& name);
 
@@ -117,6 +119,7 @@ private:
 	std::string fWanted;
 	bool fPublishing;
 	bool fWatching;
+	bool fResting;
 };
 
 } // namespace BPrivate

@@ -183,7 +183,7 @@ PanelWindow::Show()
 	if (fList->Folder() != folder)
 		GoTo(NearestFolder(folder));
 	else
-		fList->CheckForChanges();
+		fList->Reread();
 	if (IsSaving())
 		fName->MakeFocus(true);
 	else
@@ -199,6 +199,7 @@ PanelWindow::Hide()
 		std::lock_guard<std::mutex> lock(fLink->lock);
 		fLink->isShowing = false;
 	}
+	fList->Rest();
 	BWindow::Hide();
 }
 
@@ -221,13 +222,16 @@ PanelWindow::HandlePanelMessage(BMessage* message)
 			Quit();
 			return true;
 
+		// A hidden panel reads its folder when it is shown.
 		case kMsgPanelRefresh:
-			fList->Reread();
+			if (!IsHidden())
+				fList->Reread();
 			return true;
 
 		case kMsgPanelRules:
 			SetRules();
-			fList->Reread();
+			if (!IsHidden())
+				fList->Reread();
 			return true;
 
 		case kMsgPanelFolder:
@@ -236,7 +240,7 @@ PanelWindow::HandlePanelMessage(BMessage* message)
 			if (message->FindString("error", &error) == B_OK) {
 				fNotice = error;
 				UpdateStatus();
-			} else if (!fList->Folder().empty())
+			} else if (!IsHidden())
 				GoTo(message->GetString("folder", "/"));
 			return true;
 		}
