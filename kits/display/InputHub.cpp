@@ -183,6 +183,20 @@ InputHub::IsFront(const StackedWindow* window) const
 }
 
 
+std::vector<StackedWindow*>
+InputHub::WindowsBelow(const StackedWindow* window) const
+{
+	std::lock_guard<std::mutex> lock(fMutex);
+	std::vector<StackedWindow*> below;
+	for (StackedWindow* other : fStack.Windows()) {
+		if (other == window)
+			break;
+		below.insert(below.begin(), other);
+	}
+	return below;
+}
+
+
 void
 InputHub::SetActive(StackedWindow* window)
 {

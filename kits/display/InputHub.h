@@ -66,6 +66,8 @@ public:
 	void AddToSubset(StackedWindow* window, const StackedWindow* member);
 	void RemoveFromSubset(StackedWindow* window, const StackedWindow* member);
 	bool IsFront(const StackedWindow* window) const;
+	/// From the next lower one to the lowest.
+	std::vector<StackedWindow*> WindowsBelow(const StackedWindow* window) const;
 
 	/// The window with the keyboard, null: none. Tells the old one and the new one.
 	void SetActive(StackedWindow* window);

@@ -315,9 +315,14 @@ BWindow::Activate(bool active)
 {
 	if (IsHidden() || fData->host == nullptr)
 		return;
-	if (active)
+	if (active) {
+		// What is in front is to be seen.
+		if (fData->minimized) {
+			fData->minimized = false;
+			fData->host->SetMinimized(false);
+		}
 		fData->host->Activate();
-	else
+	} else
 		fData->host->Deactivate();
 }
 
@@ -458,7 +463,7 @@ BWindow::AddToSubset(BWindow* window)
 {
 	bool hasSubset =
 		fData->feel == B_MODAL_SUBSET_WINDOW_FEEL || fData->feel == B_FLOATING_SUBSET_WINDOW_FEEL;
-	if (window == nullptr || window == this || !hasSubset)
+	if (window == nullptr || window == this || !hasSubset || window->Feel() != B_NORMAL_WINDOW_FEEL)
 		return B_BAD_VALUE;
 	if (fData->host != nullptr && window->fData->host != nullptr)
 		fData->host->AddToSubset(window->fData->host.get());

@@ -229,6 +229,21 @@ WindowInput::KeyTarget(BMessage* message)
 		if (view != focus && (view->fEventMask & B_KEYBOARD_EVENTS) != 0)
 			fOthers.push_back({view, B_OUTSIDE_VIEW});
 	}
+	BView* suspender = nullptr;
+	for (BView* view : fMouseMaskViews) {
+		bool isNew = view != focus && (view->fEventMask & B_KEYBOARD_EVENTS) == 0;
+		if ((view->fMouseEventMask & B_KEYBOARD_EVENTS) == 0)
+			continue;
+		if ((view->fMouseEventOptions & B_SUSPEND_VIEW_FOCUS) != 0)
+			suspender = view;
+		else if (isNew)
+			fOthers.push_back({view, B_OUTSIDE_VIEW});
+	}
+	// Until the release the focus hears nothing.
+	if (suspender != nullptr) {
+		std::erase_if(fOthers, [&](const Recipient& other) { return other.view == suspender; });
+		return suspender;
+	}
 
 	const uint32 kHeldModifiers = B_SHIFT_KEY | B_COMMAND_KEY | B_CONTROL_KEY | B_OPTION_KEY;
 	if (message->what == B_KEY_DOWN && fWindow->DefaultButton() != nullptr

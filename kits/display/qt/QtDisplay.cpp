@@ -206,6 +206,17 @@ QtDisplay::Has(const QtHostWindow* window) const
 }
 
 
+QtWindow*
+QtDisplay::WindowOf(const StackedWindow* stacked) const
+{
+	for (QtHostWindow* window : fWindows) {
+		if (window->Window() != nullptr && window->Window()->Stacked() == stacked)
+			return window->Window();
+	}
+	return nullptr;
+}
+
+
 void
 QtDisplay::ReportFrame(StackedWindow* window, BRect frame)
 {

@@ -80,6 +80,8 @@ public:
 	void Add(QtHostWindow* window);
 	void Remove(QtHostWindow* window);
 	bool Has(const QtHostWindow* window) const;
+	/// Null when it has gone.
+	QtWindow* WindowOf(const StackedWindow* stacked) const;
 	/// Tells the hub and, by messages, the window where it is now.
 	void ReportFrame(StackedWindow* window, BRect frame);
 	/// The program's window at a place of the screen; not known where the host does not tell.

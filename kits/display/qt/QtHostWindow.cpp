@@ -5,6 +5,7 @@
 #include <QString>
 
 #include <Region.h>
+#include <Window.h>
 
 #include "display/qt/DisplayThread.h"
 #include "display/qt/QtCanvas.h"
@@ -132,11 +133,13 @@ QtHostWindow::Activate()
 	WithWindow([&](QtWindow& window) {
 		if (!window.isVisible())
 			return;
-		window.raise();
-		window.requestActivate();
+		if ((fStacked.style.flags & B_AVOID_FRONT) == 0)
+			window.raise();
+		if ((window.flags() & Qt::WindowDoesNotAcceptFocus) == 0)
+			window.requestActivate();
 		if (fDisplay.ManagesFocus())
 			fDisplay.Hub().Activate(&fStacked);
-		else
+		else if ((fStacked.style.flags & B_AVOID_FRONT) == 0)
 			fDisplay.Hub().Raise(&fStacked);
 	});
 }
@@ -156,6 +159,12 @@ QtHostWindow::SendBehind(HostWindow* other)
 	WithWindow([&](QtWindow& window) {
 		fDisplay.Hub().SendBehind(&fStacked, above != nullptr ? &above->fStacked : nullptr);
 		window.lower();
+		// A host has no "below that one": all that belong below follow.
+		for (StackedWindow* below : fDisplay.Hub().WindowsBelow(&fStacked)) {
+			QtWindow* lower = fDisplay.WindowOf(below);
+			if (lower != nullptr)
+				lower->lower();
+		}
 	});
 }
 
