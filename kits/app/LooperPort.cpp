@@ -18,9 +18,12 @@ namespace {
 
 constexpr thread_id kNobody = -1;
 
+// Locking asks for these all the time, and no program loads this library late.
+#define LOOPER_TLS thread_local __attribute__((tls_model("initial-exec")))
+
 // Plain data, so that they can be used from the destructors of static and thread objects.
-thread_local thread_id sCurrentThread = kNobody;
-thread_local LooperPort* sNewestHeld = nullptr;
+LOOPER_TLS thread_id sCurrentThread = kNobody;
+LOOPER_TLS LooperPort* sNewestHeld = nullptr;
 
 } // namespace
 

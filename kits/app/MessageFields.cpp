@@ -144,17 +144,22 @@ BMessage::IndexOf(const char* name) const
 	if (fBody == nullptr)
 		return -1;
 
-	const uint32 hash = Private::HashName(name);
-	const size_t nameLength = strlen(name) + 1;
+	// A loop over the fields asks for each by the very name that GetInfo() handed out.
+	const Field* fields = fBody->Fields();
+	const uint32 cursorField = uint32(fBody->NameCursor());
+	const bool isCursor =
+		cursorField < fBody->fieldCount && name == fBody->NameOf(fields[cursorField]);
+	const uint32 hash = isCursor ? fields[cursorField].hash : Private::HashName(name);
+	const size_t nameLength = isCursor ? fields[cursorField].nameLength : strlen(name) + 1;
 	if (fBody->names != nullptr)
 		return *fBody->NameSlot(name, uint32(nameLength), hash);
 
-	const Field* fields = fBody->Fields();
 	int32 index = fBody->buckets[hash % kBucketCount];
 	while (index >= 0) {
 		const Field& field = fields[index];
 		if (field.hash == hash && field.nameLength == nameLength
-			&& memcmp(fBody->NameOf(field), name, nameLength) == 0) {
+			&& (fBody->NameOf(field) == name
+				|| memcmp(fBody->NameOf(field), name, nameLength) == 0)) {
 			return index;
 		}
 		index = field.next;

@@ -281,6 +281,8 @@ TEST(MessageDamageTest, FieldOutsideEveryChainIsOnlyEnumerated)
 	EXPECT_EQ(message.GetInfo(B_ANY_TYPE, 0, &name, &type), B_OK);
 	EXPECT_STREQ(name, "Name");
 	EXPECT_FALSE(message.HasString("Name"));
+	EXPECT_EQ(message.GetInfo(type, 0, &name, &type), B_OK);
+	EXPECT_FALSE(message.HasString(name));
 	EXPECT_EQ(message.AddString("Name", "again"), B_OK);
 	EXPECT_STREQ(message.FindString("Name"), "again");
 }

@@ -393,6 +393,39 @@ TEST(MessageTest, GetInfoEnumeratesFieldsInTheirOrder)
 }
 
 
+TEST(MessageTest, TheNameThatGetInfoFoundIsAsGoodAsAnother)
+{
+	BMessage message;
+	for (int32 i = 0; i < 100; i++) {
+		const std::string name = "field" + std::to_string(i);
+		message.AddInt32(name.c_str(), i);
+		message.AddString(("s" + name).c_str(), name.c_str());
+
+		char* found;
+		type_code type;
+		ASSERT_EQ(message.GetInfo(B_INT32_TYPE, i, &found, &type), B_OK) << i;
+		EXPECT_EQ(message.FindInt32(found), i);
+		EXPECT_EQ(message.FindString(found), nullptr);
+		ASSERT_EQ(message.GetInfo(B_STRING_TYPE, i / 2, &found, &type), B_OK) << i;
+		EXPECT_EQ(message.FindString(found), "field" + std::to_string(i / 2));
+		EXPECT_STREQ(message.FindString(found + 1), nullptr);
+		EXPECT_EQ(message.FindInt32(found + 1), i / 2);
+	}
+
+	char* name;
+	type_code type;
+	ASSERT_EQ(message.GetInfo(B_STRING_TYPE, 7, &name, &type), B_OK);
+	EXPECT_EQ(message.Rename("sfield7", "another"), B_OK);
+	EXPECT_STREQ(message.FindString("another"), "field7");
+	EXPECT_EQ(message.FindString("sfield7"), nullptr);
+	ASSERT_EQ(message.GetInfo(B_STRING_TYPE, 7, &name, &type), B_OK);
+	EXPECT_STREQ(message.FindString(name), "field7");
+	EXPECT_EQ(message.RemoveName(name), B_OK);
+	ASSERT_EQ(message.GetInfo(B_STRING_TYPE, 7, &name, &type), B_OK);
+	EXPECT_STREQ(message.FindString(name), "field8");
+}
+
+
 TEST(MessageTest, GetInfoByNameTellsOfOneField)
 {
 	BMessage message;
