@@ -188,6 +188,10 @@ TProjectCheck::CheckForm(TDesignForm* form)
 
 	fMembers.clear();
 	fHandlers.clear();
+	// Most components have one handler.
+	const size_t count = static_cast<size_t>(FormComponents(form)->CountComponents());
+	fMembers.reserve(2 * count);
+	fHandlers.reserve(count);
 	for (const char* member : kFormMembers)
 		fMembers.emplace(member, "the generated class");
 	fMembers.emplace(std::string("T") + form->ComponentName(), "the form's class");
@@ -291,21 +295,21 @@ TProjectCheck::CheckHandler(
 	const TEvent& event, const std::string& name, const std::string& eventOwner)
 {
 	const std::string owner = "the event " + std::string(event.name) + " of " + eventOwner;
-	const std::string handler = "the handler " + Quoted(name) + " of " + owner;
+	const auto handler = [&] { return "the handler " + Quoted(name) + " of " + owner; };
 	if (!IsIdentifier(name))
-		Report(handler + " is no C++ identifier; rename the component or switch the event off");
+		Report(handler() + " is no C++ identifier; rename the component or switch the event off");
 
 	const char* parameters = event.parameters != nullptr ? event.parameters : "";
 	if (!IsAscii(parameters))
-		Report(handler
+		Report(handler()
 			+ " would not compile: its parameters hold characters that are no plain ASCII"
 			+ " (such as non-breaking spaces); switch the event off");
 	else if (!IsBalanced(parameters))
-		Report(handler + " would not compile: the brackets of its parameters do not match;"
+		Report(handler() + " would not compile: the brackets of its parameters do not match;"
 			+ " switch the event off");
 	if (event.returnType != nullptr
 		&& (!IsAscii(event.returnType) || !IsReturnable(event.returnType)))
-		Report(handler + " would not compile: it cannot return " + Quoted(event.returnType)
+		Report(handler() + " would not compile: it cannot return " + Quoted(event.returnType)
 			+ "; switch the event off");
 
 	const size_t before = fProblems.size();

@@ -4,9 +4,9 @@
 #include "codegen/SourceText.h"
 
 #include <string.h>
-#include <strings.h>
 
-#include <utility>
+#include <string>
+#include <string_view>
 
 namespace {
 
@@ -51,10 +51,6 @@ FindSection(const BString& text, const char* name, SectionRange* range)
 }
 
 
-/// No placeholder is longer, in bytes.
-constexpr int32 kLongestPlaceholder = 16;
-
-
 enum CommentState { kNoComment, kLineComment, kBlockComment };
 
 
@@ -76,15 +72,49 @@ NextCommentState(CommentState state, const char* at, const char* begin)
 }
 
 
+char
+LowerCase(char c)
+{
+	return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
+}
+
+
+/// Whether \a text, which ends with a zero byte, begins with \a prefix in any case of its letters.
+bool
+BeginsWith(const char* text, std::string_view prefix)
+{
+	for (size_t i = 0; i < prefix.length(); i++) {
+		if (text[i] != prefix[i] && LowerCase(text[i]) != LowerCase(prefix[i]))
+			return false;
+	}
+	return true;
+}
+
+
 /// The first of \a placeholders that stands at \a text, in any case of its letters; null when none does.
 const placeholder_value*
 FindPlaceholder(const char* text, std::initializer_list<placeholder_value> placeholders)
 {
 	for (const placeholder_value& each : placeholders) {
-		if (strncasecmp(text, each.placeholder, strlen(each.placeholder)) == 0)
+		// Placeholders rarely share the letter behind their "$".
+		if (LowerCase(text[1]) == LowerCase(each.placeholder[1])
+			&& BeginsWith(text, each.placeholder))
 			return &each;
 	}
 	return nullptr;
+}
+
+
+/// Whether one of \a placeholders would stand at \a start if the right text followed it.
+bool
+BeginsPlaceholder(std::string_view start, std::initializer_list<placeholder_value> placeholders)
+{
+	for (const placeholder_value& each : placeholders) {
+		if (start.length() < each.placeholder.length()
+			&& BeginsWith(each.placeholder.data(), start))
+			return true;
+	}
+	return false;
 }
 
 
@@ -105,7 +135,7 @@ ReplaceInOnePass(BString& text, std::initializer_list<placeholder_value> placeho
 
 	const char* copied = text.String();
 	const char* loneDollar = nullptr;
-	BString result;
+	std::string result;
 	for (; from != nullptr; from = strchr(from, '$')) {
 		const placeholder_value* found = FindPlaceholder(from, placeholders);
 		if (found == nullptr) {
@@ -113,17 +143,20 @@ ReplaceInOnePass(BString& text, std::initializer_list<placeholder_value> placeho
 			continue;
 		}
 		if (placeholders.size() > 1 && loneDollar != nullptr
-			&& from - loneDollar < kLongestPlaceholder)
+			&& BeginsPlaceholder(std::string_view(loneDollar, from - loneDollar), placeholders))
 			return false;
 
-		result.Append(copied, static_cast<int32>(from - copied));
-		result.Append(found->value);
-		copied = from + strlen(found->placeholder);
+		if (copied == text.String())
+			result.reserve(text.Length() + text.Length() / 8 + 64);
+		loneDollar = nullptr;
+		result.append(copied, from);
+		result.append(found->value);
+		copied = from + found->placeholder.length();
 		from = copied;
 	}
 	if (copied != text.String()) {
-		result.Append(copied);
-		text = std::move(result);
+		result.append(copied);
+		text.SetTo(result.data(), static_cast<int32>(result.length()));
 	}
 	return true;
 }
@@ -198,8 +231,19 @@ ReplacePlaceholders(BString& text, std::initializer_list<placeholder_value> plac
 void
 IndentContinuationLines(BString& statement)
 {
-	if (strchr(statement.String(), '\n') != nullptr)
-		statement.ReplaceAll("\n", "\n  ");
+	const char* rest = statement.String();
+	const char* lineBreak = strchr(rest, '\n');
+	if (lineBreak == nullptr)
+		return;
+
+	std::string result;
+	result.reserve(statement.Length() + 16);
+	for (; lineBreak != nullptr; lineBreak = strchr(rest, '\n')) {
+		result.append(rest, lineBreak + 1).append("  ");
+		rest = lineBreak + 1;
+	}
+	result.append(rest);
+	statement.SetTo(result.data(), static_cast<int32>(result.length()));
 }
 
 

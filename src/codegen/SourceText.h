@@ -6,6 +6,7 @@
 #include <stddef.h>
 
 #include <initializer_list>
+#include <string_view>
 
 #include <String.h>
 
@@ -30,9 +31,9 @@ void WriteUserSection(const char* name, bool fileExists, const BString& fileText
 /// what was put in is not searched again.
 void ReplacePlaceholder(BString& text, const char* placeholder, const char* value);
 
-/// A word that begins with "$" and what it becomes.
+/// A word that begins with its only "$", as a text with its zero byte, and what it becomes.
 struct placeholder_value {
-	const char* placeholder;
+	std::string_view placeholder;
 	const char* value;
 };
 

@@ -209,6 +209,38 @@ TEST(ReplacePlaceholderTest, DoesNotJoinAPlaceholderFromWhatItPutInAndWhatFollow
 }
 
 
+TEST(ReplacePlaceholderTest, SeveralAtOnceComeToWhatTheyDoOneByOne)
+{
+	// Every text of three of these pieces, which can join into placeholders in many ways.
+	const char* const pieces[] = {"$ONE", "$on", "E", "$TAB", "$ta", "b", "$", "$Other", ""};
+	const placeholder_value one = {"$ONE", "b"};
+	const placeholder_value tab = {"$TAB", "E"};
+	const placeholder_value other = {"$OTHER", "A$ONE"};
+	for (const char* first : pieces) {
+		for (const char* second : pieces) {
+			for (const char* third : pieces) {
+				BString text(first);
+				text << second << third;
+				BString atOnce(text);
+				ReplacePlaceholders(atOnce, {one, tab});
+				BString oneByOne(text);
+				ReplacePlaceholders(oneByOne, {one});
+				ReplacePlaceholders(oneByOne, {tab});
+				EXPECT_STREQ(atOnce.String(), oneByOne.String()) << text.String();
+
+				atOnce = text;
+				ReplacePlaceholders(atOnce, {other, one, tab});
+				oneByOne = text;
+				ReplacePlaceholders(oneByOne, {other});
+				ReplacePlaceholders(oneByOne, {one});
+				ReplacePlaceholders(oneByOne, {tab});
+				EXPECT_STREQ(atOnce.String(), oneByOne.String()) << text.String();
+			}
+		}
+	}
+}
+
+
 TEST(IndentContinuationLinesTest, IndentsEveryLineButTheFirst)
 {
 	BString text("one\ntwo\n\nfour");
