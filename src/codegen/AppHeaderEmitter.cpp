@@ -3,13 +3,12 @@
 
 #include "codegen/AppHeaderEmitter.h"
 
-#include <stdio.h>
-
 #include "app/WindowGuard.h"
 #include "codegen/FormParts.h"
 #include "codegen/HandlerNames.h"
 #include "designer/DesignForm.h"
 #include "model/AppComponent.h"
+#include "model/Diagnostics.h"
 #include "model/Event.h"
 
 
@@ -91,7 +90,7 @@ void
 TAppHeaderEmitter::EmitEventHandlerPrototype(TEvent* event, BString& text)
 {
 	text << HandlerPrototype(*event, HandlerName(*event).String());
-	printf("EmitEventhandlerPrototype: %s\n", text.String());
+	PrintDiagnostic("EmitEventhandlerPrototype: %s\n", text.String());
 }
 
 

@@ -3,8 +3,6 @@
 
 #include "codegen/CodeGenerator.h"
 
-#include <string.h>
-
 #include <memory>
 
 #include "app/Dialogs.h"
@@ -21,6 +19,7 @@
 #include "codegen/SourceText.h"
 #include "designer/DesignForm.h"
 #include "model/AppComponent.h"
+#include "model/FixedText.h"
 #include "model/Property.h"
 
 namespace {
@@ -289,8 +288,7 @@ TCodeGenerator::SetAppComponent(TAppComponent* app)
 void
 TCodeGenerator::SetGenerationPath(const char* path)
 {
-	strncpy(fGenerationPath, path, sizeof(fGenerationPath) - 1);
-	fGenerationPath[sizeof(fGenerationPath) - 1] = '\0';
+	SetFixedText(fGenerationPath, path);
 }
 
 

@@ -62,6 +62,7 @@ public:
 
 	/// The folder that the files are written to, empty at first. At most 255 bytes are kept.
 	const char* GenerationPath() const { return fGenerationPath; }
+	/// Null is ignored.
 	void SetGenerationPath(const char* path);
 
 	/// Whether the dialog is open. The application component must stay until it is closed.

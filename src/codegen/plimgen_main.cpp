@@ -2,7 +2,6 @@
 // plimgen: generates the sources of a project without a display.
 
 #include <errno.h>
-#include <stdarg.h>
 #include <stdio.h>
 #include <stdlib.h>
 #include <string.h>
@@ -78,10 +77,6 @@ CompleteOptions(command_line* line)
 }
 
 
-/// Set while what the program prints on standard output goes nowhere.
-bool sDiscardsOutput = false;
-
-
 /// Makes standard output plimgen's own: what the rest of the program prints there goes nowhere.
 FILE*
 TakeStandardOutput()
@@ -90,8 +85,7 @@ TakeStandardOutput()
 	FILE* out = own >= 0 ? fdopen(own, "w") : nullptr;
 	if (out == nullptr || freopen("/dev/null", "w", stdout) == nullptr)
 		return nullptr;
-	sDiscardsOutput = true;
-	DiscardCalls();
+	ShowDiagnostics(false);
 	return out;
 }
 
@@ -130,22 +124,6 @@ Generate(const generation_options& options)
 }
 
 } // namespace
-
-
-/// The program's diagnostics, tens of lines for each component, without the cost of formatting what nobody sees.
-///
-/// This takes the place of the C library's function in everything that plimgen loads.
-extern "C" __attribute__((visibility("default"))) int
-printf(const char* format, ...)
-{
-	if (sDiscardsOutput)
-		return 0;
-	va_list arguments;
-	va_start(arguments, format);
-	const int length = vprintf(format, arguments);
-	va_end(arguments);
-	return length;
-}
 
 
 int

@@ -12,6 +12,7 @@
 #include "app/Dialogs.h"
 #include "designer/DesignFormView.h"
 #include "model/ColorText.h"
+#include "model/Diagnostics.h"
 #include "model/Property.h"
 #include "props/PropertyEditor.h"
 
@@ -145,7 +146,7 @@ TDesignForm::FrameResized(float width, float height)
 const char*
 TDesignForm::GetPropertyValue(const char* name)
 {
-	printf("TDesignForm::GetPropertyValue('%s')\n", name);
+	PrintDiagnostic("TDesignForm::GetPropertyValue('%s')\n", name);
 	return TFormComponent::GetPropertyValue(name);
 }
 
@@ -153,7 +154,7 @@ TDesignForm::GetPropertyValue(const char* name)
 void
 TDesignForm::SetPropertyValue(const char* name, const char* value)
 {
-	printf("TDesignForm::SetPropertyValue('%s', '%s')\n", name, value);
+	PrintDiagnostic("TDesignForm::SetPropertyValue('%s', '%s')\n", name, value);
 	if (name == nullptr || value == nullptr)
 		return;
 

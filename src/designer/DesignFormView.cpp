@@ -2,13 +2,14 @@
 
 #include "designer/DesignFormView.h"
 
-#include <cstdio>
 #include <cstring>
 
 #include "designer/DesignForm.h"
 #include "designer/FormHost.h"
 #include "designer/FormReader.h"
 #include "designer/FormWriter.h"
+#include "model/Diagnostics.h"
+#include "model/FixedText.h"
 #include "palette/PaletteCatalog.h"
 #include "palette/PaletteEntry.h"
 
@@ -120,7 +121,7 @@ TDesignFormView::CreateComponent(BView* parent, BRect frame)
 
 	TComponent* component = entry->CreateComponent(parent, this, frame);
 	if (component == nullptr) {
-		printf("No component returned from CreateComponent()\n");
+		PrintDiagnostic("No component returned from CreateComponent()\n");
 		return nullptr;
 	}
 
@@ -129,7 +130,7 @@ TDesignFormView::CreateComponent(BView* parent, BRect frame)
 	component->SetComponentName(name);
 	component->SetPropertyValue("Name", name);
 	fForm->UpdateComponentPosition(component, frame);
-	printf("Creating Component '%s'\n", component->ComponentName());
+	PrintDiagnostic("Creating Component '%s'\n", component->ComponentName());
 	AddComponent(component);
 	return component;
 }
@@ -171,10 +172,5 @@ TDesignFormView::LoadFromFile(const char* path, TLoadReport* report)
 void
 TDesignFormView::SetFilename(const char* name)
 {
-	if (name == nullptr)
-		return;
-	// The name may be this very one.
-	const size_t length = strnlen(name, sizeof(fFilename) - 1);
-	memmove(fFilename, name, length);
-	fFilename[length] = '\0';
+	SetFixedText(fFilename, name);
 }

@@ -9,21 +9,12 @@
 #include <NodeInfo.h>
 
 #include "app/ReplacementFile.h"
+#include "model/FixedText.h"
 
 namespace {
 
 constexpr uint32 kDocument = 'PlmF';
 constexpr const char* kDesignerSignature = "application/x-qtx.Plim";
-
-/// Copies \a text, which may be the field's own, into the zero-filled \a field of \a size bytes, cutting
-/// what is too long.
-void
-CopyText(char* field, size_t size, const char* text)
-{
-	const size_t length = strnlen(text, size - 1);
-	memmove(field, text, length);
-	memset(field + length, 0, size - length);
-}
 
 } // namespace
 
@@ -34,8 +25,7 @@ TPLIMFile::TPLIMFile(const char* mimeType, const char* fileName)
 	  fFileType(),
 	  fStatus(B_NO_INIT)
 {
-	if (mimeType != nullptr)
-		CopyText(fFileType, sizeof(fFileType), mimeType);
+	SetFixedText(fFileType, mimeType);
 	if (fileName != nullptr) {
 		SetFilename(fileName);
 		OpenFile();
@@ -82,7 +72,7 @@ TPLIMFile::SetFilename(const char* name)
 {
 	if (name == nullptr)
 		return;
-	CopyText(fFilename, sizeof(fFilename), name);
+	SetFixedText(fFilename, name);
 	fFilenameCut = strlen(name) >= sizeof(fFilename);
 }
 

@@ -4,6 +4,7 @@
 
 #include <cstdio>
 #include <cstring>
+#include <string_view>
 
 #include <View.h>
 
@@ -11,6 +12,7 @@
 #include "designer/DesignFormView.h"
 #include "designer/FormFile.h"
 #include "designer/LoadReport.h"
+#include "model/Diagnostics.h"
 #include "model/Event.h"
 #include "model/Property.h"
 #include "palette/PaletteCatalog.h"
@@ -42,7 +44,7 @@ TFormReader::Read(const char* path)
 	fForm->UnlockLooper();
 
 	if (file.FindMessage("Components", &part) != B_OK) {
-		printf("No components found for '%s'\n", fForm->DesignWindow()->ComponentName());
+		PrintDiagnostic("No components found for '%s'\n", fForm->DesignWindow()->ComponentName());
 		return true;
 	}
 	CreateComponents(part);
@@ -93,7 +95,7 @@ TFormReader::CreateComponents(const BMessage& collection)
 			continue;
 		BMessage record;
 		if (collection.FindMessage(name, &record) != B_OK) {
-			printf("Warning: Unable to extract Component message\n");
+			PrintDiagnostic("Warning: Unable to extract Component message\n");
 			DropComponent(name, "its record cannot be read");
 			continue;
 		}
@@ -107,7 +109,7 @@ TFormReader::CreateComponent(const char* savedName, const BMessage& record)
 {
 	BMessage properties;
 	if (record.FindMessage("Properties", &properties) != B_OK) {
-		printf("Warning: Unable to extract component Properties message\n");
+		PrintDiagnostic("Warning: Unable to extract component Properties message\n");
 		DropComponent(savedName, "it has no properties");
 		return;
 	}
@@ -116,14 +118,14 @@ TFormReader::CreateComponent(const char* savedName, const BMessage& record)
 	BRect frame(0, 0, -1, -1);
 	const bool hasFrame = properties.FindRect("_Frame", &frame) == B_OK;
 	if (properties.FindString("_ClassName", &className) != B_OK || !hasFrame) {
-		printf("Warning: No class name/location for '%s'\n", savedName);
+		PrintDiagnostic("Warning: No class name/location for '%s'\n", savedName);
 		DropComponent(savedName, "it has no class name or no frame");
 		return;
 	}
 
 	TPaletteEntry* entry = PaletteCatalog().FindPalEntry(className);
 	if (entry == nullptr) {
-		printf("Warning: No palette entry found for '%s'\n", className);
+		PrintDiagnostic("Warning: No palette entry found for '%s'\n", className);
 		if (fReport != nullptr) {
 			BString text;
 			text << "component '" << savedName
@@ -139,7 +141,7 @@ TFormReader::CreateComponent(const char* savedName, const BMessage& record)
 		fForm->UnlockLooper();
 	}
 	if (component == nullptr) {
-		printf("Warning: Unable to create component '%s'\n", savedName);
+		PrintDiagnostic("Warning: Unable to create component '%s'\n", savedName);
 		DropComponent(savedName, "its component library did not create it");
 		return;
 	}
@@ -150,7 +152,7 @@ TFormReader::CreateComponent(const char* savedName, const BMessage& record)
 	if (record.FindMessage("Events", &events) == B_OK)
 		ReadEvents(component, events);
 	else
-		printf("Warning: Unable to extract event information for '%s'\n", savedName);
+		PrintDiagnostic("Warning: Unable to extract event information for '%s'\n", savedName);
 	component->ReadExtendedComponentDataFrom(&record);
 
 	const char* owner;
@@ -202,7 +204,8 @@ TFormReader::NestComponents()
 	if (fPlacements.empty())
 		return;
 
-	std::unordered_map<std::string, TComponent*> components;
+	std::unordered_map<std::string_view, TComponent*> components;
+	components.reserve(fForm->CountComponents());
 	for (int32 i = 0; i < fForm->CountComponents(); i++) {
 		TComponent* component = fForm->ComponentAt(i);
 		components.emplace(component->ComponentName(), component);

@@ -2,13 +2,12 @@
 
 #include "designer/FormWriter.h"
 
-#include <cstdio>
-
 #include <View.h>
 
 #include "designer/DesignForm.h"
 #include "designer/DesignFormView.h"
 #include "designer/FormFile.h"
+#include "model/Diagnostics.h"
 #include "model/Event.h"
 #include "model/Property.h"
 
@@ -38,9 +37,9 @@ TFormWriter::Write(const char* path)
 	AddFormProperties(&fProperties);
 	AddFormEvents(&fEvents);
 	if (file.SetMessage("_FormProperties", &fProperties) != B_OK)
-		printf("Warning: Unable to save form properties\n");
+		PrintDiagnostic("Warning: Unable to save form properties\n");
 	if (file.SetMessage("_FormEvents", &fEvents) != B_OK)
-		printf("Warning: Unable to save form events\n");
+		PrintDiagnostic("Warning: Unable to save form events\n");
 
 	BMessage collection('PCmp');
 	AddComponents(&collection);
@@ -57,7 +56,7 @@ TFormWriter::AddFormProperties(BMessage* properties)
 	TFormComponent* form = fForm->DesignWindow();
 	for (int32 i = 0; i < form->CountProperties(); i++) {
 		TProperty* property = form->PropertyAt(i);
-		printf("Writing form property %s: %s\n", property->Name(), property->Value());
+		PrintDiagnostic("Writing form property %s: %s\n", property->Name(), property->Value());
 		properties->AddString(property->Name(), property->Value());
 	}
 }
@@ -69,7 +68,7 @@ TFormWriter::AddFormEvents(BMessage* events)
 	TFormComponent* form = fForm->DesignWindow();
 	for (int32 i = 0; i < form->CountEvents(); i++) {
 		TEvent* event = form->EventAt(i);
-		printf("Writing form event %s: %s\n", event->name, BoolText(event->selected));
+		PrintDiagnostic("Writing form event %s: %s\n", event->name, BoolText(event->selected));
 		events->AddBool(event->name, event->selected);
 	}
 }
@@ -90,18 +89,18 @@ TFormWriter::AddComponent(int32 index, BMessage* collection)
 	fRecord.MakeEmpty();
 	fProperties.MakeEmpty();
 	fEvents.MakeEmpty();
-	printf("*** %s info ***\n", component->ComponentName());
+	PrintDiagnostic("*** %s info ***\n", component->ComponentName());
 
 	AddPlace(component);
 	AddProperties(component, index);
 	AddEvents(component);
 	component->WriteExtendedComponentDataTo(&fRecord);
 	if (fRecord.AddMessage("Properties", &fProperties) != B_OK)
-		printf("Warning: Unable to add Prop Info to ComponentInfo\n");
+		PrintDiagnostic("Warning: Unable to add Prop Info to ComponentInfo\n");
 	if (fRecord.AddMessage("Events", &fEvents) != B_OK)
-		printf("Warning: Unable to add Event Info to ComponentInfo\n");
+		PrintDiagnostic("Warning: Unable to add Event Info to ComponentInfo\n");
 	if (collection->AddMessage(component->ComponentName(), &fRecord) != B_OK)
-		printf("Warning: Unable to add the component to the collection\n");
+		PrintDiagnostic("Warning: Unable to add the component to the collection\n");
 }
 
 
@@ -109,12 +108,12 @@ void
 TFormWriter::AddPlace(TComponent* component)
 {
 	if (fProperties.AddString("_ClassName", component->ClassName()) != B_OK)
-		printf("Warning: Unable to add class name\n");
+		PrintDiagnostic("Warning: Unable to add class name\n");
 
 	if (fForm->LockLooper()) {
 		BView* view = component->DTView();
 		if (view == nullptr || fProperties.AddRect("_Frame", view->Frame()) != B_OK)
-			printf("Warning: Unable to add frame\n");
+			PrintDiagnostic("Warning: Unable to add frame\n");
 		fForm->UnlockLooper();
 	}
 
@@ -123,7 +122,8 @@ TFormWriter::AddPlace(TComponent* component)
 	TComponent* owner = dynamic_cast<TComponent*>(component->Owner());
 	if (owner == nullptr)
 		return;
-	printf("  Writing Owner name for %s: %s\n", component->ComponentName(), owner->ComponentName());
+	PrintDiagnostic(
+		"  Writing Owner name for %s: %s\n", component->ComponentName(), owner->ComponentName());
 	fProperties.AddString("_OwnerName", owner->ComponentName());
 }
 
@@ -136,10 +136,11 @@ TFormWriter::AddProperties(TComponent* component, int32 index)
 	// property there.
 	TProperty* extended = component->PropertyAt(index);
 
-	printf(">> %s Properties:\n", component->ComponentName());
+	PrintDiagnostic(">> %s Properties:\n", component->ComponentName());
 	for (int32 i = 0; i < component->CountProperties(); i++) {
 		TProperty* property = component->PropertyAt(i);
-		printf("  %s.%s(%s)\n", component->ComponentName(), property->Name(), property->Value());
+		PrintDiagnostic(
+			"  %s.%s(%s)\n", component->ComponentName(), property->Name(), property->Value());
 		fProperties.AddString(property->Name(), property->Value());
 		if (extended != nullptr)
 			extended->WriteExtendedData(&fProperties);
@@ -150,10 +151,10 @@ TFormWriter::AddProperties(TComponent* component, int32 index)
 void
 TFormWriter::AddEvents(TComponent* component)
 {
-	printf("\n>> %s Events:\n", component->ComponentName());
+	PrintDiagnostic("\n>> %s Events:\n", component->ComponentName());
 	for (int32 i = 0; i < component->CountEvents(); i++) {
 		TEvent* event = component->EventAt(i);
-		printf("  Writing %s.%s(%s)\n", component->ComponentName(), event->name,
+		PrintDiagnostic("  Writing %s.%s(%s)\n", component->ComponentName(), event->name,
 			BoolText(event->selected));
 		fEvents.AddBool(event->name, event->selected);
 	}

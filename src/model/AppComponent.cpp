@@ -3,7 +3,6 @@
 
 #include "model/AppComponent.h"
 
-#include <cstdio>
 #include <cstring>
 
 #include "model/Diagnostics.h"
@@ -69,7 +68,7 @@ TAppComponent::InitEventList()
 const char*
 TAppComponent::GetPropertyValue(const char* name)
 {
-	printf("TAppComponent::GetPropertyValue('%s')\n", ShownText(name));
+	PrintDiagnostic("TAppComponent::GetPropertyValue('%s')\n", ShownText(name));
 	for (const auto& property : kAppProperties) {
 		if (name != nullptr && strcmp(name, property.name) == 0) {
 			const char* value;
@@ -83,7 +82,7 @@ TAppComponent::GetPropertyValue(const char* name)
 void
 TAppComponent::SetPropertyValue(const char* name, const char* value)
 {
-	printf("TAppComponent::SetPropertyValue('%s', '%s')\n", ShownText(name), ShownText(value));
+	PrintCall("TAppComponent::SetPropertyValue", name, value);
 	for (const auto& property : kAppProperties) {
 		if (name != nullptr && strcmp(name, property.name) == 0) {
 			StoreProperty(name, value);

@@ -4,12 +4,12 @@
 
 #include "model/Component.h"
 
-#include <cstdio>
 #include <cstring>
 
 #include "model/ComponentOwner.h"
 #include "model/Diagnostics.h"
 #include "model/Event.h"
+#include "model/FixedText.h"
 #include "model/Property.h"
 #include "model/PropertyStore.h"
 #include "model/PropertyTable.h"
@@ -18,18 +18,6 @@
 
 /// The step by which the lists grow, in entries.
 static const int32 kListStep = 20;
-
-
-/// Copies as much of \a text as fits; null is ignored. The text may be a part of the buffer.
-static void
-CopyText(char* buffer, size_t size, const char* text)
-{
-	if (text == nullptr)
-		return;
-	const size_t length = strnlen(text, size - 1);
-	memmove(buffer, text, length);
-	buffer[length] = '\0';
-}
 
 
 static void
@@ -74,7 +62,7 @@ TComponent::~TComponent()
 void
 TComponent::SetComponentName(const char* name)
 {
-	CopyText(fComponentName, sizeof(fComponentName), name);
+	SetFixedText(fComponentName, name);
 }
 
 
@@ -172,7 +160,7 @@ TComponent::Modified() const
 const char*
 TComponent::GetPropertyValue(const char* name)
 {
-	printf("TComponent::GetPropertyValue('%s')\n", ShownText(name));
+	PrintDiagnostic("TComponent::GetPropertyValue('%s')\n", ShownText(name));
 	if (name == nullptr)
 		return nullptr;
 	if (strcmp(name, "Name") == 0)
@@ -320,7 +308,7 @@ TComponent::ClearEvents(bool deleteEvents)
 void
 TComponent::SetClassName(const char* name)
 {
-	CopyText(fClassName, sizeof(fClassName), name);
+	SetFixedText(fClassName, name);
 }
 
 

@@ -3,8 +3,6 @@
 
 #include "model/Component.h"
 
-#include <cstdio>
-
 #include <Message.h>
 #include <String.h>
 #include <View.h>
@@ -12,6 +10,7 @@
 
 #include "model/ComponentOwner.h"
 #include "model/DesignMessages.h"
+#include "model/Diagnostics.h"
 #include "model/FormDesigner.h"
 #include "model/ViewLock.h"
 
@@ -100,7 +99,7 @@ TComponent::HandleComponentDesignMessage(BMessage* message)
 
 	TComponent* dragged = static_cast<TComponent*>(pointer);
 	if (dragged == this) {
-		printf("%s selected\n", ClassTypeName(this).String());
+		PrintDiagnostic("%s selected\n", ClassTypeName(this).String());
 		PassToParent(message, fDTView);
 		return false;
 	}
@@ -138,7 +137,7 @@ TComponent::TakeIn(TComponent* component)
 	if (view->Parent() == fDTView)
 		return;
 
-	printf("%s Adding child from other parent\n", ClassTypeName(this).String());
+	PrintDiagnostic("%s Adding child from other parent\n", ClassTypeName(this).String());
 	TComponentOwner* newOwner = dynamic_cast<TComponentOwner*>(this);
 	if (newOwner != nullptr) {
 		// The designer lists every component of the form, containers list their direct children.

@@ -4,8 +4,6 @@
 
 #include "model/Component.h"
 
-#include <cstdio>
-
 #include <Message.h>
 #include <OS.h>
 #include <String.h>
@@ -14,6 +12,7 @@
 
 #include "model/ComponentOwner.h"
 #include "model/DesignMessages.h"
+#include "model/Diagnostics.h"
 #include "model/FormDesigner.h"
 #include "model/ViewLock.h"
 
@@ -131,7 +130,8 @@ TComponent::CreateChild(TComponentOwner* container, BPoint where, BView* view)
 	if (child == nullptr)
 		return;
 	container->AddComponent(child);
-	printf("%s: Created component '%s'\n", ClassTypeName(this).String(), child->ComponentName());
+	PrintDiagnostic(
+		"%s: Created component '%s'\n", ClassTypeName(this).String(), child->ComponentName());
 	Designer()->DoneDroppingComponent();
 }
 

@@ -12,6 +12,7 @@
 
 #include "model/Component.h"
 #include "model/ComponentOwner.h"
+#include "model/Diagnostics.h"
 
 /// The working buffer for new names, in bytes.
 static const int kNewNameSize = 80;
@@ -36,10 +37,10 @@ GetNewComponentName(
 		// A long stem gives way to the number, which alone makes the name a new one.
 		const int digits = snprintf(nullptr, 0, "%d", static_cast<int>(number));
 		const int stemSize = kNewNameSize - 1 - digits;
-		printf("before\n");
+		PrintDiagnostic("before\n");
 		snprintf(name, sizeof(name), "%.*s%d", stemSize, component->ComponentName(),
 			static_cast<int>(number));
-		printf("after\n");
+		PrintDiagnostic("after\n");
 		if (taken.count(name) == 0)
 			break;
 	}

@@ -3,7 +3,6 @@
 
 #include "model/ControlComponent.h"
 
-#include <cstdio>
 #include <cstring>
 
 #include <Control.h>
@@ -49,7 +48,7 @@ TControlComponent::InitPropertyList()
 const char*
 TControlComponent::GetPropertyValue(const char* name)
 {
-	printf("TControlComponent::GetPropertyValue('%s')\n", ShownText(name));
+	PrintDiagnostic("TControlComponent::GetPropertyValue('%s')\n", ShownText(name));
 	if (name == nullptr)
 		return TViewComponent::GetPropertyValue(name);
 
@@ -89,7 +88,7 @@ TControlComponent::ApplyToControl(const char* name, const char* value)
 {
 	TViewLock lock(DTView());
 	if (!lock.IsLocked()) {
-		printf("Warning: %s::DTView() not set\n", ClassTypeName(this).String());
+		PrintDiagnostic("Warning: %s::DTView() not set\n", ClassTypeName(this).String());
 		return;
 	}
 

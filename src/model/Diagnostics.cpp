@@ -1,18 +1,31 @@
 // SPDX-License-Identifier: MIT
-// Small helpers for the diagnostics on standard output.
+// The diagnostics on standard output.
 
 #include "model/Diagnostics.h"
 
+#include <cstdarg>
 #include <cstdio>
 #include <cstring>
 
-static bool sDiscardsCalls = false;
+static bool sShown = true;
+
+
+void
+PrintDiagnostic(const char* format, ...)
+{
+	if (!sShown)
+		return;
+	va_list arguments;
+	va_start(arguments, format);
+	vprintf(format, arguments);
+	va_end(arguments);
+}
 
 
 void
 PrintCall(const char* function, const char* first, const char* second)
 {
-	if (sDiscardsCalls)
+	if (!sShown)
 		return;
 
 	// Put together here, a line takes a fraction of what printf() takes for it.
@@ -34,7 +47,7 @@ PrintCall(const char* function, const char* first, const char* second)
 
 
 void
-DiscardCalls()
+ShowDiagnostics(bool shown)
 {
-	sDiscardsCalls = true;
+	sShown = shown;
 }

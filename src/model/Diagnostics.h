@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Small helpers for the diagnostics on standard output. Not for component libraries.
+// The diagnostics on standard output. Not for component libraries.
 
 #pragma once
 
@@ -11,11 +11,14 @@ ShownText(const char* text)
 }
 
 
+/// Prints a diagnostic on standard output, as printf() does. \a format brings its line break.
+void PrintDiagnostic(const char* format, ...) __attribute__((format(printf, 1, 2)));
+
 /// Prints a call of \a function with the two texts, either of which may be null:
 /// TComponent::SetPropertyValue('Label', 'OK'). Every property of a form has two of these lines while the form
 /// is loaded.
 void PrintCall(const char* function, const char* first, const char* second);
 
-/// From now on, PrintCall() prints nothing. For programs whose standard output nobody sees; call it before
-/// there are other threads.
-void DiscardCalls();
+/// Whether diagnostics are printed, as they are at first. For programs whose standard output nobody sees, which
+/// need not wait for the texts to be put together: call it before there are other threads.
+void ShowDiagnostics(bool shown);

@@ -165,7 +165,7 @@ TVisualComponent::InitEventList()
 const char*
 TVisualComponent::GetPropertyValue(const char* name)
 {
-	printf("TVisualComponent::GetPropertyValue('%s')\n", ShownText(name));
+	PrintDiagnostic("TVisualComponent::GetPropertyValue('%s')\n", ShownText(name));
 	if (name == nullptr)
 		return TComponent::GetPropertyValue(name);
 

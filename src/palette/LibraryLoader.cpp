@@ -2,8 +2,6 @@
 
 #include "palette/LibraryLoader.h"
 
-#include <cstdio>
-
 #include <Application.h>
 #include <Directory.h>
 #include <Entry.h>
@@ -11,6 +9,7 @@
 #include <Roster.h>
 #include <image.h>
 
+#include "model/Diagnostics.h"
 #include "palette/PaletteCatalog.h"
 #include "palette/PaletteEntry.h"
 
@@ -55,7 +54,7 @@ TLibraryLoader::LoadFolder(const char* folder)
 	while (directory.GetNextEntry(&entry, true) == B_OK) {
 		BPath path;
 		if (entry.GetPath(&path) != B_OK) {
-			printf("entry.GetPath failed\n");
+			PrintDiagnostic("entry.GetPath failed\n");
 			continue;
 		}
 		LoadLibrary(path.Path());
@@ -70,7 +69,7 @@ TLibraryLoader::LoadLibrary(const char* path)
 	const image_id image = load_add_on(path);
 	if (image < B_OK)
 		return;
-	printf("load_add_on(%s) success\n", path);
+	PrintDiagnostic("load_add_on(%s) success\n", path);
 
 	init_library init;
 	uninit_library uninit;
@@ -80,17 +79,18 @@ TLibraryLoader::LoadLibrary(const char* path)
 		|| !FindFunction(image, "UnInitComponentLib", &uninit)
 		|| !FindFunction(image, "CountComponents", &count)
 		|| !FindFunction(image, "EntryAt", &entryAt)) {
-		printf("get_image_symbol() failed\n");
+		PrintDiagnostic("get_image_symbol() failed\n");
 		unload_add_on(image);
 		return;
 	}
 
 	if (!init(image)) {
-		printf("Failed to initialize component library %s\n", path);
+		PrintDiagnostic("Failed to initialize component library %s\n", path);
 		unload_add_on(image);
 		return;
 	}
-	printf("InitComponentLib() success\n%ld Components in %s\n", static_cast<long>(count()), path);
+	PrintDiagnostic(
+		"InitComponentLib() success\n%ld Components in %s\n", static_cast<long>(count()), path);
 	AddEntries(count, entryAt);
 }
 
@@ -101,7 +101,7 @@ TLibraryLoader::AddEntries(uint32 (*count)(), TPaletteEntry* (*entryAt)(uint32 i
 	for (uint32 i = 0; i < count(); i++) {
 		TPaletteEntry* entry = entryAt(i);
 		if (entry == nullptr) {
-			printf("Failed to create palette entry %ld\n", static_cast<long>(i));
+			PrintDiagnostic("Failed to create palette entry %ld\n", static_cast<long>(i));
 			continue;
 		}
 

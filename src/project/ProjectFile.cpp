@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
 // The document of a project, and those of its forms.
 
-#include <cstdio>
 #include <cstring>
 
 #include <Entry.h>
@@ -14,6 +13,7 @@
 #include "designer/DesignFormView.h"
 #include "designer/FormFile.h"
 #include "designer/LoadReport.h"
+#include "model/Diagnostics.h"
 #include "model/Event.h"
 #include "model/Property.h"
 #include "project/InspectorLink.h"
@@ -52,7 +52,7 @@ bool
 TProject::LoadFromFile(const char* path, TLoadReport* report)
 {
 	TProjectOperation operation(this);
-	printf("** filename = '%s'\n", path);
+	PrintDiagnostic("** filename = '%s'\n", path);
 	NewProject(false);
 
 	TPLIMFile document(kProjectFileType);
@@ -146,7 +146,7 @@ TProject::LoadApp(const BMessage& document)
 	type_code type;
 	BMessage properties;
 	if (document.FindMessage("AppProperties", &properties) != B_OK)
-		printf("Warning: Unable to load app properties.\n");
+		PrintDiagnostic("Warning: Unable to load app properties.\n");
 	for (int32 i = 0; properties.GetInfo(B_STRING_TYPE, i, &name, &type) == B_OK; i++) {
 		const char* value = nullptr;
 		TProperty* property = fApp->FindProperty(name);
@@ -157,7 +157,7 @@ TProject::LoadApp(const BMessage& document)
 
 	BMessage events;
 	if (document.FindMessage("AppEvents", &events) != B_OK)
-		printf("Warning: Unable to load app events.\n");
+		PrintDiagnostic("Warning: Unable to load app events.\n");
 	for (int32 i = 0; events.GetInfo(B_BOOL_TYPE, i, &name, &type) == B_OK; i++) {
 		bool selected;
 		if (events.FindBool(name, &selected) == B_OK)
@@ -246,11 +246,11 @@ TProject::AddAppTo(TPLIMFile* document)
 	}
 
 	if (document->AddMessage("AppProperties", &properties) != B_OK) {
-		printf("Warning: Unable to save app properties.\n");
+		PrintDiagnostic("Warning: Unable to save app properties.\n");
 		return false;
 	}
 	if (document->AddMessage("AppEvents", &events) != B_OK) {
-		printf("Warning: Unable to save app events.\n");
+		PrintDiagnostic("Warning: Unable to save app events.\n");
 		return false;
 	}
 	return true;
@@ -279,7 +279,8 @@ TProject::SaveForms(TPLIMFile* document)
 		const bool asRead = path == entry.resolvedPath;
 		// A name that the document uses itself cannot stand for a form, which would be lost.
 		if (document->AddString(name.String(), asRead ? entry.storedPath : path) != B_OK) {
-			printf("Warning: Unable to save the form '%s' under that name.\n", name.String());
+			PrintDiagnostic(
+				"Warning: Unable to save the form '%s' under that name.\n", name.String());
 			return false;
 		}
 	}

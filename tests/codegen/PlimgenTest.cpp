@@ -483,6 +483,26 @@ TEST(PlimgenTest, VerboseLetsTheProgramsDiagnosticsThrough)
 }
 
 
+TEST(PlimgenTest, WhatLibrariesPrintStaysOutOfTheOutput)
+{
+	ProjectFolder folder;
+	const std::string project = folder.SaveSimple();
+	const program_result result = Plimgen({project, "--components",
+		PLIM_BUILD_DIR "/bin/Components", "--components", PLIM_BUILD_DIR "/tests/libraries/noisy"});
+	EXPECT_EQ(result.code, 0) << result.err;
+	EXPECT_EQ(result.err, "");
+	EXPECT_EQ(result.out,
+		"created " + folder.At("out/Form1.h") + "\ncreated " + folder.At("out/Form1.fcp")
+			+ "\ncreated " + folder.At("out/Form1.cpp") + "\ncreated " + folder.At("out/Sample.h")
+			+ "\ncreated " + folder.At("out/Sample.cpp") + "\n");
+
+	const program_result verbose = Plimgen({project, "-v", "--components",
+		PLIM_BUILD_DIR "/bin/Components", "--components", PLIM_BUILD_DIR "/tests/libraries/noisy"});
+	EXPECT_TRUE(
+		Has(verbose.out, "noise of printf\nnoise of puts\nnoise of a stream\nnoise of write\n"));
+}
+
+
 TEST(PlimgenTest, VersionAndHelpAreDone)
 {
 	const program_result version = Plimgen({"--version"});
