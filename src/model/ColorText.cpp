@@ -27,8 +27,10 @@ StrToRGBColor(const char* text, rgb_color* color)
 	if (text == nullptr)
 		return *color;
 
-	text += strspn(text, " ");
-	text += strspn(text, "{");
+	while (*text == ' ')
+		text++;
+	while (*text == '{')
+		text++;
 
 	char numbers[1024];
 	size_t length = strnlen(text, sizeof(numbers) - 1);
@@ -40,13 +42,15 @@ StrToRGBColor(const char* text, rgb_color* color)
 	numbers[length] = '\0';
 
 	uint8* const channels[] = {&color->red, &color->green, &color->blue, &color->alpha};
-	char* rest = nullptr;
-	char* token = strtok_r(numbers, ",", &rest);
+	const char* token = numbers;
 	for (uint8* channel : channels) {
-		if (token == nullptr)
+		while (*token == ',')
+			token++;
+		if (*token == '\0')
 			break;
 		*channel = static_cast<uint8>(strtol(token, nullptr, 10));
-		token = strtok_r(nullptr, ",", &rest);
+		while (*token != ',' && *token != '\0')
+			token++;
 	}
 	return *color;
 }

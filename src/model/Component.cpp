@@ -10,6 +10,7 @@
 #include "model/Diagnostics.h"
 #include "model/Event.h"
 #include "model/FixedText.h"
+#include "model/NameCompare.h"
 #include "model/Property.h"
 #include "model/PropertyStore.h"
 #include "model/PropertyTable.h"
@@ -32,9 +33,7 @@ DeleteProperty(TProperty* property)
 
 
 TComponent::TComponent(TComponentOwner* owner, TFormDesigner* designer, TComponentType type)
-	: fComponentName(),
-	  fClassName(),
-	  fOwner(owner),
+	: fOwner(owner),
 	  fDesigner(designer),
 	  fComponentType(type),
 	  fProperties(new BList(kListStep)),
@@ -43,8 +42,12 @@ TComponent::TComponent(TComponentOwner* owner, TFormDesigner* designer, TCompone
 	  fModified(false),
 	  fPropertyStore(new TPropertyStore(this)),
 	  fDesignerSelected(false),
+	  fLastFound(kNoProperty),
 	  fDTView(nullptr)
 {
+	// Clearing all of the name would touch memory that nobody uses, in each of thousands of components.
+	fComponentName[0] = '\0';
+	fClassName[0] = '\0';
 }
 
 
@@ -163,7 +166,7 @@ TComponent::GetPropertyValue(const char* name)
 	PrintDiagnostic("TComponent::GetPropertyValue('%s')\n", ShownText(name));
 	if (name == nullptr)
 		return nullptr;
-	if (strcmp(name, "Name") == 0)
+	if (IsSameName(name, "Name"))
 		return ComponentName();
 
 	const char* value;
@@ -177,7 +180,7 @@ TComponent::SetPropertyValue(const char* name, const char* value)
 	PrintCall("TComponent::SetPropertyValue", name, value);
 	if (name == nullptr || value == nullptr)
 		return;
-	if (strcmp(name, "Name") == 0)
+	if (IsSameName(name, "Name"))
 		SetComponentName(value);
 	StoreProperty(name, value);
 }
@@ -255,6 +258,7 @@ TComponent::AddPropAndEditor(TProperty* property, TPropertyEditor* editor, const
 bool
 TComponent::RemoveProperty(TProperty* property)
 {
+	fLastFound = kNoProperty;
 	return fProperties->RemoveItem(property);
 }
 
@@ -262,6 +266,7 @@ TComponent::RemoveProperty(TProperty* property)
 TProperty*
 TComponent::RemoveProperty(int32 index)
 {
+	fLastFound = kNoProperty;
 	return static_cast<TProperty*>(fProperties->RemoveItem(index));
 }
 
@@ -271,6 +276,7 @@ TComponent::ClearProperties(bool deleteProperties)
 {
 	for (int32 i = 0; deleteProperties && PropertyAt(i) != nullptr; i++)
 		DeleteProperty(PropertyAt(i));
+	fLastFound = kNoProperty;
 	fProperties->MakeEmpty();
 }
 
@@ -332,14 +338,20 @@ TComponent::FindProperty(const char* name) const
 	if (name == nullptr)
 		return nullptr;
 	const int32 count = CountProperties();
+	void* const* properties = static_cast<void* const*>(fProperties->Items());
+	// What was found last is asked for again while a form is loaded: it was the first of its name, and
+	// still is.
+	const int32 last = fLastFound.load(std::memory_order_relaxed);
+	if (last >= 0 && last < count
+		&& IsSameName(static_cast<TProperty*>(properties[last])->Name(), name))
+		return static_cast<TProperty*>(properties[last]);
+
 	for (int32 i = 0; i < count; i++) {
-		TProperty* property = PropertyAt(i);
-		if (property == nullptr)
-			continue;
-		// This is where loading a form spends its time, and few names begin alike.
-		const char* candidate = property->Name();
-		if (candidate[0] == name[0] && strcmp(candidate, name) == 0)
+		TProperty* property = static_cast<TProperty*>(properties[i]);
+		if (property != nullptr && IsSameName(property->Name(), name)) {
+			fLastFound.store(i, std::memory_order_relaxed);
 			return property;
+		}
 	}
 	return nullptr;
 }
@@ -364,9 +376,11 @@ TComponent::FindEvent(const char* name) const
 {
 	if (name == nullptr)
 		return nullptr;
-	for (int32 i = 0; i < CountEvents(); i++) {
-		TEvent* event = EventAt(i);
-		if (event != nullptr && event->name != nullptr && strcmp(event->name, name) == 0)
+	const int32 count = CountEvents();
+	void* const* events = static_cast<void* const*>(fEvents->Items());
+	for (int32 i = 0; i < count; i++) {
+		TEvent* event = static_cast<TEvent*>(events[i]);
+		if (event != nullptr && event->name != nullptr && IsSameName(event->name, name))
 			return event;
 	}
 	return nullptr;

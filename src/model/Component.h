@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include <atomic>
+
 #include <List.h>
 
 class BMenuItem;
@@ -207,6 +209,7 @@ private:
 
 	static const size_t kComponentNameSize = 1024;
 	static const size_t kClassNameSize = 32;
+	static const int32 kNoProperty = -1;
 
 	char fComponentName[kComponentNameSize];
 	char fClassName[kClassNameSize];
@@ -219,6 +222,9 @@ private:
 	bool fModified;
 	TPropertyStore* fPropertyStore;
 	bool fDesignerSelected;
+	// The index of the property that FindProperty() found last, while it is known to be the first of its
+	// name. Where the alignment left a gap.
+	mutable std::atomic<int32> fLastFound;
 	BView* fDTView;
 };
 

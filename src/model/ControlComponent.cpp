@@ -10,6 +10,7 @@
 
 #include "model/ColorText.h"
 #include "model/Diagnostics.h"
+#include "model/NameCompare.h"
 #include "model/PropertyStore.h"
 #include "model/PropertyTable.h"
 #include "model/ViewLock.h"
@@ -53,14 +54,14 @@ TControlComponent::GetPropertyValue(const char* name)
 		return TViewComponent::GetPropertyValue(name);
 
 	for (const auto& fallback : kFallbacks) {
-		if (strcmp(name, fallback.name) == 0) {
+		if (IsSameName(name, fallback.name)) {
 			const char* value;
 			return PropertyStore()->FindString(name, &value) == B_OK ? value : fallback.value;
 		}
 	}
 
 	const BControl* control = dynamic_cast<const BControl*>(DTView());
-	if (strcmp(name, "Label") == 0 && control != nullptr)
+	if (IsSameName(name, "Label") && control != nullptr)
 		return control->Label();
 	return TViewComponent::GetPropertyValue(name);
 }
@@ -73,8 +74,8 @@ TControlComponent::SetPropertyValue(const char* name, const char* value)
 	if (name == nullptr || value == nullptr)
 		return;
 
-	if (strcmp(name, "Label") != 0 && strcmp(name, "Enabled") != 0
-		&& strcmp(name, "ViewColor") != 0) {
+	if (!IsSameName(name, "Label") && !IsSameName(name, "Enabled")
+		&& !IsSameName(name, "ViewColor")) {
 		TViewComponent::SetPropertyValue(name, value);
 		return;
 	}
@@ -92,7 +93,7 @@ TControlComponent::ApplyToControl(const char* name, const char* value)
 		return;
 	}
 
-	if (strcmp(name, "ViewColor") == 0) {
+	if (IsSameName(name, "ViewColor")) {
 		rgb_color color = DTView()->ViewColor();
 		DTView()->SetViewColor(StrToRGBColor(value, &color));
 		DTView()->Invalidate();
@@ -102,7 +103,7 @@ TControlComponent::ApplyToControl(const char* name, const char* value)
 	BControl* control = dynamic_cast<BControl*>(DTView());
 	if (control == nullptr)
 		return;
-	if (strcmp(name, "Label") == 0) {
+	if (IsSameName(name, "Label")) {
 		control->SetLabel(value);
 		return;
 	}

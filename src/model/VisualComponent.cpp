@@ -12,6 +12,7 @@
 
 #include "model/ColorText.h"
 #include "model/Diagnostics.h"
+#include "model/NameCompare.h"
 #include "model/PropertyStore.h"
 #include "model/PropertyTable.h"
 #include "model/ViewLock.h"
@@ -58,7 +59,7 @@ static int
 EdgeIndex(const char* name)
 {
 	for (int i = 0; i < 4; i++) {
-		if (name[0] == kEdgeNames[i][0] && strcmp(name, kEdgeNames[i]) == 0)
+		if (IsSameName(name, kEdgeNames[i]))
 			return i;
 	}
 	return -1;
@@ -92,11 +93,11 @@ SetEdge(BView* view, int edge, float position)
 static const BFont*
 FontNamed(const char* name)
 {
-	if (strcmp(name, "be_plain_font") == 0)
+	if (IsSameName(name, "be_plain_font"))
 		return be_plain_font;
-	if (strcmp(name, "be_bold_font") == 0)
+	if (IsSameName(name, "be_bold_font"))
 		return be_bold_font;
-	if (strcmp(name, "be_fixed_font") == 0)
+	if (IsSameName(name, "be_fixed_font"))
 		return be_fixed_font;
 	return nullptr;
 }
@@ -116,13 +117,13 @@ static void
 SetColor(BView* view, const char* name, const char* value)
 {
 	// Channels that the text leaves out stay as they are.
-	if (strcmp(name, "ViewColor") == 0) {
+	if (IsSameName(name, "ViewColor")) {
 		rgb_color color = view->ViewColor();
 		view->SetViewColor(StrToRGBColor(value, &color));
-	} else if (strcmp(name, "HighColor") == 0) {
+	} else if (IsSameName(name, "HighColor")) {
 		rgb_color color = view->HighColor();
 		view->SetHighColor(StrToRGBColor(value, &color));
-	} else if (strcmp(name, "LowColor") == 0) {
+	} else if (IsSameName(name, "LowColor")) {
 		rgb_color color = view->LowColor();
 		view->SetLowColor(StrToRGBColor(value, &color));
 	}
@@ -170,7 +171,7 @@ TVisualComponent::GetPropertyValue(const char* name)
 		return TComponent::GetPropertyValue(name);
 
 	for (const auto& color : kColors) {
-		if (strcmp(name, color.name) == 0) {
+		if (IsSameName(name, color.name)) {
 			const char* value;
 			return PropertyStore()->FindString(name, &value) == B_OK ? value : color.value;
 		}
@@ -218,9 +219,9 @@ TVisualComponent::ApplyToView(const char* name, const char* value)
 	const int edge = EdgeIndex(name);
 	if (edge >= 0)
 		SetEdge(DTView(), edge, strtol(value, nullptr, 10));
-	else if (strcmp(name, "FontSize") == 0)
+	else if (IsSameName(name, "FontSize"))
 		SetFontSize(DTView(), strtol(value, nullptr, 10));
-	else if (strcmp(name, "Font") == 0 && FontNamed(value) != nullptr)
+	else if (IsSameName(name, "Font") && FontNamed(value) != nullptr)
 		DTView()->SetFont(FontNamed(value));
 	else
 		SetColor(DTView(), name, value);

@@ -308,6 +308,30 @@ TEST_F(ComponentTest, APropertyWithoutEditorIsOnlyAppended)
 }
 
 
+TEST_F(ComponentTest, TheFirstOfSeveralPropertiesWithOneNameIsFound)
+{
+	TProperty first(&fComponent, "Twin", "1", nullptr, true);
+	TProperty second(&fComponent, "Twin", "2", nullptr, true);
+	fComponent.AddProperty(&first);
+	EXPECT_EQ(fComponent.FindProperty("Twin"), &first);
+	fComponent.AddProperty(&second);
+	EXPECT_EQ(fComponent.FindProperty("Twin"), &first);
+	EXPECT_EQ(fComponent.FindProperty("twin"), nullptr);
+	EXPECT_EQ(fComponent.FindProperty("Twins"), nullptr);
+	EXPECT_EQ(fComponent.FindProperty("T"), nullptr);
+	EXPECT_EQ(fComponent.FindProperty(""), nullptr);
+
+	EXPECT_TRUE(fComponent.RemoveProperty(&first));
+	EXPECT_EQ(fComponent.FindProperty("Twin"), &second);
+	fComponent.AddProperty(&first);
+	EXPECT_EQ(fComponent.FindProperty("Twin"), &second);
+	EXPECT_EQ(fComponent.RemoveProperty(fComponent.CountProperties() - 2), &second);
+	EXPECT_EQ(fComponent.FindProperty("Twin"), &first);
+	fComponent.ClearProperties(false);
+	EXPECT_EQ(fComponent.FindProperty("Twin"), nullptr);
+}
+
+
 TEST_F(ComponentTest, ANullPropertyIsHarmless)
 {
 	TStringProperty editor(&fComponent, nullptr);
