@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include <stddef.h>
+
 /// An event that the user may ask a handler for.
 ///
 /// The texts are not copied: they are constants of the program, or of the component library that
@@ -15,6 +17,10 @@ struct TEvent {
 		  selected(selected)
 	{
 	}
+
+	/// From the memory that the parts of components share.
+	static void* operator new(size_t size);
+	static void operator delete(void* memory);
 
 	/// For example "OnQuitRequested".
 	const char* name;

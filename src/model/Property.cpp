@@ -5,10 +5,10 @@
 
 #include <cstdio>
 #include <cstring>
-#include <new>
 
 #include <String.h>
 
+#include "model/BlockPool.h"
 #include "model/Component.h"
 #include "props/PropertyWatch.h"
 
@@ -68,14 +68,14 @@ TProperty::~TProperty()
 void*
 TProperty::operator new(size_t size)
 {
-	return ::operator new(size);
+	return TBlockPool::Allocate(size);
 }
 
 
 void
 TProperty::operator delete(void* memory)
 {
-	::operator delete(memory);
+	TBlockPool::Free(memory);
 }
 
 

@@ -32,8 +32,8 @@ public:
 	~TProperty();
 	TProperty& operator=(const TProperty&) = delete;
 
-	/// The class's own pair, so that deleting a derived property through this class does not tell the
-	/// allocator the size of this one.
+	/// From the memory that the parts of components share, which does not ask for the size of what is
+	/// deleted: a derived property may be deleted through this class.
 	static void* operator new(size_t size);
 	static void operator delete(void* memory);
 

@@ -6,6 +6,8 @@
 #include <algorithm>
 #include <cstring>
 
+#include "model/BlockPool.h"
+
 
 TPropertyText::~TPropertyText()
 {
@@ -54,6 +56,12 @@ TPropertyText::Assign(const char* text, size_t length)
 }
 
 
+TRarePropertyText::~TRarePropertyText()
+{
+	TBlockPool::Free(fText);
+}
+
+
 void
 TRarePropertyText::SetTo(const char* text)
 {
@@ -61,9 +69,9 @@ TRarePropertyText::SetTo(const char* text)
 		return;
 
 	const size_t length = strnlen(text, TPropertyText::kSize - 1);
-	char* newText = new char[length + 1];
+	char* newText = static_cast<char*>(TBlockPool::Allocate(length + 1));
 	memcpy(newText, text, length);
 	newText[length] = '\0';
-	delete[] fText;
+	TBlockPool::Free(fText);
 	fText = newText;
 }

@@ -56,7 +56,7 @@ public:
 		: fText(nullptr)
 	{
 	}
-	~TRarePropertyText() { delete[] fText; }
+	~TRarePropertyText();
 	TRarePropertyText(const TRarePropertyText&) = delete;
 	TRarePropertyText& operator=(const TRarePropertyText&) = delete;
 

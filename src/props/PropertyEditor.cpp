@@ -7,6 +7,7 @@
 
 #include <String.h>
 
+#include "model/BlockPool.h"
 #include "model/Component.h"
 #include "model/ComponentOwner.h"
 #include "model/Property.h"
@@ -21,6 +22,20 @@ TPropertyEditor::TPropertyEditor(TComponent* component, TProperty* property, TPr
 
 
 TPropertyEditor::~TPropertyEditor() {}
+
+
+void*
+TPropertyEditor::operator new(size_t size)
+{
+	return TBlockPool::Allocate(size);
+}
+
+
+void
+TPropertyEditor::operator delete(void* memory)
+{
+	TBlockPool::Free(memory);
+}
 
 
 void

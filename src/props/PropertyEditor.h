@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include <stddef.h>
+
 class BString;
 class TComponent;
 class TProperty;
@@ -29,6 +31,10 @@ public:
 	/// may be null: TComponent::AddPropAndEditor() sets it.
 	TPropertyEditor(TComponent* component, TProperty* property, TPropEditType type);
 	virtual ~TPropertyEditor();
+
+	/// From the memory that the parts of components share.
+	static void* operator new(size_t size);
+	static void operator delete(void* memory);
 	TPropertyEditor(const TPropertyEditor&) = delete;
 	TPropertyEditor& operator=(const TPropertyEditor&) = delete;
 
