@@ -19,6 +19,23 @@ public:
 };
 
 
+/// Answers once for each token that the test gives.
+class GatedFilter : public BRefFilter {
+public:
+	~GatedFilter() override { delete_sem(tokens); }
+
+	bool Filter(const entry_ref*, BNode*, struct stat_beos*, const char*) override
+	{
+		asked++;
+		acquire_sem(tokens);
+		return true;
+	}
+
+	const sem_id tokens = create_sem(0, "filter tokens");
+	std::atomic<int32> asked{0};
+};
+
+
 class OpenPanelTest : public FilePanelTest {};
 
 } // namespace
@@ -357,4 +374,40 @@ TEST_F(OpenPanelTest, AFullFolderIsListed)
 	EXPECT_EQ(Selected(), List{"f19999"});
 	fRobot.Key("enter");
 	EXPECT_EQ(PathOf(fTarget->Next(), "refs"), fFolder / "f19999");
+}
+
+
+TEST_F(OpenPanelTest, ItCanBeCancelledWhileItReads)
+{
+	for (int i = 0; i < 100; i++)
+		fFolder.Write(std::to_string(i));
+	GatedFilter filter;
+	Make(B_OPEN_PANEL, 0, true, nullptr, &filter);
+	fPanel->Show();
+	release_sem_etc(filter.tokens, 5, 0);
+	ASSERT_TRUE(WaitUntil([&] { return filter.asked == 6; }));
+	// Its next slice of reading comes after what it was told before.
+	fPanel->Window()->PostMessage(B_QUIT_REQUESTED);
+	snooze(30000);
+	release_sem(filter.tokens);
+	EXPECT_EQ(fTarget->Next().what, uint32(B_CANCEL));
+	EXPECT_FALSE(fPanel->IsShowing());
+	fRobot.Settle();
+	EXPECT_EQ(filter.asked, 6);
+	// Shown again it reads all.
+	release_sem_etc(filter.tokens, 1000, 0);
+	Show();
+	EXPECT_TRUE(WaitUntil([&] { return Rows().size() == 100; }));
+	fPanel.reset();
+}
+
+
+TEST_F(OpenPanelTest, ManyChangesAtOnceAreAllShown)
+{
+	Open();
+	for (int i = 0; i < 3000; i++)
+		fFolder.Write("f" + std::to_string(i));
+	for (int i = 0; i < 3000; i += 2)
+		std::filesystem::remove(fFolder / ("f" + std::to_string(i)));
+	EXPECT_TRUE(WaitUntil([&] { return Rows().size() == 1500 && Rows()[0] == "f1"; }));
 }
