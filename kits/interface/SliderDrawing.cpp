@@ -246,7 +246,12 @@ BSlider::DrawText()
 	const BRect bar = BarFrame();
 	const float line = BPrivate::TextLineHeight(this);
 	if (IsHorizontal()) {
-		DrawTextIn(bounds.top, B_ALIGN_LEFT, Label());
+		const char* update = UpdateText();
+		const float updateWidth = update != NULL ? StringWidth(update) + kTextGap : 0;
+		BString label(Label());
+		// A fraction of a pixel that is missing cuts nothing.
+		TruncateString(&label, B_TRUNCATE_END, std::max(bounds.Width() - updateWidth, 0.0f) + 1);
+		DrawTextIn(bounds.top, B_ALIGN_LEFT, label.String());
 		DrawTextIn(bounds.top, B_ALIGN_RIGHT, UpdateText());
 		DrawTextIn(bar.bottom + kBarMargin, B_ALIGN_LEFT, MinLimitLabel());
 		DrawTextIn(bar.bottom + kBarMargin, B_ALIGN_RIGHT, MaxLimitLabel());

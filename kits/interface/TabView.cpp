@@ -228,9 +228,9 @@ BTabView::AddTab(BView* target, BTab* tab)
 	tab->fTabView = this;
 	tab->fContainerSize = fContainer->Bounds();
 	fTabs.AddItem(tab);
+	TabChanged();
 	if (Window() != NULL && fSelection < 0)
 		Select(0);
-	TabChanged();
 }
 
 
@@ -250,11 +250,11 @@ BTabView::RemoveTab(int32 tabIndex)
 	tab->fTabView = NULL;
 	if (fSelection > tabIndex)
 		fSelection--;
+	TabChanged();
 	if (wasSelected)
 		Select(std::max<int32>(tabIndex - 1, 0));
 	if (hadFocus)
 		SetFocusTab(fSelection, true);
-	TabChanged();
 	return tab;
 }
 
@@ -320,6 +320,7 @@ BTabView::Init(button_width width)
 	fSelection = -1;
 	fFocusTab = -1;
 	fFirstTab = 0;
+	fWidestLabel = 0;
 	fContainer = new BView(BRect(0, 0, 0, 0), "view container", B_FOLLOW_ALL, B_WILL_DRAW);
 	LayOutContainer();
 	AddChild(fContainer);
@@ -330,6 +331,7 @@ BTabView::Init(button_width width)
 void
 BTabView::TabChanged()
 {
+	MeasureLabels();
 	LayOutContainer();
 	fFirstTab = std::clamp<int32>(fFirstTab, 0, LastFirstTab());
 	Redraw();

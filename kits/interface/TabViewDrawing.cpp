@@ -272,14 +272,27 @@ BTabView::DefaultTabHeight() const
 float
 BTabView::WidthOfTab(int32 index) const
 {
-	if (fTabWidth == B_WIDTH_AS_USUAL)
-		return kUsualWidth;
-	if (fTabWidth == B_WIDTH_FROM_LABEL)
-		return std::ceil(StringWidth(TabAt(index)->Label())) + kLabelSpace;
-	float widest = 0;
-	for (int32 i = 0; i < CountTabs(); i++)
-		widest = std::max(widest, StringWidth(TabAt(i)->Label()));
-	return std::ceil(widest) + kLabelSpace;
+	switch (fTabWidth) {
+		case B_WIDTH_FROM_LABEL:
+			return TabAt(index)->fLabelWidth + kLabelSpace;
+		case B_WIDTH_FROM_WIDEST:
+			return fWidestLabel + kLabelSpace;
+		default:
+			return kUsualWidth;
+	}
+}
+
+
+/// The labels' widths are asked for again and again: they are measured once for each change.
+void
+BTabView::MeasureLabels()
+{
+	fWidestLabel = 0;
+	for (int32 i = 0; i < CountTabs(); i++) {
+		BTab* tab = TabAt(i);
+		tab->fLabelWidth = std::ceil(StringWidth(tab->Label()));
+		fWidestLabel = std::max(fWidestLabel, tab->fLabelWidth);
+	}
 }
 
 

@@ -64,6 +64,7 @@ private:
 	BView* fView;
 	BTabView* fTabView;
 	BRect fContainerSize;
+	float fLabelWidth = 0;
 	bool fEnabled;
 	bool fSelected;
 	bool fFocus;
@@ -162,6 +163,7 @@ private:
 	float BorderWidth() const;
 	float DefaultTabHeight() const;
 	float WidthOfTab(int32 index) const;
+	void MeasureLabels();
 	float StripThickness() const;
 	float LengthOfTab(int32 index) const;
 	float LengthOfStrip() const;
@@ -184,6 +186,7 @@ private:
 	int32 fSelection;
 	int32 fFocusTab;
 	int32 fFirstTab;
+	float fWidestLabel;
 };
 
 #endif // _TAB_VIEW_H

@@ -124,6 +124,25 @@ TEST_F(BarDrawingTest, SliderDrawsAsManyHashMarksAsAskedFor)
 }
 
 
+TEST_F(BarDrawingTest, LongSliderLabelEndsBeforeTheUpdateText)
+{
+	class TellingSlider : public BSlider {
+	public:
+		using BSlider::BSlider;
+		const char* UpdateText() const override { return "42"; }
+	};
+	BSlider* slider = Add(new TellingSlider(BRect(10, 10, 109, 60), "slider", "", nullptr, 0, 100));
+	Show();
+	const float text = Ask([=] { return slider->StringWidth("42"); });
+	const BRect end(109 - text - 4, 10, 109, 22);
+	const WindowPicture before = Picture();
+	Do([=] { slider->SetLabel("A label that is much longer than the slider"); });
+	const WindowPicture after = Picture();
+	EXPECT_TRUE(before.SameIn(after, end));
+	EXPECT_FALSE(before.SameIn(after, BRect(10, 10, 60, 22)));
+}
+
+
 TEST_F(BarDrawingTest, FocusIsSeen)
 {
 	BSlider* slider = Add(new BSlider(BRect(10, 10, 226, 40), "slider", nullptr, nullptr, 0, 100));
