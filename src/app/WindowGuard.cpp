@@ -18,10 +18,10 @@ WindowGuard::WindowGuard(BLooper* target, bigtime_t patience)
 	  fLevels(0),
 	  fOuter(sInnermost)
 {
-	BLooper* held = HeldLooper();
-	if (target != nullptr && target != held) {
-		fGivenUp = held;
-		fLevels = GiveUp(held);
+	// Loading a form takes a guard for every property, with the form's window locked all the while.
+	if (target != nullptr && !target->IsLocked()) {
+		fGivenUp = HeldLooper();
+		fLevels = GiveUp(fGivenUp);
 	}
 	if (target != nullptr)
 		fIsLocked = target->LockWithTimeout(patience) == B_OK;
