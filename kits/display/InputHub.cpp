@@ -291,6 +291,9 @@ InputHub::RequestClose(StackedWindow* window)
 	std::lock_guard<std::mutex> lock(fMutex);
 	StackedWindow* blocker = fStack.BlockerOf(window);
 	if (blocker == nullptr) {
+		// A window manager may offer it all the same.
+		if ((window->style.flags & B_NOT_CLOSABLE) != 0)
+			return;
 		auto message = std::make_unique<BMessage>(B_QUIT_REQUESTED);
 		message->AddInt64("when", system_time());
 		window->client->Deliver(std::move(message));

@@ -79,7 +79,8 @@ public:
 	/// Delivers a message that is about one window, such as B_WINDOW_MOVED.
 	void Deliver(StackedWindow* window, std::unique_ptr<BMessage> message);
 	void NeedsRedraw(StackedWindow* window);
-	/// The close button: B_QUIT_REQUESTED, or the modal window that blocks it comes to the front.
+	/// The close button: B_QUIT_REQUESTED, or the modal window that blocks it comes to the front. Nothing
+	/// for a window that has no such button.
 	void RequestClose(StackedWindow* window);
 
 	/// \a under: the window under the pointer if the host knows it.

@@ -4,6 +4,10 @@
 //
 //   window TITLE LEFT TOP DRAGS FILE   shows a window of 150 by 150 pixels; a press in it drags what DRAGS
 //                                      names: nothing, rect, bitmap or the FILE (refs)
+//   special TITLE LEFT TOP LOOK FEEL FLAGS
+//                                      the same with these numbers of Window.h
+//   limits TITLE LEAST MOST            of width and height
+//   behind TITLE OTHER                 sends a window behind another one
 //   put TYPE FILE, put-number NAME N   adds a field to what commit puts on the clipboard
 //   commit                             empties the clipboard and puts that there
 //   get, get TYPE FILE                 prints the names of what is on the clipboard, and sizes; writes one
@@ -12,6 +16,7 @@
 #include <fstream>
 #include <iostream>
 #include <iterator>
+#include <map>
 #include <sstream>
 #include <string>
 
@@ -139,6 +144,38 @@ private:
 };
 
 
+/// Prints what its hooks are told.
+class ExchangeWindow : public BWindow {
+public:
+	ExchangeWindow(BRect frame, const char* title, window_look look, window_feel feel, uint32 flags)
+		: BWindow(frame, title, look, feel, flags)
+	{
+	}
+
+	void Minimize(bool minimize) override
+	{
+		Say(minimize ? "minimized" : "restored");
+		BWindow::Minimize(minimize);
+	}
+
+	void FrameMoved(BPoint where) override { Say("moved " + PointText(where)); }
+
+	void FrameResized(float width, float height) override
+	{
+		Say("resized " + PointText(BPoint(width, height)));
+	}
+
+	bool QuitRequested() override
+	{
+		Say("closed");
+		return true;
+	}
+
+private:
+	void Say(const std::string& what) { Print(std::string(Title()) + " " + what); }
+};
+
+
 std::string
 ContentOf(const std::string& path)
 {
@@ -167,6 +204,12 @@ private:
 		std::string name, value;
 		if (command == "window")
 			OpenWindow(words);
+		else if (command == "special")
+			OpenSpecial(words);
+		else if (command == "limits")
+			SetLimits(words);
+		else if (command == "behind")
+			SendBehind(words);
 		else if (command == "put") {
 			words >> name >> value;
 			std::string bytes = ContentOf(value);
@@ -188,11 +231,51 @@ private:
 		std::string title, drags, file;
 		float left, top;
 		words >> title >> left >> top >> drags >> file;
+		Show(title, BPoint(left, top), B_TITLED_WINDOW_LOOK, B_NORMAL_WINDOW_FEEL, 0, drags, file);
+	}
+
+	void OpenSpecial(std::istringstream& words)
+	{
+		std::string title;
+		float left, top;
+		uint32 look, feel, flags;
+		words >> title >> left >> top >> look >> feel >> flags;
+		Show(title, BPoint(left, top), static_cast<window_look>(look),
+			static_cast<window_feel>(feel), flags, "nothing", "");
+	}
+
+	void Show(const std::string& title, BPoint leftTop, window_look look, window_feel feel,
+		uint32 flags, const std::string& drags, const std::string& file)
+	{
 		auto window =
-			new BWindow(BRect(left, top, left + 149, top + 149), title.c_str(), B_TITLED_WINDOW, 0);
+			new ExchangeWindow(BRect(leftTop, BSize(149, 149)), title.c_str(), look, feel, flags);
 		window->AddChild(new ExchangeView(window->Bounds(), drags, file));
+		fWindows[title] = window;
 		window->Show();
 		Print("opened " + title);
+	}
+
+	void SetLimits(std::istringstream& words)
+	{
+		std::string title;
+		float least, most;
+		words >> title >> least >> most;
+		BWindow* window = fWindows[title];
+		window->Lock();
+		window->SetSizeLimits(least, most, least, most);
+		window->Unlock();
+		Print("limited " + title);
+	}
+
+	void SendBehind(std::istringstream& words)
+	{
+		std::string title, other;
+		words >> title >> other;
+		BWindow* window = fWindows[title];
+		window->Lock();
+		window->SendBehind(fWindows[other]);
+		window->Unlock();
+		Print("sent " + title);
 	}
 
 	void Commit()
@@ -228,6 +311,8 @@ private:
 	}
 
 	BMessage fToPut;
+	// By their titles; the tests name none that they have closed.
+	std::map<std::string, BWindow*> fWindows;
 };
 
 

@@ -335,6 +335,15 @@ TEST_F(InputHubTest, TheCloseButtonOfABlockedWindowBringsTheModalOne)
 }
 
 
+TEST_F(InputHubTest, AWindowThatIsNotClosableIsNotClosed)
+{
+	TestWindow window(fHub, BRect(0, 0, 99, 99), B_NORMAL_WINDOW_FEEL, B_NOT_CLOSABLE);
+	window.client.Codes();
+	fHub.RequestClose(&window.stacked);
+	EXPECT_EQ(window.client.Codes(), "");
+}
+
+
 TEST_F(InputHubTest, AnActivatedWindowThatAvoidsTheFrontStaysWhereItIs)
 {
 	TestWindow lower(fHub, BRect(0, 0, 99, 99), B_NORMAL_WINDOW_FEEL, B_AVOID_FRONT);
