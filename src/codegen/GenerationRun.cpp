@@ -14,7 +14,6 @@
 #include "codegen/ProjectCheck.h"
 #include "codegen/SourceFiles.h"
 #include "codegen/UnifiedDiff.h"
-#include "designer/DocumentFile.h"
 #include "designer/LoadReport.h"
 #include "model/AppComponent.h"
 #include "model/Property.h"
@@ -118,14 +117,13 @@ TGenerationRun::LoadProject()
 	const char* path = fOptions.project.String();
 	TLoadReport report;
 	if (!fProject->LoadFromFile(path, &report)) {
+		if (fProject->OpenStatus() == B_MISMATCHED_VALUES) {
+			TellProblem(path, "this is a form and no project; name the project file (.plim)");
+			return GENERATION_FILE_BAD;
+		}
 		BString text("the project cannot be read (");
 		text << strerror(fProject->OpenStatus()) << "); name a project file (.plim)";
 		TellProblem(path, text.String());
-		return GENERATION_FILE_BAD;
-	}
-	// A form is a document, too, and would make a project without anything in it.
-	if (TPLIMFile(nullptr, path).HasMessage("_FormProperties")) {
-		TellProblem(path, "this is a form and no project; name the project file (.plim)");
 		return GENERATION_FILE_BAD;
 	}
 
