@@ -353,22 +353,27 @@ PanelWindow::SetOrder(const BMessage& message)
 }
 
 
-/// Enter means what the focus is about, before the default button gets it. True when it is done.
+/// Enter means what the focus is about, before the default button gets it; Escape first takes back a path that is
+/// being typed. True when it is done.
 bool
 PanelWindow::HandleKey(const BMessage& message)
 {
 	const uint32 kHeldModifiers = B_SHIFT_KEY | B_COMMAND_KEY | B_CONTROL_KEY | B_OPTION_KEY;
-	if (message.GetInt32("raw_char", 0) != B_ENTER
-		|| (message.GetInt32("modifiers", 0) & kHeldModifiers) != 0)
+	const int32 key = message.GetInt32("raw_char", 0);
+	if ((message.GetInt32("modifiers", 0) & kHeldModifiers) != 0)
 		return false;
 
-	if (CurrentFocus() == fPath->TextView()) {
+	const bool isInPath = CurrentFocus() == fPath->TextView();
+	if (key == B_ESCAPE && isInPath && fPath->Text() != DisplayName(fShownFolder)) {
+		UpdateFolder();
+		fList->MakeFocus(true);
+		return true;
+	}
+	if (key == B_ENTER && isInPath) {
 		GoToTypedPath();
 		return true;
 	}
-	if (CurrentFocus() == fList && EnterSelected(false))
-		return true;
-	return false;
+	return key == B_ENTER && CurrentFocus() == fList && EnterSelected(false);
 }
 
 

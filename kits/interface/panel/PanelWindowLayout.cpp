@@ -165,7 +165,8 @@ PanelWindow::LayOut()
 	float statusHeight;
 	fStatus->GetPreferredSize(NULL, &statusHeight);
 	const float statusLeft = fHiddenBox->Frame().right + 2 * kGap;
-	fStatus->ResizeTo(fCancelButton->Frame().left - kGap - statusLeft, statusHeight);
+	fStatus->ResizeTo(
+		std::max(0.0f, fCancelButton->Frame().left - kGap - statusLeft), statusHeight);
 	centre(fStatus, statusLeft, middle);
 
 	float bottom = bounds.bottom - kMargin - rowHeight - kGap;

@@ -338,6 +338,19 @@ TEST_F(FilePanelTest, ATypedPathThatLeadsNowhereIsExplained)
 }
 
 
+TEST_F(FilePanelTest, EscapeTakesBackATypedPathBeforeItCancels)
+{
+	Open();
+	fRobot.Key("command+l");
+	fRobot.Type("/no/such");
+	fRobot.Key("escape");
+	EXPECT_EQ(fRobot.Text("path"), fFolder.Path());
+	EXPECT_TRUE(fPanel->IsShowing());
+	fRobot.Key("escape");
+	EXPECT_EQ(fTarget->Next().what, uint32(B_CANCEL));
+}
+
+
 TEST_F(FilePanelTest, AFolderIsMadeAndSelected)
 {
 	fFolder.Make("New folder");
