@@ -74,7 +74,7 @@ Report(const char* format, ...)
 bool
 IsRunningWindow(const LooperPort* port)
 {
-	return port->IsRunning() && port->Kind() != kPlainLooper
+	return port->IsRunning() && port->Window() != nullptr && port->Kind() != kPlainLooper
 		&& port->Kind() != kOffscreenWindowLooper;
 }
 
@@ -91,7 +91,8 @@ LockCheckerIsOn()
 void
 CheckTaken(const LooperPort* taken, const LooperPort* held)
 {
-	if (!IsRunningWindow(taken))
+	// The window of an open menu may be taken last: its threads wait for no other.
+	if (!IsRunningWindow(taken) || taken->Kind() == kMenuWindowLooper)
 		return;
 
 	for (; held != nullptr; held = held->OlderHeld()) {

@@ -4,7 +4,7 @@
 // BE_CHECK_LOCKS=1 reports to standard error, with a stack trace, each thread that takes the lock of a second running
 // window, or waits for a reply while it holds the lock of a running looper other than its own thread's.
 // BE_CHECK_LOCKS=abort also ends the program there. A window that does not run yet is its creator's alone and does not
-// count.
+// count, nor does one of an open menu that is taken last.
 
 #ifndef _LOCK_CHECKER_H
 #define _LOCK_CHECKER_H

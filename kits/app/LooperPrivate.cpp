@@ -30,6 +30,23 @@ LooperAccess::Window(BLooper* looper)
 }
 
 
+std::vector<BMessenger>
+LooperAccess::LoopersOfKind(looper_kind kind, bigtime_t timeout)
+{
+	std::vector<BMessenger> loopers;
+	for (const std::shared_ptr<LooperPort>& port : Registry::Default().Loopers()) {
+		if (port->Kind() != kind || !port->IsRunning())
+			continue;
+		// It may go at any moment: only its port tells whether it is still there.
+		if (port->Lock(timeout) != B_OK)
+			continue;
+		loopers.emplace_back(nullptr, port->Looper());
+		port->Unlock();
+	}
+	return loopers;
+}
+
+
 int32
 LooperAccess::UnlockFully(BLooper* looper)
 {

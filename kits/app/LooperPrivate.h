@@ -4,7 +4,10 @@
 #ifndef _LOOPER_PRIVATE_H
 #define _LOOPER_PRIVATE_H
 
+#include <vector>
+
 #include <Looper.h>
+#include <Messenger.h>
 
 namespace BPrivate {
 
@@ -35,6 +38,10 @@ struct LooperAccess {
 	/// Queues \a message, which the looper owns from here on, for the handler with \a token (kNoToken: the looper,
 	/// kPreferredToken). Spares the copy that PostMessage() makes. B_BAD_PORT_ID, message deleted, when it is gone.
 	static status_t PostOwned(port_id port, int32 token, BMessage* message);
+
+	/// The running loopers of \a kind, the oldest first. Locks each for a moment, and leaves out those
+	/// that stay locked for \a timeout microseconds.
+	static std::vector<BMessenger> LoopersOfKind(looper_kind kind, bigtime_t timeout);
 
 	/// The looper's port, which outlives it: for threads that must not touch the looper itself.
 	static port_id Port(const BLooper* looper);
