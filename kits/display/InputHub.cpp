@@ -408,6 +408,9 @@ InputHub::Moved(StackedWindow* under)
 		LeaveWindow(fDrag != nullptr || fGrabber == nullptr ? under : fGrabber);
 	if (target != nullptr)
 		SendMove(target);
+	StackedWindow* menu = OpenMenu();
+	if (menu != nullptr && menu != target)
+		SendMove(menu);
 	if (fDrag != nullptr && under != nullptr && under != target)
 		SendMove(under);
 }
@@ -453,6 +456,9 @@ InputHub::Released(StackedWindow* under)
 		fPressWindow = nullptr;
 	if (target != nullptr)
 		target->client->Deliver(MakePointerMessage(B_MOUSE_UP, target));
+	StackedWindow* menu = OpenMenu();
+	if (menu != nullptr && menu != target)
+		menu->client->Deliver(MakePointerMessage(B_MOUSE_UP, menu));
 	if (fButtons != 0)
 		return;
 
@@ -466,6 +472,14 @@ InputHub::Released(StackedWindow* under)
 		LeaveWindow(under);
 		SendMove(under);
 	}
+}
+
+
+// The window of the press goes on getting the press's moves and its release; a menu that opened since follows them too.
+StackedWindow*
+InputHub::OpenMenu() const
+{
+	return fGrabber != nullptr && fGrabber->style.isMenu ? fGrabber : nullptr;
 }
 
 

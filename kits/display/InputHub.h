@@ -131,6 +131,8 @@ private:
 
 	StackedWindow* Under(std::optional<StackedWindow*> known) const;
 	StackedWindow* KeyTarget() const;
+	/// The menu's window that has grabbed the input, null for none.
+	StackedWindow* OpenMenu() const;
 	void Moved(StackedWindow* under);
 	void Pressed(StackedWindow* under, bool isFirst);
 	void Released(StackedWindow* under);

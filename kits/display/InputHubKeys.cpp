@@ -11,6 +11,9 @@ namespace BPrivate {
 StackedWindow*
 InputHub::KeyTarget() const
 {
+	// A menu's window is never active, and takes the keys all the same while it is open.
+	if (OpenMenu() != nullptr)
+		return OpenMenu();
 	StackedWindow* target = fActive != nullptr ? fActive : fStack.TopFocus();
 	if (target == nullptr || fStack.BlockerOf(target) != nullptr)
 		return nullptr;

@@ -2,6 +2,7 @@
 // A host window as the kits see it: each call is carried to the display thread.
 #include "display/qt/QtHostWindow.h"
 
+#include <QGuiApplication>
 #include <QString>
 
 #include <Region.h>
@@ -254,6 +255,9 @@ void
 QtHostWindow::SetPointerGrab(bool grab)
 {
 	fDisplay.Hub().SetGrab(&fStacked, grab);
+	// Elsewhere there is nothing to grab, or no way to.
+	if (QGuiApplication::platformName() != QLatin1String("xcb"))
+		return;
 	WithWindow([&](QtWindow& window) { window.setMouseGrabEnabled(grab); });
 }
 
