@@ -9,6 +9,7 @@
 #include <Autolock.h>
 #include <Bitmap.h>
 #include <Button.h>
+#include <MenuBar.h>
 #include <Message.h>
 #include <MessageRunner.h>
 #include <OS.h>
@@ -243,7 +244,7 @@ BWindow::ViewDetached(BView* view)
 	}
 	if (fData->DefaultButtonView() == view)
 		SetDefaultButton(nullptr);
-	if (static_cast<void*>(fData->keyMenuBar) == static_cast<void*>(view))
+	if (fData->keyMenuBar == view)
 		SetKeyMenuBar(nullptr);
 }
 

@@ -8,6 +8,7 @@
 
 #include <Application.h>
 #include <Button.h>
+#include <MenuBar.h>
 #include <MessageQueue.h>
 #include <MessageRunner.h>
 #include <Messenger.h>
@@ -17,6 +18,7 @@
 #include "app/MessagePrivate.h"
 #include "display/Canvas.h"
 #include "display/HostWindow.h"
+#include "interface/MenuTracker.h"
 #include "interface/WindowClient.h"
 #include "interface/WindowPrivate.h"
 
@@ -154,6 +156,10 @@ WindowData::DispatchWindowMessage(BMessage* message, BHandler* handler)
 			// The new frame of the host's own button comes by messages.
 			if (!message->GetBool(kFromHost, false))
 				window->Zoom();
+			return true;
+
+		case _MENUS_DONE_:
+			window->MenusEnded();
 			return true;
 
 		case kMsgCanvasOutdated:
@@ -295,6 +301,8 @@ WindowData::Activated(bool nowActive)
 		return;
 
 	active = nowActive;
+	if (!active && openBar != nullptr)
+		MenuTracker::End(menuTracker);
 	window->WindowActivated(active);
 	auto tell = [&](auto& self, BView* view) -> void {
 		view->WindowActivated(active);
@@ -336,8 +344,7 @@ WindowData::DefaultButtonView() const
 void
 WindowData::OpenKeyMenuBar()
 {
-	BView* bar = reinterpret_cast<BView*>(keyMenuBar);
-	window->PostMessage(kMsgOpenMenuBar, bar);
+	window->PostMessage(kMsgOpenMenuBar, keyMenuBar);
 }
 
 

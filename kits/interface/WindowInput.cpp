@@ -122,6 +122,9 @@ BHandler*
 WindowInput::TargetFor(BMessage* message, BHandler* target)
 {
 	fOthers.clear();
+	// A menu's window hands on all input, also that where it has no view.
+	if (LooperAccess::Kind(fWindow) == kMenuWindowLooper)
+		return target;
 	if (message->WasDropped() && target == fWindow) {
 		BView* view = ViewAt(fWindow->ConvertFromScreen(message->DropPoint()));
 		return view != nullptr ? view : target;
@@ -129,11 +132,31 @@ WindowInput::TargetFor(BMessage* message, BHandler* target)
 	// What the program posts itself, and what another window forwards, names its view.
 	if (target != fWindow)
 		return target;
+	if (fWindow->fData->openBar != nullptr && HandToMenus(message))
+		return nullptr;
 	if (IsMouseMessage(message->what))
 		return MouseTarget(message);
 	if (IsKeyMessage(message->what))
 		return KeyTarget(message);
 	return target;
+}
+
+
+// While the user chooses from the menu bar the views get none of the pointer, nor keys that are pressed.
+bool
+WindowInput::HandToMenus(BMessage* message)
+{
+	bool isKey = message->what == B_KEY_DOWN || message->what == B_UNMAPPED_KEY_DOWN;
+	if (!isKey && !IsMouseMessage(message->what))
+		return false;
+	const BMessenger& tracker = fWindow->fData->menuTracker;
+	if (!tracker.IsValid())
+		return false;
+
+	tracker.SendMessage(message);
+	if (message->what == B_MOUSE_UP && message->GetInt32("buttons", 0) == 0)
+		ButtonsReleased();
+	return true;
 }
 
 

@@ -57,6 +57,7 @@ private:
 		int32 transit;
 	};
 
+	bool HandToMenus(BMessage* message);
 	BHandler* MouseTarget(BMessage* message);
 	bool TakeMouseMessage(BView* view, BPoint* where, uint32* buttons);
 	BHandler* KeyTarget(BMessage* message);

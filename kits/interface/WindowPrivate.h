@@ -7,12 +7,14 @@
 #include <string>
 #include <vector>
 
+#include <Messenger.h>
 #include <Window.h>
 
 #include "interface/ShortcutTable.h"
 #include "interface/WindowInput.h"
 #include "interface/WindowPainter.h"
 
+class BMenu;
 class BMessageRunner;
 
 namespace BPrivate {
@@ -93,6 +95,9 @@ public:
 	BView* focus = nullptr;
 	BButton* defaultButton = nullptr;
 	BMenuBar* keyMenuBar = nullptr;
+	/// The bar that the user chooses from now, and who gets the window's input meanwhile.
+	const BMenu* openBar = nullptr;
+	BMessenger menuTracker;
 
 	ShortcutTable shortcuts;
 	WindowInput input;

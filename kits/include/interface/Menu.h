@@ -99,7 +99,7 @@ public:
 	/// The first one with this code or label; submenus are searched too. Null for none.
 	BMenuItem* FindItem(uint32 command) const;
 	BMenuItem* FindItem(const char* name) const;
-	/// Sorts as qsort() does with the items of pointers compared by \a compare; stable.
+	/// \a compare: negative when the first goes before the second. Equal ones keep their order.
 	void SortItems(int (*compare)(const BMenuItem*, const BMenuItem*));
 	bool SwapItems(int32 indexA, int32 indexB);
 	bool MoveItem(int32 indexFrom, int32 indexTo);

@@ -14,7 +14,7 @@ enum menu_bar_border {
 /// A menu that is always there: a row, seldom a column, of items that mostly lead to menus.
 ///
 /// When it is attached it takes the height of its font and, with resizeToFit, the width of its window,
-/// and becomes the window's key menu bar unless that has one. Its items' shortcuts work in the window.
+/// and becomes the window's key menu bar. Its items' shortcuts work in the window.
 class BMenuBar : public BMenu {
 public:
 	BMenuBar(BRect frame, const char* name,
@@ -62,7 +62,6 @@ private:
 	friend class BMenuField;
 
 	menu_bar_border fBorder;
-	bool fResizeToFit;
 };
 
 #endif // _MENU_BAR_H
