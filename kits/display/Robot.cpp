@@ -226,6 +226,9 @@ Robot::SettleOnce()
 		if (isRunning && !Ping(messenger, kBusyTime))
 			settled = false;
 	}
+	// What follows an open menu counts too: it opens and closes the menus' windows.
+	for (const BMessenger& menu : LooperAccess::LoopersOfKind(kMenuWindowLooper, kBusyTime))
+		settled = Ping(menu, kBusyTime) && settled;
 	return settled;
 }
 

@@ -32,7 +32,8 @@ public:
 	void SetLimit(bigtime_t limit) { fLimit = limit; }
 
 	// Windows. B_TIMED_OUT when it did not come, or go, in time.
-	/// The shown window with this title; the last word may be cut short with "*".
+	/// The shown window with this title; the last word may be cut short with "*". An open menu is a
+	/// window too, with the menu's name for its title.
 	status_t WaitForWindow(const char* title, BMessenger* window);
 	status_t WaitForNoWindow(const char* title);
 	std::vector<BString> WindowTitles();
@@ -46,6 +47,8 @@ public:
 	status_t GetWindowFrame(const BMessenger& window, BRect* frame);
 	/// The visible part of the view.
 	status_t GetViewFrame(const BMessenger& window, const char* view, BRect* frame);
+	/// Of the item with this label in an open menu, the last opened first, or in a menu bar; waits for it.
+	status_t GetItemFrame(const char* label, BRect* frame);
 
 	// Pointer; screen coordinates
 	void MoveTo(BPoint where);
@@ -56,6 +59,7 @@ public:
 	void Drag(BPoint from, BPoint to, int32 steps = 8);
 	void Wheel(float deltaX, float deltaY);
 	status_t ClickView(const BMessenger& window, const char* view, int32 count = 1);
+	status_t ClickItem(const char* label);
 
 	// Keys; to the active window
 	void Type(const char* text);

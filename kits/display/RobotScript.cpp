@@ -134,6 +134,7 @@ private:
 	status_t DoubleClick(const Arguments& arguments);
 	status_t ClickView(const Arguments& arguments);
 	status_t DoubleClickView(const Arguments& arguments);
+	status_t ClickItem(const Arguments& arguments);
 	status_t Move(const Arguments& arguments);
 	status_t Press(const Arguments& arguments);
 	status_t Release(const Arguments& arguments);
@@ -170,6 +171,7 @@ const ScriptRunner::Command ScriptRunner::kCommands[] = {
 	{"double-click", 2, 2, &ScriptRunner::DoubleClick},
 	{"click-view", 1, 1, &ScriptRunner::ClickView},
 	{"double-click-view", 1, 1, &ScriptRunner::DoubleClickView},
+	{"click-item", 1, 1, &ScriptRunner::ClickItem},
 	{"move", 2, 2, &ScriptRunner::Move},
 	{"press", 0, 1, &ScriptRunner::Press},
 	{"release", 0, 0, &ScriptRunner::Release},
@@ -355,6 +357,16 @@ status_t
 ScriptRunner::DoubleClickView(const Arguments& arguments)
 {
 	return ViewDoesNot(arguments, fRobot.ClickView(fWindow, arguments[0].c_str(), 2));
+}
+
+
+status_t
+ScriptRunner::ClickItem(const Arguments& arguments)
+{
+	status_t status = fRobot.ClickItem(arguments[0].c_str());
+	if (status == B_NAME_NOT_FOUND)
+		fFound = "no open menu and no menu bar has an item \"" + arguments[0] + "\"";
+	return status;
 }
 
 

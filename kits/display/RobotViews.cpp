@@ -1,9 +1,12 @@
 // SPDX-License-Identifier: MIT
 // The robot's eyes: windows and views by name, their texts and pictures.
+#include <cmath>
 #include <cstring>
 
 #include <Application.h>
 #include <Control.h>
+#include <Menu.h>
+#include <MenuItem.h>
 #include <OS.h>
 #include <StringView.h>
 #include <TextControl.h>
@@ -11,6 +14,7 @@
 #include <View.h>
 #include <Window.h>
 
+#include "app/LooperPrivate.h"
 #include "display/Display.h"
 #include "display/HostWindow.h"
 #include "display/Robot.h"
@@ -70,6 +74,26 @@ VisiblePart(BView* view)
 }
 
 
+/// The same for the windows of open menus, the last one first.
+bool
+ForEachMenuWindow(const std::function<bool(BWindow*)>& task)
+{
+	std::vector<BMessenger> menus = LooperAccess::LoopersOfKind(kMenuWindowLooper, kLockTime);
+	for (auto menu = menus.rbegin(); menu != menus.rend(); ++menu) {
+		if (menu->LockTargetWithTimeout(kLockTime) != B_OK)
+			continue;
+		BLooper* looper;
+		menu->Target(&looper);
+		auto window = dynamic_cast<BWindow*>(looper);
+		bool isDone = window != nullptr && !window->IsHidden() && task(window);
+		looper->Unlock();
+		if (isDone)
+			return true;
+	}
+	return false;
+}
+
+
 /// Calls \a task, window locked, for each window until it returns true. Busy ones are left out.
 bool
 ForEachWindow(const std::function<bool(BWindow*)>& task)
@@ -81,6 +105,26 @@ ForEachWindow(const std::function<bool(BWindow*)>& task)
 		bool isDone = task(window);
 		window->Unlock();
 		if (isDone)
+			return true;
+	}
+	return ForEachMenuWindow(task);
+}
+
+
+/// The item's frame on the screen, as far as the view's menus are in its window.
+bool
+FindItem(BView* view, const char* label, BRect* frame)
+{
+	auto menu = dynamic_cast<BMenu*>(view);
+	for (int32 i = 0; menu != nullptr && !menu->IsHidden() && i < menu->CountItems(); i++) {
+		BMenuItem* item = menu->ItemAt(i);
+		if (strcmp(item->Label(), label) != 0)
+			continue;
+		*frame = menu->ConvertToScreen(item->Frame());
+		return true;
+	}
+	for (int32 i = 0; i < view->CountChildren(); i++) {
+		if (FindItem(view->ChildAt(i), label, frame))
 			return true;
 	}
 	return false;
@@ -162,6 +206,40 @@ Robot::WindowTitles()
 		return false;
 	});
 	return titles;
+}
+
+
+status_t
+Robot::GetItemFrame(const char* label, BRect* frame)
+{
+	auto find = [&](BWindow* window) {
+		for (int32 i = 0; !window->IsHidden() && i < window->CountChildren(); i++) {
+			if (FindItem(window->ChildAt(i), label, frame))
+				return true;
+		}
+		return false;
+	};
+	bigtime_t end = system_time() + fLimit;
+	do {
+		// The open menus are above the bars.
+		if (ForEachMenuWindow(find) || ForEachWindow(find))
+			return B_OK;
+		Pause(kRetryTime);
+	} while (system_time() < end);
+	return B_NAME_NOT_FOUND;
+}
+
+
+status_t
+Robot::ClickItem(const char* label)
+{
+	BRect frame;
+	status_t status = GetItemFrame(label, &frame);
+	if (status != B_OK)
+		return status;
+	Click(BPoint(
+		std::floor((frame.left + frame.right) / 2), std::floor((frame.top + frame.bottom) / 2)));
+	return B_OK;
 }
 
 

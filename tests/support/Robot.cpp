@@ -2,12 +2,22 @@
 // Uses the test's windows like a person, and reads back what they show.
 #include "support/Robot.h"
 
+#include <algorithm>
+
 #include <String.h>
 #include <Window.h>
 
 #include "display/Display.h"
 #include "display/KeyMap.h"
 #include "display/Robot.h"
+
+namespace {
+
+// How long a window may be busy before it is not asked any more.
+const bigtime_t kBusyTime = 300000;
+
+} // namespace
+
 
 rgb_color
 WindowPicture::At(int32 x, int32 y) const
@@ -97,9 +107,17 @@ Robot::WaitForNoWindow(const char* title)
 BPoint
 Robot::OnScreen(BPoint where)
 {
-	BRect frame(0, 0, 0, 0);
-	fRobot->GetWindowFrame(fWindow, &frame);
-	return where + frame.LeftTop();
+	// A window whose thread waits for a menu cannot be asked: it stands where it stood.
+	const bigtime_t limit = fRobot->Limit();
+	if (fKnownWindow == fWindow)
+		fRobot->SetLimit(std::min<bigtime_t>(limit, kBusyTime));
+	BRect frame;
+	if (fRobot->GetWindowFrame(fWindow, &frame) == B_OK) {
+		fKnownWindow = fWindow;
+		fKnownPlace = frame.LeftTop();
+	}
+	fRobot->SetLimit(limit);
+	return where + fKnownPlace;
 }
 
 
@@ -168,6 +186,26 @@ bool
 Robot::ClickView(const char* view, int32 count)
 {
 	return fRobot->ClickView(fWindow, view, count) == B_OK;
+}
+
+
+bool
+Robot::ClickItem(const char* label)
+{
+	return fRobot->ClickItem(label) == B_OK;
+}
+
+
+bool
+Robot::FindItem(const char* label, BPoint* middle)
+{
+	BRect frame;
+	if (fRobot->GetItemFrame(label, &frame) != B_OK)
+		return false;
+	*middle = BPoint(static_cast<int32>(frame.left + frame.right) / 2,
+				  static_cast<int32>(frame.top + frame.bottom) / 2)
+		- OnScreen(B_ORIGIN);
+	return true;
 }
 
 

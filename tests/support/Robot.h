@@ -51,6 +51,8 @@ public:
 	/// The shown window with this title ("Untitled*": that begins so) becomes the one to work on.
 	bool WaitForWindow(const char* title);
 	bool WaitForNoWindow(const char* title);
+	/// The window to work on from here on.
+	void SetWindow(const BMessenger& window) { fWindow = window; }
 	const BMessenger& Window() const { return fWindow; }
 
 	void MoveTo(BPoint where);
@@ -63,6 +65,10 @@ public:
 	void Hold(uint32 modifiers);
 	/// A view's name, or the label of a control.
 	bool ClickView(const char* view, int32 count = 1);
+	/// In an open menu or a menu bar; waits for it.
+	bool ClickItem(const char* label);
+	/// The item's middle, in the coordinates of the window that is worked on.
+	bool FindItem(const char* label, BPoint* middle);
 	/// The middle of the view's visible part; false when there is none.
 	bool FindView(const char* view, BPoint* middle);
 
@@ -85,6 +91,9 @@ private:
 	std::unique_ptr<BPrivate::Robot> fRobot;
 	BMessenger fWindow;
 	uint32 fHeld = 0;
+	// The window whose place was asked for last, and its left-top on the screen.
+	BMessenger fKnownWindow;
+	BPoint fKnownPlace;
 };
 
 #endif // TESTS_SUPPORT_ROBOT_H
