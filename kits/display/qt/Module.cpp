@@ -2,6 +2,7 @@
 // The entry points of the display module.
 #include <cstdio>
 #include <cstring>
+#include <memory>
 #include <string>
 
 #include <QMessageLogContext>
@@ -50,13 +51,13 @@ be_display_start(const char** reason)
 		return nullptr;
 
 	qInstallMessageHandler(HandleQtMessage);
-	// Never deleted: the program's threads may call it until the very end.
-	auto display = new QtDisplay(!BPrivate::HasWindowManager(platforms));
-	sDisplay = display;
+	auto display = std::make_unique<QtDisplay>(!BPrivate::HasWindowManager(platforms));
+	sDisplay = display.get();
 	bool isConnected = display->Start(platforms);
 	BPrivate::PlatformsConnected();
+	// Never deleted then: the program's threads may call it until the very end.
 	if (isConnected)
-		return display;
+		return display.release();
 
 	sDisplay = nullptr;
 	sReason = "Qt has no platform \"" + platforms + "\"";
