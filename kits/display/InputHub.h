@@ -106,9 +106,8 @@ public:
 
 	void BeginTracking(BRect rect, uint32 style);
 	void EndTracking();
-	/// \a shownByHost: the overlay leaves it out.
-	void BeginDrag(const BMessage& message, BRect rect, std::shared_ptr<const Picture> image,
-		BPoint offset, bool shownByHost = false);
+	void BeginDrag(
+		const BMessage& message, BRect rect, std::shared_ptr<const Picture> image, BPoint offset);
 	bool IsDragging() const;
 	/// Nothing is dropped.
 	void CancelDrag();
@@ -120,7 +119,6 @@ private:
 		std::shared_ptr<const Picture> image;
 		BRect rect;
 		BPoint offset;
-		bool shownByHost;
 	};
 
 	struct TrackingState {

@@ -28,12 +28,11 @@ InputHub::EndTracking()
 
 
 void
-InputHub::BeginDrag(const BMessage& message, BRect rect, std::shared_ptr<const Picture> image,
-	BPoint offset, bool shownByHost)
+InputHub::BeginDrag(
+	const BMessage& message, BRect rect, std::shared_ptr<const Picture> image, BPoint offset)
 {
 	std::lock_guard<std::mutex> lock(fMutex);
-	fDrag = std::make_unique<DragState>(
-		DragState{message, std::move(image), rect, offset, shownByHost});
+	fDrag = std::make_unique<DragState>(DragState{message, std::move(image), rect, offset});
 	if (!fDrag->message.HasInt32("buttons"))
 		fDrag->message.AddInt32("buttons", static_cast<int32>(fButtons));
 	if (fButtons == 0) {
@@ -57,7 +56,7 @@ InputHub::Overlay() const
 		else
 			overlay.tracking.OffsetBy(moved);
 	}
-	if (fDrag != nullptr && !fDrag->shownByHost) {
+	if (fDrag != nullptr) {
 		overlay.image = fDrag->image;
 		overlay.dragged = fDrag->rect;
 		overlay.dragged.OffsetTo(fWhere - fDrag->offset);

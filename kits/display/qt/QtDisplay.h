@@ -90,7 +90,7 @@ public:
 	QWindow* WindowForTransients(const QtWindow* window) const;
 	uint32 ModifiersNow(int qtModifiers);
 	void HandleKey(const QKeyEvent& event);
-	/// Whether the host shows what this program drags, and would give it to other programs.
+	/// Whether the host carries what this program drags over other programs, too.
 	bool IsDraggingOut() const { return fIsDraggingOut; }
 	/// The program's window that the host's drag is over.
 	StackedWindow* WindowUnderDrag() const { return fWindowUnderDrag; }
@@ -110,8 +110,7 @@ private:
 	void OverlayChanged();
 	void RepaintOverlay();
 	bool CanDragOut() const;
-	void DragOut(
-		const BMessage& message, BRect rect, std::shared_ptr<const Picture> image, BPoint offset);
+	void DragOut(const BMessage& message, BPoint offset);
 	void UpdateCursors();
 
 	const bool fManagesFocus;

@@ -1,13 +1,9 @@
 // SPDX-License-Identifier: MIT
 // Dragging: within the program the input hub does it; the host carries it over other programs.
-#include <algorithm>
-
 #include <QCursor>
 #include <QDrag>
 #include <QGuiApplication>
-#include <QImage>
 #include <QMouseEvent>
-#include <QPainter>
 #include <QPixmap>
 #include <QTimer>
 
@@ -21,9 +17,6 @@
 namespace BPrivate {
 
 namespace {
-
-const double kDraggedOpacity = 0.7;
-
 
 /// Sees the pointer's events before Qt's drag takes them: the hub goes on as without it.
 class DragWatcher : public QObject {
@@ -94,30 +87,6 @@ private:
 	uint32 fButtons;
 };
 
-
-QPixmap
-PixmapOf(const Picture* image, BRect rect)
-{
-	if (image != nullptr) {
-		QImage shown(QSize(image->width, image->height), QImage::Format_ARGB32_Premultiplied);
-		shown.fill(Qt::transparent);
-		QPainter painter(&shown);
-		painter.setOpacity(kDraggedOpacity);
-		painter.drawImage(QPointF(0, 0),
-			QImage(reinterpret_cast<const uchar*>(image->pixels.data()), image->width,
-				image->height, image->hasAlpha ? QImage::Format_ARGB32 : QImage::Format_RGB32));
-		painter.end();
-		return QPixmap::fromImage(shown);
-	}
-
-	QPixmap outline(std::max(rect.IntegerWidth() + 1, 1), std::max(rect.IntegerHeight() + 1, 1));
-	outline.fill(Qt::transparent);
-	QPainter painter(&outline);
-	QtWindow::PaintOutline(painter, QRectF(0.5, 0.5, outline.width() - 1, outline.height() - 1));
-	painter.end();
-	return outline;
-}
-
 } // namespace
 
 
@@ -134,14 +103,12 @@ QtDisplay::BeginDrag(const BMessage& message, BRect rect, const PixelBuffer* ima
 
 	fThread.Run([&] {
 		bool goesOut = CanDragOut();
-		fHub.BeginDrag(message, rect, picture, offset, goesOut);
+		fHub.BeginDrag(message, rect, picture, offset);
 		if (!goesOut)
 			return;
 		// The host's drag has an event loop of its own, which must not begin inside of a task.
 		QTimer::singleShot(0, QCoreApplication::instance(),
-			[this, message = BMessage(message), rect, picture, offset] {
-				DragOut(message, rect, picture, offset);
-			});
+			[this, message = BMessage(message), offset] { DragOut(message, offset); });
 	});
 }
 
@@ -156,8 +123,7 @@ QtDisplay::CanDragOut() const
 
 
 void
-QtDisplay::DragOut(
-	const BMessage& message, BRect rect, std::shared_ptr<const Picture> image, BPoint offset)
+QtDisplay::DragOut(const BMessage& message, BPoint offset)
 {
 	if (!fHub.IsDragging())
 		return;
@@ -170,8 +136,12 @@ QtDisplay::DragOut(
 	// The window that it began in may go at any time, the application stays.
 	auto drag = new QDrag(QCoreApplication::instance());
 	drag->setMimeData(MakeMimeData(carried));
-	drag->setPixmap(PixmapOf(image.get(), rect));
-	drag->setHotSpot(QPoint(static_cast<int>(offset.x), static_cast<int>(offset.y)));
+	// What is dragged the windows show themselves, wherever they are; without a compositor the host's own
+	// picture could not be seen through. Beside them the pointer tells.
+	QPixmap nothing(1, 1);
+	nothing.fill(Qt::transparent);
+	drag->setPixmap(nothing);
+	drag->setHotSpot(QPoint(0, 0));
 
 	DragWatcher watcher(*this, fHub);
 	// Qt installs its own filter first; the later one comes first.

@@ -79,6 +79,20 @@ FlagsOf(const HostWindowStyle& style)
 
 
 void
+PaintOutline(QPainter& painter, const QRectF& rect)
+{
+	// Black and white by turns, to be seen on everything.
+	QPen light(Qt::white, 1);
+	QPen dark(Qt::black, 1, Qt::CustomDashLine);
+	dark.setDashPattern({3, 3});
+	for (const QPen& pen : {light, dark}) {
+		painter.setPen(pen);
+		painter.drawRect(rect);
+	}
+}
+
+
+void
 PaintOverlay(QPainter& painter, const InputOverlay& overlay, BPoint leftTop)
 {
 	painter.translate(-leftTop.x, -leftTop.y);
@@ -94,8 +108,7 @@ PaintOverlay(QPainter& painter, const InputOverlay& overlay, BPoint leftTop)
 	for (const BRect& rect : {overlay.tracking, showsImage ? BRect() : overlay.dragged}) {
 		if (!rect.IsValid())
 			continue;
-		QtWindow::PaintOutline(
-			painter, QRectF(rect.left + 0.5, rect.top + 0.5, rect.Width(), rect.Height()));
+		PaintOutline(painter, QRectF(rect.left + 0.5, rect.top + 0.5, rect.Width(), rect.Height()));
 	}
 }
 
@@ -140,20 +153,6 @@ QtWindow::ButtonsOf(Qt::MouseButtons pressed)
 	if ((pressed & Qt::ForwardButton) != 0)
 		buttons |= B_MOUSE_BUTTON(5);
 	return buttons;
-}
-
-
-void
-QtWindow::PaintOutline(QPainter& painter, const QRectF& rect)
-{
-	// Black and white by turns.
-	QPen light(Qt::white, 1);
-	QPen dark(Qt::black, 1, Qt::CustomDashLine);
-	dark.setDashPattern({3, 3});
-	for (const QPen& pen : {light, dark}) {
-		painter.setPen(pen);
-		painter.drawRect(rect);
-	}
 }
 
 

@@ -15,7 +15,6 @@
 class QDragMoveEvent;
 class QDropEvent;
 class QMouseEvent;
-class QPainter;
 class QWheelEvent;
 
 namespace BPrivate {
@@ -48,8 +47,6 @@ public:
 	static BRect RectOf(const QRect& geometry);
 	/// B_PRIMARY_MOUSE_BUTTON, ...
 	static uint32 ButtonsOf(Qt::MouseButtons pressed);
-	/// To be seen on everything.
-	static void PaintOutline(QPainter& painter, const QRectF& rect);
 
 	/// The shape over this window, null: the application's.
 	std::shared_ptr<const CursorShape> cursorShape;
