@@ -21,13 +21,6 @@ constexpr size_t kFilenameSize = 256;
 constexpr uint32 kMsgAreYouDone = '_don';
 
 
-/// Whether the form was changed since it was saved. Its window is locked.
-bool
-IsChanged(const TDesignForm* form)
-{
-	return form->Modified() || form->TFormComponent::Modified();
-}
-
 } // namespace
 
 TProject::AppOwner::AppOwner(TProject* project)
@@ -93,7 +86,10 @@ TProject::NewProject(bool withForm)
 	if (fObserver != nullptr)
 		fObserver.load()->ProjectStarted(fApp.get());
 	Quit(oldForms);
-	oldApp.reset();
+	{
+		WindowGuard guard(fAppLooper);
+		oldApp.reset();
+	}
 
 	SetFilename("");
 	if (withForm)
@@ -135,6 +131,13 @@ TProject::IsDirty()
 			return true;
 	}
 	return false;
+}
+
+
+bool
+TProject::IsChanged(const TDesignForm* form)
+{
+	return form->Modified() || form->TFormComponent::Modified();
 }
 
 
@@ -266,6 +269,15 @@ TProject::SetMainForm(TDesignForm* form)
 		if (guard.IsLocked())
 			each->SetAsMainForm(each == form);
 	}
+}
+
+
+bool
+TProject::IsMainForm(TDesignForm* form)
+{
+	TProjectOperation operation(this);
+	WindowGuard guard(form, B_INFINITE_TIMEOUT);
+	return guard.IsLocked() && form->IsMainForm();
 }
 
 

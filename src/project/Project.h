@@ -83,6 +83,9 @@ public:
 	/// Whether the application or a form was changed, or a form has no file.
 	bool IsDirty();
 
+	/// Whether the form was changed since it was saved. Lock it.
+	static bool IsChanged(const TDesignForm* form);
+
 	/// Whether a form was changed that has a file.
 	bool HasUnsavedForms();
 
@@ -115,6 +118,9 @@ public:
 
 	/// Makes \a form the only main form; none is one when \a form is none.
 	void SetMainForm(TDesignForm* form);
+
+	/// Whether the form is the main form.
+	bool IsMainForm(TDesignForm* form);
 
 	/// Lets the forms' windows really close, or not. Any thread.
 	void SetFormsClosing(bool closing);

@@ -59,6 +59,9 @@ public:
 	/// Gives the component's row its new text; without such a row nothing happens.
 	void RenameRow(const TComponent* component, const char* name);
 
+	/// The form whose row stands for \a component; none for the application and what has no row.
+	TDesignForm* FormOf(const TComponent* component) const;
+
 	TProjectViewItem* RowAt(int32 index) const;
 	/// None when no row is selected.
 	TProjectViewItem* SelectedRow() const;

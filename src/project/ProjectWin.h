@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <atomic>
 #include <memory>
 #include <vector>
 
@@ -81,7 +82,7 @@ private:
 
 	void PlaceOnScreen();
 	void InitControls();
-	void HandleCommand(BMessage* message);
+	void HandleCommand(uint32 command);
 	void OpenForm();
 	void RemoveForm();
 	void SetMainForm();
@@ -95,5 +96,9 @@ private:
 	ProjectView* fView;
 	std::unique_ptr<BRefFilter> fFormFilter;
 	std::unique_ptr<BFilePanel> fAddPanel;
+	// How many projects were started: names of objects of an earlier one concern nobody any more.
+	std::atomic<int32> fStarted;
+	// A row was selected while another thread worked on the project.
+	bool fSelectionWaits;
 	bool fClosing;
 };
