@@ -173,6 +173,8 @@ TProject::NewForm()
 		WindowGuard guard(form, B_INFINITE_TIMEOUT);
 		form->SetComponentName(name.String());
 		form->SetPropertyValue("Name", name.String());
+		// Nothing that the user would miss.
+		form->TFormComponent::SetModified(false);
 	}
 	Enter({form, BString(), BString()}, name.String());
 	MarkApp(true);

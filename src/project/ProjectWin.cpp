@@ -43,7 +43,8 @@ constexpr uint32 kMsgOperationEnded = 'oper';
 } // namespace
 
 ProjectWin::ProjectWin()
-	: BWindow(BRect(0, 0, kWidth, kHeight), "Project", B_TITLED_WINDOW, B_ASYNCHRONOUS_CONTROLS),
+	: BWindow(BRect(0, 0, kWidth, kHeight), "Project", B_TITLED_WINDOW,
+		B_ASYNCHRONOUS_CONTROLS | B_WILL_ACCEPT_FIRST_CLICK),
 	  fProject(std::make_unique<TProject>()),
 	  fView(nullptr),
 	  fFormFilter(std::make_unique<TFormRefFilter>()),
