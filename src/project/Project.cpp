@@ -49,6 +49,7 @@ TProject::TProject(form_visibility visibility)
 	  fApp(MakeApp()),
 	  fCurrentApp(fApp.get()),
 	  fFilename(&*fFilenames.emplace().first),
+	  fFilenameCut(false),
 	  fStatus(B_NO_INIT)
 {
 }
@@ -113,6 +114,7 @@ TProject::SetFilename(const char* name)
 		return;
 	std::lock_guard<std::mutex> lock(fListLock);
 	fFilename = &*fFilenames.emplace(name, strnlen(name, kFilenameSize - 1)).first;
+	fFilenameCut = strlen(name) >= kFilenameSize;
 }
 
 
@@ -287,7 +289,7 @@ void
 TProject::SetFormsClosing(bool closing)
 {
 	for (TDesignForm* form : Forms()) {
-		WindowGuard guard(form, B_INFINITE_TIMEOUT);
+		WindowGuard guard(form);
 		if (guard.IsLocked())
 			form->OKToClose(closing);
 	}
@@ -379,6 +381,19 @@ TProject::Entries() const
 {
 	std::lock_guard<std::mutex> lock(fListLock);
 	return fForms;
+}
+
+
+/// Whether a form of the project has that file.
+bool
+TProject::HasFormFile(const char* path) const
+{
+	for (TDesignForm* form : Forms()) {
+		WindowGuard guard(form, B_INFINITE_TIMEOUT);
+		if (guard.IsLocked() && strcmp(form->Filename(), path) == 0)
+			return true;
+	}
+	return false;
 }
 
 

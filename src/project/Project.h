@@ -71,7 +71,8 @@ public:
 	/// The result of the last opening or writing of a document.
 	status_t OpenStatus() const { return fStatus; }
 
-	/// The project's file; empty when it was never saved. At most 255 bytes are kept. Any thread; the result stays
+	/// The project's file; empty when it was never saved. At most 255 bytes are kept; saving to a name that was cut
+	/// is refused. Any thread; the result stays
 	/// valid as long as the project.
 	const char* Filename() const;
 	/// Any thread.
@@ -95,7 +96,8 @@ public:
 	/// Adds a new, empty form with the first free name of "Form1", "Form2", ... and returns it.
 	TDesignForm* NewForm();
 
-	/// Adds the form in the file at \a path; none, with nothing added, when it is no form file or cannot be read.
+	/// Adds the form in the file at \a path; none, with nothing added, when it is no form file, cannot be read or is
+	/// a form of the project already: two forms would overwrite each other.
 	TDesignForm* AddFormFile(const char* path);
 
 	/// Takes \a form out of the project and closes it; false when it is no form of the project.
@@ -155,6 +157,8 @@ private:
 	void Enter(const form_entry& entry, const char* name);
 	TDesignForm* AddForm(const form_entry& entry, const char* name);
 	std::vector<form_entry> Entries() const;
+	bool HasFormFile(const char* path) const;
+	bool IsCutFilename(const char* path) const;
 	BString FreeNameFor(const TDesignForm* form) const;
 	void Close(const std::vector<TDesignForm*>& forms);
 	void StopServing(const std::vector<TDesignForm*>& forms);
@@ -184,6 +188,8 @@ private:
 	// All names that the project's file has had: they are handed out, and other threads may still read them.
 	std::set<std::string> fFilenames;
 	const std::string* fFilename;
+	// The file would be another one than the one that was asked for.
+	bool fFilenameCut;
 
 	status_t fStatus;
 };

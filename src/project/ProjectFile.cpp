@@ -80,6 +80,10 @@ bool
 TProject::SaveToFile(const char* path, bool saveForms)
 {
 	TProjectOperation operation(this);
+	if (IsCutFilename(path)) {
+		fStatus = B_NAME_TOO_LONG;
+		return false;
+	}
 	TPLIMFile document(kProjectFileType);
 	document.what = 'PPrj';
 	if (!AddAppTo(&document))
@@ -100,6 +104,14 @@ TProject::SaveToFile(const char* path, bool saveForms)
 }
 
 
+bool
+TProject::IsCutFilename(const char* path) const
+{
+	std::lock_guard<std::mutex> lock(fListLock);
+	return fFilenameCut && *fFilename == path;
+}
+
+
 TDesignForm*
 TProject::AddFormFile(const char* path)
 {
@@ -109,7 +121,7 @@ TProject::AddFormFile(const char* path)
 		// Every document opens as an empty form.
 		TPLIMFormFile document;
 		document.SetFilename(path);
-		if (!document.OpenFile() || !IsForm(document))
+		if (!document.OpenFile() || !IsForm(document) || HasFormFile(path))
 			return nullptr;
 	}
 

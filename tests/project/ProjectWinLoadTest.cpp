@@ -140,6 +140,28 @@ TEST_F(ProjectWinLoadTest, ADocumentIsNotWrittenOverAFolder)
 }
 
 
+TEST_F(ProjectWinLoadTest, ANameThatIsTooLongIsRefusedRatherThanCut)
+{
+	SaveNewProject("test.plim");
+	const std::string name = fFolder / (std::string(200, 'x') + "/" + std::string(100, 'y'));
+	fFolder.Make(std::string(200, 'x'));
+	fWindow->SetFilename(name.c_str());
+	EXPECT_EQ(fWindow->Filename(), name.substr(0, 255));
+	EXPECT_FALSE(fWindow->SaveToFile(fWindow->Filename(), true));
+	EXPECT_FALSE(fWindow->SaveToFile(name.c_str(), true));
+	EXPECT_FALSE(std::filesystem::exists(name.substr(0, 255)));
+	EXPECT_TRUE(fWindow->SaveToFile((fFolder / "test.plim").c_str(), true));
+	EXPECT_TRUE(fWindow->SaveToFile(fWindow->Filename(), true));
+}
+
+
+TEST_F(ProjectWinLoadTest, AProjectWithoutANameIsNotSaved)
+{
+	EXPECT_FALSE(fWindow->SaveToFile("", true));
+	EXPECT_EQ(Rows(), (Texts{"Application", "Form1"}));
+}
+
+
 TEST_F(ProjectWinLoadTest, CommandsAreRefusedWhileAnotherThreadWorksOnTheProject)
 {
 	const std::string form = WriteForm("form.frm", "Form");

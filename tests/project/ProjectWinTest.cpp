@@ -286,6 +286,15 @@ TEST_F(ProjectWinTest, AFormFileIsAddedUnderTheNameThatItHas)
 }
 
 
+TEST_F(ProjectWinTest, AFileIsNotAddedTwice)
+{
+	const std::string path = WriteForm("any.frm", "Greeting");
+	EXPECT_TRUE(fWindow->View()->AddForm(path.c_str()));
+	EXPECT_FALSE(fWindow->View()->AddForm(path.c_str()));
+	EXPECT_EQ(Rows(), (Texts{"Application", "Form1", "Greeting"}));
+}
+
+
 TEST_F(ProjectWinTest, WhatIsNoFormFileIsNotAdded)
 {
 	const int32 windows = be_app->CountWindows();
