@@ -88,7 +88,7 @@ TProject::NewProject(bool withForm)
 		fObserver.load()->ProjectStarted(fApp.get());
 	Quit(oldForms);
 	{
-		WindowGuard guard(fAppLooper);
+		WindowGuard guard(fAppLooper, B_INFINITE_TIMEOUT);
 		oldApp.reset();
 	}
 
@@ -123,7 +123,7 @@ TProject::IsDirty()
 {
 	TProjectOperation operation(this);
 	{
-		WindowGuard guard(fAppLooper);
+		WindowGuard guard(fAppLooper, B_INFINITE_TIMEOUT);
 		if (fApp->Modified())
 			return true;
 	}
@@ -160,7 +160,7 @@ BString
 TProject::AppName()
 {
 	TProjectOperation operation(this);
-	WindowGuard guard(fAppLooper);
+	WindowGuard guard(fAppLooper, B_INFINITE_TIMEOUT);
 	return fApp->ComponentName();
 }
 
@@ -335,7 +335,7 @@ TProject::MakeApp()
 void
 TProject::MarkApp(bool modified)
 {
-	WindowGuard guard(fAppLooper);
+	WindowGuard guard(fAppLooper, B_INFINITE_TIMEOUT);
 	fApp->SetModified(modified);
 }
 

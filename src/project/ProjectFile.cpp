@@ -153,7 +153,7 @@ TProject::SaveForm(TDesignForm* form)
 void
 TProject::LoadApp(const BMessage& document)
 {
-	WindowGuard guard(fAppLooper);
+	WindowGuard guard(fAppLooper, B_INFINITE_TIMEOUT);
 	char* name;
 	type_code type;
 	BMessage properties;
@@ -246,7 +246,7 @@ TProject::AddAppTo(TPLIMFile* document)
 	BMessage properties('appP');
 	BMessage events('appE');
 	{
-		WindowGuard guard(fAppLooper);
+		WindowGuard guard(fAppLooper, B_INFINITE_TIMEOUT);
 		for (int32 i = 0; i < fApp->CountProperties(); i++) {
 			TProperty* property = fApp->PropertyAt(i);
 			properties.AddString(property->Name(), property->Value());
