@@ -35,31 +35,34 @@ ShowInInspector(TComponent* component, BView* designView)
 }
 
 
+inspected_form
+WhatIsInspected(TDesignForm* form)
+{
+	inspected_form inspected;
+	WindowGuard guard(form);
+	if (!guard.IsLocked())
+		return inspected;
+	inspected.view = form->View();
+	inspected.components.push_back(form);
+	for (int32 i = 0; i < form->CountComponents(); i++)
+		inspected.components.push_back(form->ComponentAt(i));
+	return inspected;
+}
+
+
 void
-ForgetInInspector(TDesignForm* form)
+ForgetInInspector(const inspected_form& form)
 {
 	PropertyWin* inspector = Inspector();
-	if (inspector == nullptr)
+	if (inspector == nullptr || form.view == nullptr)
 		return;
-
-	BView* view;
-	std::vector<TComponent*> components;
-	{
-		WindowGuard guard(form);
-		if (!guard.IsLocked())
-			return;
-		view = form->View();
-		components.push_back(form);
-		for (int32 i = 0; i < form->CountComponents(); i++)
-			components.push_back(form->ComponentAt(i));
-	}
-
 	WindowGuard guard(inspector);
 	if (!guard.IsLocked())
 		return;
+	const std::vector<TComponent*>& components = form.components;
 	if (std::find(components.begin(), components.end(), inspector->Component()) != components.end())
 		inspector->SetComponent(nullptr);
-	if (inspector->DesignView() == view)
+	if (inspector->DesignView() == form.view)
 		inspector->SetDesignView(nullptr);
 }
 

@@ -423,8 +423,6 @@ void
 TProject::Close(const std::vector<TDesignForm*>& forms)
 {
 	StopServing(forms);
-	for (TDesignForm* form : forms)
-		ForgetInInspector(form);
 	Quit(forms);
 }
 
@@ -453,8 +451,14 @@ void
 TProject::Quit(const std::vector<TDesignForm*>& forms)
 {
 	for (TDesignForm* form : forms) {
-		WindowGuard guard(form, B_INFINITE_TIMEOUT);
-		if (guard.IsLocked())
-			form->Quit();
+		const inspected_form inspected = WhatIsInspected(form);
+		ForgetInInspector(inspected);
+		{
+			WindowGuard guard(form, B_INFINITE_TIMEOUT);
+			if (guard.IsLocked())
+				form->Quit();
+		}
+		// The user may have chosen something of it with the last clicks that it handled.
+		ForgetInInspector(inspected);
 	}
 }
