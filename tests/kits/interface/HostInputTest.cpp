@@ -264,6 +264,27 @@ TEST_F(HostInputTest, FilesFromOutsideReachTheView)
 	Display::Get().InjectDrop(std::move(files), BPoint(350, 150));
 	EXPECT_EQ(TakeRight(), (Log{"right dropped"}));
 	EXPECT_EQ(fRight->dropPoint, BPoint(350, 150));
+	EXPECT_EQ(fRight->dropOffset, B_ORIGIN);
+}
+
+
+TEST_F(HostInputTest, EscapeCancelsADragAndIsNoKey)
+{
+	fRightWindow->Lock();
+	fRight->drags = true;
+	fRight->MakeFocus();
+	fRightWindow->Unlock();
+	Point(320, 120, 1);
+	TakeRight();
+	Point(160, 140, 1);
+	EXPECT_EQ(TakeLeft(), (Log{"left drag entered"}));
+	InjectedKey escape{0x01, "\x1b", 0};
+	Display::Get().InjectKey(escape, true);
+	Point(150, 130, 1);
+	Point(150, 130, 0);
+	EXPECT_EQ(TakeLeft(), Log());
+	EXPECT_EQ(TakeRight(), Log());
+	EXPECT_EQ(fRight->keys, "");
 }
 
 

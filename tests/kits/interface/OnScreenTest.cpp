@@ -106,3 +106,34 @@ TEST_F(OnScreenTest, WhatIsDrawnFromAnotherThreadAppears)
 	EXPECT_EQ(ColorAt(BPoint(120, 110)), kBlue);
 	Quit(window);
 }
+
+
+TEST_F(OnScreenTest, WhatIsDrawnInATransactionAppearsAtItsEnd)
+{
+	BWindow* window = MakeWindow();
+	BView* view = new BView(window->Bounds(), "view", B_FOLLOW_ALL, B_WILL_DRAW);
+	view->SetViewColor(kBlue);
+	window->AddChild(view);
+	window->Show();
+	EXPECT_EQ(AwaitColor(BPoint(200, 150), kBlue), kBlue);
+
+	window->Lock();
+	window->BeginViewTransaction();
+	window->BeginViewTransaction();
+	EXPECT_TRUE(window->InViewTransaction());
+	view->SetHighColor(kRed);
+	view->FillRect(BRect(90, 40, 110, 60));
+	view->Sync();
+	window->EndViewTransaction();
+	window->Sync();
+	EXPECT_EQ(ColorAt(BPoint(200, 150)), kBlue);
+	window->EndViewTransaction();
+	EXPECT_FALSE(window->InViewTransaction());
+	// One end too many counts for nothing.
+	window->EndViewTransaction();
+	EXPECT_FALSE(window->InViewTransaction());
+	window->Sync();
+	EXPECT_EQ(ColorAt(BPoint(200, 150)), kRed);
+	window->Unlock();
+	Quit(window);
+}
