@@ -340,6 +340,12 @@ MenuTracker::OpenRoot()
 		return false;
 	fLevels[0].frame = opened->Window()->Frame();
 	window->GrabInput();
+	// A release before the grab was told to the window of the press alone: it was a short click.
+	BPoint where;
+	uint32 buttons;
+	Display::Get().GetPointer(&where, &buttons);
+	if (buttons == 0)
+		fIsPressed = fIsOpeningPress = false;
 	return true;
 }
 

@@ -202,13 +202,21 @@ MenuWindow::FittingFrame(BMenu* menu) const
 	BRect frame(fLocation - BPoint(kMenuBorder, edge),
 		BSize(size.width + 2 * kMenuBorder, size.height + 2 * edge));
 
-	if (fItem.IsValid()) {
-		const float leftOf = fItem.left - 1 - frame.Width();
+	if (fItem.IsValid() && fIsBelowItem) {
+		// Not over its item: on the side with more room, cut there.
 		const float above = fItem.top - 1 - frame.Height();
-		if (!fIsBelowItem && frame.right > screen.right && leftOf >= screen.left)
-			frame.OffsetTo(leftOf, frame.top);
-		if (fIsBelowItem && frame.bottom > screen.bottom && above >= screen.top)
+		const bool isAbove =
+			frame.bottom > screen.bottom && fItem.top - screen.top > screen.bottom - fItem.bottom;
+		if (isAbove)
 			frame.OffsetTo(frame.left, above);
+		if (frame.top < screen.top)
+			frame.top = screen.top;
+		if (frame.bottom > screen.bottom)
+			frame.bottom = screen.bottom;
+	} else if (fItem.IsValid()) {
+		const float leftOf = fItem.left - 1 - frame.Width();
+		if (frame.right > screen.right && leftOf >= screen.left)
+			frame.OffsetTo(leftOf, frame.top);
 	}
 	if (frame.right > screen.right)
 		frame.OffsetBy(screen.right - frame.right, 0);

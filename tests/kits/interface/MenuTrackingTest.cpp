@@ -9,6 +9,7 @@
 #include <Screen.h>
 
 #include "MenuFixture.h"
+#include "display/Display.h"
 
 extern "C" int32 be_count_lock_violations();
 
@@ -680,6 +681,8 @@ TEST_F(MenuTrackingTest, LongMenuStaysOnTheScreenAndScrolls)
 	longMenu->UnlockLooper();
 	EXPECT_GE(frame.top, screen.top);
 	EXPECT_LE(frame.bottom, screen.bottom);
+	const BRect bar = Ask([this] { return fBar->ConvertToScreen(fBar->Bounds()); });
+	EXPECT_GE(frame.top, bar.bottom) << "it does not lie on its item";
 
 	fRobot->Key("end");
 	EXPECT_EQ(Selected(longMenu), "Line 200");
@@ -780,6 +783,24 @@ TEST_F(PopUpTest, ShortClickKeepsItOpenAndTheNextChooses)
 	EXPECT_FALSE(IsOpen(&fView->menu));
 	EXPECT_EQ(fMenuWindow->beginnings, 0);
 	EXPECT_TRUE(Becomes([&] { return fView->releases >= 1; })) << "the press was the view's";
+}
+
+
+TEST_F(PopUpTest, ClickThatEndsBeforeTheMenuIsOpenKeepsItOpen)
+{
+	Show();
+	// The window gets to the press only when the button is up again.
+	ASSERT_TRUE(fWindow->Lock());
+	BPrivate::Display::Get().InjectPointer(BPoint(200, 220), 0);
+	BPrivate::Display::Get().InjectPointer(BPoint(200, 220), 1);
+	BPrivate::Display::Get().InjectPointer(BPoint(200, 220), 0);
+	fWindow->Unlock();
+	ASSERT_TRUE(Opens(&fView->menu));
+	fRobot->MoveTo(MiddleOf("Two"));
+	EXPECT_TRUE(IsOpen(&fView->menu));
+	EXPECT_EQ(fView->returns, 0);
+	fRobot->Key("escape");
+	ASSERT_TRUE(Returned(1));
 }
 
 
