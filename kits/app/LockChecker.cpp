@@ -74,7 +74,9 @@ Report(const char* format, ...)
 bool
 IsRunningWindow(const LooperPort* port)
 {
-	return port->IsRunning() && port->Window() != nullptr && port->Kind() != kPlainLooper
+	// What follows an open menu counts among the menus' windows, and is none.
+	const bool isTracker = port->Kind() == kMenuWindowLooper && port->Window() == nullptr;
+	return port->IsRunning() && !isTracker && port->Kind() != kPlainLooper
 		&& port->Kind() != kOffscreenWindowLooper;
 }
 

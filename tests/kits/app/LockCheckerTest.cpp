@@ -68,6 +68,19 @@ TEST_F(LockCheckerTest, ReportsAThreadWithTwoWindowLocks)
 }
 
 
+TEST_F(LockCheckerTest, LetsAnOpenMenuBeLockedLast)
+{
+	LooperAccess::SetKind(two, BPrivate::kMenuWindowLooper);
+	RunAll();
+	one->Lock();
+	two->Lock();
+	EXPECT_EQ(Violations(), 0);
+	two->Unlock();
+	one->Unlock();
+	EXPECT_EQ(Output(), "");
+}
+
+
 TEST_F(LockCheckerTest, LetsOneLockAfterAnotherAndPlainLoopersPass)
 {
 	RunAll();
