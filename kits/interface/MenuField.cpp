@@ -240,7 +240,8 @@ BMenuField::PlaceBar()
 	fMenuBar->ResizeTo(std::max(width, kLeastFieldWidth), height);
 	MenuModel::Changed(fMenuBar);
 	if (fMenu != NULL)
-		MenuModel::Of(fMenu).minWidth = fMenuBar->Frame().Width();
+		MenuModel::Of(fMenu).minWidth =
+			fMenuBar->Frame().Width() + BPrivate::kMarkWidth - kTextMargin;
 }
 
 

@@ -2,6 +2,8 @@
 // BPopUpMenu: opening at a place.
 #include <PopUpMenu.h>
 
+#include <cmath>
+
 #include <MenuItem.h>
 #include <Message.h>
 
@@ -103,7 +105,7 @@ BPopUpMenu::AsyncAutoDestruct() const
 }
 
 
-// In a menu field the marked item lies on the field, so that choosing it again takes no way.
+// In a menu field the marked item's label lies on the field's, so that choosing it again takes no way.
 BPoint
 BPopUpMenu::ScreenLocation()
 {
@@ -115,10 +117,11 @@ BPopUpMenu::ScreenLocation()
 		return BMenu::ScreenLocation();
 
 	const BRect field = super->ConvertToScreen(Superitem()->Frame());
-	float y = field.top;
-	if (marked != NULL)
-		y -= marked->Frame().top;
-	return BPoint(field.left, y);
+	const float x = field.left + MenuModel::Of(super).left - MenuModel::Of(this).left;
+	if (marked == NULL)
+		return BPoint(x, field.top);
+	const BRect item = marked->Frame();
+	return BPoint(x, field.top + std::floor((field.Height() - item.Height()) / 2) - item.top);
 }
 
 
