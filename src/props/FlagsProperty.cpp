@@ -3,10 +3,28 @@
 
 #include "props/FlagsProperty.h"
 
+#include "props/ViewFlagsWin.h"
+#include "props/WindowFlagsWin.h"
+
 
 TViewFlagsProperty::TViewFlagsProperty(TComponent* component, TProperty* property)
 	: TPropertyEditor(component, property, PET_MODAL)
 {
+}
+
+
+bool
+TViewFlagsProperty::ModalEdit()
+{
+	const TPendingEdit edit(this);
+	BString value;
+	if (!edit.Read(&value))
+		return false;
+	ViewFlagsWin* dialog = new ViewFlagsWin(value.String(), edit);
+	dialog->InitWindow();
+	dialog->InitControls();
+	dialog->Show();
+	return true;
 }
 
 
@@ -20,6 +38,18 @@ TViewFlagsProperty::GetDisplayValue() const
 TWindowFlagsProperty::TWindowFlagsProperty(TComponent* component, TProperty* property)
 	: TPropertyEditor(component, property, PET_MODAL)
 {
+}
+
+
+bool
+TWindowFlagsProperty::ModalEdit()
+{
+	const TPendingEdit edit(this);
+	BString value;
+	if (!edit.Read(&value))
+		return false;
+	(new WindowFlagsWin(value.String(), edit))->Show();
+	return true;
 }
 
 

@@ -10,6 +10,8 @@ class TViewFlagsProperty : public TPropertyEditor {
 public:
 	TViewFlagsProperty(TComponent* component, TProperty* property);
 
+	/// Opens the dialog; it changes the property when the user confirms. True at once.
+	bool ModalEdit() override;
 	const char* GetDisplayValue() const override;
 };
 
@@ -19,5 +21,7 @@ class TWindowFlagsProperty : public TPropertyEditor {
 public:
 	TWindowFlagsProperty(TComponent* component, TProperty* property);
 
+	/// Opens the dialog; it changes the property when the user confirms. True at once.
+	bool ModalEdit() override;
 	const char* GetDisplayValue() const override;
 };

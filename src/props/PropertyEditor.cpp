@@ -79,9 +79,26 @@ TPropertyEditor::SetValue(const char* value, bool notify)
 		fProperty->FillValue(value);
 		return;
 	}
-	if (!fComponent->PropertyModified(fProperty->Name(), fProperty->Value(), value))
-		return;
+	if (fComponent->PropertyModified(fProperty->Name(), fProperty->Value(), value))
+		TakeValue(value, notify);
+}
 
+
+void
+TPropertyEditor::ApplyValue(const char* value)
+{
+	if (fProperty == nullptr || value == nullptr)
+		return;
+	if (fComponent == nullptr)
+		fProperty->FillValue(value);
+	else
+		TakeValue(value, true);
+}
+
+
+void
+TPropertyEditor::TakeValue(const char* value, bool notify)
+{
 	if (value == nullptr || strncmp(fProperty->Value(), value, TPropertyText::kSize) == 0) {
 		if (notify)
 			fComponent->SetPropertyValue(fProperty->Name(), value);

@@ -65,12 +65,17 @@ public:
 	virtual void GetValuePickList(TStringList* list);
 	virtual void GetValueList(TStringList* list);
 
+	/// The way of dialogs: gives the property \a value and lets the component apply it, without asking the
+	/// component first. A null \a value is ignored.
+	void ApplyValue(const char* value);
+
 	TPropEditType Type() const { return fType; }
 	TComponent* Component() const { return fComponent; }
 	TProperty* Property() const { return fProperty; }
 	void SetProperty(TProperty* property) { fProperty = property; }
 
 private:
+	void TakeValue(const char* value, bool notify);
 	void ApplyChange(const BString& oldValue, const BString& newValue);
 
 	TComponent* fComponent;

@@ -3,10 +3,27 @@
 
 #include "props/RGBColorProperty.h"
 
+#include "props/RGBColorWin.h"
+
 
 TRGBColorProperty::TRGBColorProperty(TComponent* component, TProperty* property)
 	: TPropertyEditor(component, property, PET_MODAL)
 {
+}
+
+
+bool
+TRGBColorProperty::ModalEdit()
+{
+	const TPendingEdit edit(this);
+	BString value;
+	if (!edit.Read(&value))
+		return false;
+	RGBColorWin* dialog = new RGBColorWin(value.String(), edit);
+	dialog->InitWindow();
+	dialog->InitControls();
+	dialog->Show();
+	return true;
 }
 
 

@@ -10,6 +10,8 @@ class TRGBColorProperty : public TPropertyEditor {
 public:
 	TRGBColorProperty(TComponent* component, TProperty* property);
 
+	/// Opens the dialog; it changes the property when the user confirms. True at once.
+	bool ModalEdit() override;
 	const char* GetDisplayValue() const override;
 };
 
