@@ -100,9 +100,9 @@ TextInput::ChangeEnded()
 
 
 rgb_color
-TextInput::DrawnColor() const
+TextInput::DrawnColor(rgb_color color) const
 {
-	return StrengthOf(fControl->IsEnabled(), fColor, ViewColor());
+	return StrengthOf(fControl->IsEnabled(), color, ViewColor());
 }
 
 } // namespace BPrivate

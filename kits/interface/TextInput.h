@@ -26,7 +26,7 @@ protected:
 
 private:
 	void ChangeEnded() override;
-	rgb_color DrawnColor() const override;
+	rgb_color DrawnColor(rgb_color color) const override;
 
 	BTextControl* fControl;
 };

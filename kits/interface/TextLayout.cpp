@@ -4,13 +4,29 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstring>
+#include <unordered_map>
+
+#include "TextStyles.h"
 
 namespace BPrivate {
 
 namespace {
 
-// Words are measured after so many bytes, and at their end.
-constexpr int32 kMeasuredPiece = 64;
+// No piece is longer, in bytes: parts of a piece are measured from its start.
+constexpr int32 kLongestPiece = 128;
+
+// Sums of widths are not exact: a text that is measured as a whole fits into its own width.
+constexpr float kTolerance = 0.01f;
+
+// Lines beyond are not measured without keeping their pieces, in bytes.
+constexpr int32 kLongLine = 4096;
+
+// How many lines' pieces are kept.
+constexpr size_t kMostKept = 200;
+
+// A dot, for each character of a hidden text.
+constexpr const char* kDot = "\xe2\x80\xa2";
 
 bool
 IsContinuation(char byte)
@@ -18,7 +34,48 @@ IsContinuation(char byte)
 	return (static_cast<unsigned char>(byte) & 0xc0) == 0x80;
 }
 
+// How many fonts' widths are kept.
+constexpr size_t kMostFonts = 32;
+
+
+// A character whose width does not depend on its neighbours, of scripts that are written letter by letter; 0 for
+// any other, and for bytes that are none.
+uint32
+SimpleCharacter(const std::string& text, int32 offset, int32 length)
+{
+	const auto byte = [&](int32 i) { return static_cast<uint8>(text[offset + i]); };
+	const uint32 first = byte(0);
+	if (length == 1)
+		return first >= 0x20 && first < 0x7f ? first : 0;
+	if (length == 2) {
+		const uint32 code = (first & 0x1f) << 6 | (byte(1) & 0x3f);
+		const bool isLetter = (code >= 0xa1 && code < 0x300 && code != 0xad)
+			|| (code >= 0x370 && code < 0x483) || (code >= 0x48a && code < 0x530);
+		return isLetter ? code : 0;
+	}
+	if (length == 3) {
+		const uint32 code = (first & 0x0f) << 12 | (byte(1) & 0x3f) << 6 | (byte(2) & 0x3f);
+		const bool isSign = (code >= 0x3041 && code < 0x3097) || (code >= 0x30a1 && code < 0x3100)
+			|| (code >= 0x4e00 && code < 0xa000) || (code >= 0xac00 && code < 0xd7a4);
+		return isSign ? code : 0;
+	}
+	return 0;
+}
+
 } // namespace
+
+
+struct TextLayout::CharacterWidths {
+	explicit CharacterWidths(const BFont& ofFont)
+		: font(ofFont)
+	{
+		std::fill(std::begin(ascii), std::end(ascii), -1.0f);
+	}
+
+	BFont font;
+	float ascii[128];
+	std::unordered_map<uint32, float> others;
+};
 
 
 int32
@@ -51,79 +108,142 @@ CharacterBefore(const std::string& text, int32 offset)
 }
 
 
-TextLayout::TextLayout()
-	: fText(nullptr),
-	  fStarts(1, 0),
+TextLayout::TextLayout(const std::string& text, const TextStyles& styles)
+	: fText(text),
+	  fStyles(styles),
+	  fLines(1, Line{0, 0, 0, -1, 0}),
 	  fWidth(0),
 	  fTabWidth(28),
-	  fAscent(0),
-	  fLineHeight(0)
+	  fHidden(false)
 {
 }
 
 
+TextLayout::~TextLayout() {}
+
+
+// Adds the lines from \a start on, up to the end or to one that \a isKnown, which is added with a height below 0.
+template <typename IsKnown>
 void
-TextLayout::SetTo(const std::string& text, const BFont& font, float width, float tabWidth)
+TextLayout::AddLines(int32 start, std::vector<Line>* lines, const IsKnown& isKnown) const
 {
-	fText = &text;
-	fFont = font;
+	const int32 size = static_cast<int32>(fText.size());
+	int32 paragraphEnd = -1;
+	while (true) {
+		if (isKnown(start)) {
+			lines->push_back({start, 0, -1, -1, 0});
+			return;
+		}
+		if (start > paragraphEnd) {
+			const size_t newline = fText.find('\n', static_cast<size_t>(start));
+			paragraphEnd = newline != std::string::npos ? static_cast<int32>(newline) : size;
+		}
+		const int32 next = fWidth > 0 ? BreakLine(start, paragraphEnd) : paragraphEnd;
+		Line line = {start, 0, 0, -1, 0};
+		Measure(&line, next);
+		lines->push_back(line);
+		if (next < paragraphEnd) {
+			start = next;
+			continue;
+		}
+		if (paragraphEnd == size)
+			return;
+		start = paragraphEnd + 1;
+	}
+}
+
+
+void
+TextLayout::SetTo(float width, float tabWidth)
+{
 	fWidth = width;
 	fTabWidth = tabWidth;
-	font_height height;
-	fFont.GetHeight(&height);
-	fAscent = std::ceil(height.ascent);
-	fLineHeight = fAscent + std::ceil(height.descent) + std::ceil(height.leading);
+	fPieces.clear();
+	fCharacterWidths.clear();
+	fLines.clear();
+	AddLines(0, &fLines, [](int32) { return false; });
+	PlaceLines(0);
+}
 
-	fStarts.assign(1, 0);
-	AddLines(0, static_cast<int32>(text.size()));
+
+void
+TextLayout::SetHidden(bool hidden)
+{
+	fHidden = hidden;
+	SetTo(fWidth, fTabWidth);
 }
 
 
 void
 TextLayout::Update(int32 offset, int32 removed, int32 inserted)
 {
+	fPieces.clear();
+	// A word that got shorter may fit into the line before its own; the one before that breaks elsewhere only
+	// when a word went through the line between.
 	int32 first = LineAt(offset);
-	while (first > 0 && (*fText)[fStarts[first] - 1] != '\n')
+	for (int32 back = 0; back < 2 && first > 0 && fText[fLines[first].start - 1] != '\n'; back++)
 		first--;
-	const int32 start = fStarts[first];
 
-	// From the next paragraph on the lines are the same, only further on or back.
-	std::vector<int32> rest;
-	const size_t newline = fText->find('\n', offset + inserted);
-	const bool hasRest = newline != std::string::npos;
-	const int32 end = static_cast<int32>(hasRest ? newline : fText->size());
-	if (hasRest) {
-		const int32 shift = inserted - removed;
-		rest.assign(
-			std::lower_bound(fStarts.begin(), fStarts.end(), end + 1 - shift), fStarts.end());
-		for (int32& lineStart : rest)
-			lineStart += shift;
-	}
-	fStarts.resize(first + 1);
-	AddLines(start, end);
-	fStarts.insert(fStarts.end(), rest.begin(), rest.end());
+	// From the first line on that begins where one began before, they are the same.
+	const int32 shift = inserted - removed;
+	std::vector<Line> added;
+	size_t old = static_cast<size_t>(first);
+	AddLines(fLines[first].start, &added, [&](int32 start) {
+		if (start < offset + inserted || start >= static_cast<int32>(fText.size()))
+			return false;
+		while (old < fLines.size() && fLines[old].start < start - shift)
+			old++;
+		return old < fLines.size() && fLines[old].start == start - shift;
+	});
+	const bool metOld = !added.empty() && added.back().height < 0;
+	if (metOld)
+		added.pop_back();
+	else
+		old = fLines.size();
+
+	for (size_t line = old; line < fLines.size(); line++)
+		fLines[line].start += shift;
+	const auto lines = fLines.begin();
+	const size_t count = added.size();
+	const size_t replaced = old - static_cast<size_t>(first);
+	// In place as far as it goes: most changes keep the number of lines.
+	const size_t common = std::min(count, replaced);
+	std::copy(added.begin(), added.begin() + common, lines + first);
+	if (count > common)
+		fLines.insert(lines + first + common, added.begin() + common, added.end());
+	else
+		fLines.erase(lines + first + common, lines + old);
+	PlaceLines(first);
 }
 
 
-/// Adds the starts of the lines behind the first one, which begins at \a start, up to \a end.
+// A line is as high as the highest of its styles; an empty one as what would be typed into it.
 void
-TextLayout::AddLines(int32 start, int32 end)
+TextLayout::Measure(Line* line, int32 end) const
 {
-	while (true) {
-		const size_t newline = fText->find('\n', start);
-		const bool isLast = newline == std::string::npos || static_cast<int32>(newline) >= end;
-		const int32 paragraphEnd = isLast ? end : static_cast<int32>(newline);
-		while (fWidth > 0 && start < paragraphEnd) {
-			const int32 next = BreakLine(start, paragraphEnd, fWidth);
-			if (next >= paragraphEnd)
-				break;
-			fStarts.push_back(next);
-			start = next;
-		}
-		if (isLast)
-			return;
-		start = paragraphEnd + 1;
-		fStarts.push_back(start);
+	const std::vector<TextStyles::Run>& runs = fStyles.Runs();
+	float descent = 0;
+	float leading = 0;
+	size_t run = static_cast<size_t>(fStyles.IndexAt(std::max(
+		line->start < static_cast<int32>(fText.size()) ? line->start : line->start - 1, int32(0))));
+	do {
+		font_height height;
+		runs[run].style.font.GetHeight(&height);
+		line->ascent = std::max(line->ascent, std::ceil(height.ascent));
+		descent = std::max(descent, std::ceil(height.descent));
+		leading = std::max(leading, std::ceil(height.leading));
+		run++;
+	} while (run < runs.size() && runs[run].offset < end);
+	line->height = line->ascent + descent + leading;
+}
+
+
+void
+TextLayout::PlaceLines(int32 first)
+{
+	for (int32 line = first; line < CountLines(); line++) {
+		fLines[line].top =
+			line > 0 ? fLines[line - 1].top + static_cast<double>(fLines[line - 1].height) : 0;
 	}
 }
 
@@ -131,11 +251,10 @@ TextLayout::AddLines(int32 start, int32 end)
 int32
 TextLayout::LineEnd(int32 line) const
 {
-	const int32 size = fText != nullptr ? static_cast<int32>(fText->size()) : 0;
 	if (line + 1 >= CountLines())
-		return size;
-	const int32 next = fStarts[line + 1];
-	return next > 0 && (*fText)[next - 1] == '\n' ? next - 1 : next;
+		return static_cast<int32>(fText.size());
+	const int32 next = fLines[line + 1].start;
+	return next > 0 && fText[next - 1] == '\n' ? next - 1 : next;
 }
 
 
@@ -145,114 +264,311 @@ TextLayout::LastOffset(int32 line) const
 	// The end of a line that was broken between words is the start of the next one.
 	const int32 end = LineEnd(line);
 	const bool softBreak = line + 1 < CountLines() && LineStart(line + 1) == end;
-	return softBreak ? CharacterBefore(*fText, end) : end;
+	return softBreak ? CharacterBefore(fText, end) : end;
 }
 
 
 int32
 TextLayout::LineAt(int32 offset) const
 {
-	const auto next = std::upper_bound(fStarts.begin(), fStarts.end(), offset);
-	return static_cast<int32>(next - fStarts.begin()) - 1;
+	const auto next = std::upper_bound(fLines.begin(), fLines.end(), offset,
+		[](int32 place, const Line& line) { return place < line.start; });
+	return std::max(static_cast<int32>(next - fLines.begin()) - 1, int32(0));
+}
+
+
+int32
+TextLayout::LineAtHeight(float y) const
+{
+	const auto next = std::upper_bound(fLines.begin(), fLines.end(), static_cast<double>(y),
+		[](double place, const Line& line) { return place < line.top; });
+	return std::max(static_cast<int32>(next - fLines.begin()) - 1, int32(0));
+}
+
+
+float
+TextLayout::Height() const
+{
+	return static_cast<float>(fLines.back().top) + fLines.back().height;
 }
 
 
 float
 TextLayout::LineWidth(int32 line) const
 {
-	return WidthOf(LineStart(line), LineEnd(line));
+	if (fLines[line].width >= 0)
+		return fLines[line].width;
+	const int32 end = LineEnd(line);
+	if (end - LineStart(line) > kLongLine) {
+		// It takes long, and is asked for again.
+		LinePieces(line);
+		return fLines[line].width;
+	}
+	Piece piece = {LineStart(line), 0, 0, 0, nullptr};
+	while (NextPiece(end, &piece)) {
+	}
+	return fLines[line].width = piece.x;
+}
+
+
+float
+TextLayout::Width() const
+{
+	float width = 0;
+	for (int32 line = 0; line < CountLines(); line++)
+		width = std::max(width, LineWidth(line));
+	return width;
+}
+
+
+const TextLayout::Pieces&
+TextLayout::LinePieces(int32 line) const
+{
+	const auto kept = fPieces.find(line);
+	if (kept != fPieces.end())
+		return kept->second;
+	if (fPieces.size() >= kMostKept)
+		fPieces.clear();
+	Pieces& pieces = fPieces[line];
+	Piece piece = {LineStart(line), 0, 0, 0, nullptr};
+	const int32 end = LineEnd(line);
+	while (NextPiece(end, &piece))
+		pieces.push_back(piece);
+	fLines[line].width = piece.x;
+	return pieces;
+}
+
+
+// Goes from a piece to the next of its line; from one without length to the first. At the end the piece is an
+// empty one behind all, and the answer is false.
+bool
+TextLayout::NextPiece(int32 end, Piece* piece) const
+{
+	piece->x += piece->width;
+	piece->offset += piece->length;
+	piece->length = 0;
+	piece->width = 0;
+	piece->style = nullptr;
+	if (piece->offset >= end)
+		return false;
+
+	const int32 start = piece->offset;
+	if (!fHidden && fText[start] == '\t') {
+		while (start + piece->length < end && fText[start + piece->length] == '\t')
+			piece->length++;
+	} else {
+		const std::vector<TextStyles::Run>& runs = fStyles.Runs();
+		const size_t run = static_cast<size_t>(fStyles.IndexAt(start));
+		piece->style = &runs[run].style;
+		int32 limit = std::min(end, start + kLongestPiece);
+		if (run + 1 < runs.size())
+			limit = std::min(limit, runs[run + 1].offset);
+		const char* text = fText.data() + start;
+		const void* tab =
+			fHidden ? nullptr : memchr(text, '\t', static_cast<size_t>(limit - start));
+		if (tab != nullptr)
+			limit = start + static_cast<int32>(static_cast<const char*>(tab) - text);
+		else if (limit == start + kLongestPiece && limit < end)
+			limit = GoodCut(start, limit);
+		piece->length = limit - start;
+	}
+	piece->width = WidthWithin(*piece, piece->length);
+	return true;
+}
+
+
+// A long piece ends behind a word or, where there is none, behind a character.
+int32
+TextLayout::GoodCut(int32 start, int32 limit) const
+{
+	for (int32 cut = limit; cut > start; cut--) {
+		if (fText[cut - 1] == ' ')
+			return cut;
+	}
+	for (int32 cut = limit; cut > limit - 4; cut--) {
+		if (!IsContinuation(fText[cut]))
+			return cut;
+	}
+	return limit;
+}
+
+
+// How wide so many bytes of a piece are.
+float
+TextLayout::WidthWithin(const Piece& piece, int32 length) const
+{
+	if (length == 0)
+		return 0;
+	if (piece.style != nullptr)
+		return WidthOf(*piece.style, piece.offset, length);
+	// Each tab goes on to the next stop.
+	const float firstStop = (std::floor(piece.x / fTabWidth) + 1) * fTabWidth;
+	return firstStop - piece.x + static_cast<float>(length - 1) * fTabWidth;
+}
+
+
+float
+TextLayout::WidthOf(const TextStyle& style, int32 offset, int32 length) const
+{
+	double sum = 0;
+	int32 size;
+	for (int32 i = offset; i < offset + length; i += size) {
+		size = CharacterLength(fText, i);
+		const float* width = CharacterWidth(style, i, size);
+		if (width == nullptr)
+			return style.font.StringWidth(fText.data() + offset, length);
+		sum += static_cast<double>(*width);
+	}
+	return static_cast<float>(sum);
+}
+
+
+// Asking the font takes long. It sets letters side by side, so that their widths can be added. Null for a
+// character of which that is not known.
+const float*
+TextLayout::CharacterWidth(const TextStyle& style, int32 offset, int32 length) const
+{
+	const uint32 code = fHidden ? 0 : SimpleCharacter(fText, offset, length);
+	if (code == 0 && !fHidden)
+		return nullptr;
+	CharacterWidths& widths = WidthsOf(style.font);
+	float& width =
+		code < 128 ? widths.ascii[code] : widths.others.try_emplace(code, -1.0f).first->second;
+	if (width < 0) {
+		width = fHidden ? style.font.StringWidth(kDot)
+						: style.font.StringWidth(fText.data() + offset, length);
+	}
+	return &width;
+}
+
+
+TextLayout::CharacterWidths&
+TextLayout::WidthsOf(const BFont& font) const
+{
+	for (const auto& widths : fCharacterWidths) {
+		if (widths->font == font)
+			return *widths;
+	}
+	if (fCharacterWidths.size() >= kMostFonts)
+		fCharacterWidths.clear();
+	fCharacterWidths.push_back(std::make_unique<CharacterWidths>(font));
+	return *fCharacterWidths.back();
+}
+
+
+// The offset of the first character of a piece that does not end within \a width of its start.
+int32
+TextLayout::FittingPart(const Piece& piece, float width) const
+{
+	if (piece.style == nullptr) {
+		const float more = width - WidthWithin(piece, 1);
+		const float tabs = more < 0 ? 0 : std::floor(more / fTabWidth) + 1;
+		return piece.offset + static_cast<int32>(std::min(tabs, static_cast<float>(piece.length)));
+	}
+	// Most text can be added up.
+	const int32 end = piece.offset + piece.length;
+	double sum = 0;
+	int32 place = piece.offset;
+	while (place < end) {
+		const int32 size = CharacterLength(fText, place);
+		const float* known = CharacterWidth(*piece.style, place, size);
+		if (known == nullptr)
+			break;
+		sum += static_cast<double>(*known);
+		if (static_cast<float>(sum) > width)
+			return place;
+		place += size;
+	}
+	if (place >= end)
+		return end;
+
+	std::vector<int32> ends;
+	for (int32 i = piece.offset; i < piece.offset + piece.length;) {
+		i += CharacterLength(fText, i);
+		ends.push_back(i);
+	}
+	const auto over = std::partition_point(ends.begin(), ends.end(), [&](int32 end) {
+		return WidthOf(*piece.style, piece.offset, end - piece.offset) <= width;
+	});
+	return over == ends.begin() ? piece.offset : *(over - 1);
+}
+
+
+std::string
+TextLayout::Shown(int32 offset, int32 length) const
+{
+	if (!fHidden)
+		return fText.substr(static_cast<size_t>(offset), static_cast<size_t>(length));
+	std::string dots;
+	for (int32 i = offset; i < offset + length; i += CharacterLength(fText, i))
+		dots += kDot;
+	return dots;
 }
 
 
 float
 TextLayout::XAt(int32 line, int32 offset) const
 {
-	return WidthOf(LineStart(line), std::min(offset, LineEnd(line)));
+	offset = std::min(offset, LineEnd(line));
+	const Pieces& pieces = LinePieces(line);
+	const auto next = std::upper_bound(pieces.begin(), pieces.end(), offset,
+		[](int32 place, const Piece& piece) { return place < piece.offset; });
+	if (next == pieces.begin())
+		return 0;
+	const Piece& piece = *(next - 1);
+	return piece.x + WidthWithin(piece, offset - piece.offset);
 }
 
 
 int32
 TextLayout::OffsetAt(int32 line, float x) const
 {
-	const int32 start = LineStart(line);
 	const int32 last = LastOffset(line);
+	const Pieces& pieces = LinePieces(line);
+	const auto next = std::upper_bound(pieces.begin(), pieces.end(), x,
+		[](float place, const Piece& piece) { return place < piece.x; });
+	if (next == pieces.begin())
+		return LineStart(line);
 
-	// The last character that begins at x or before, halving: long lines are measured often enough.
-	int32 low = start;
-	int32 high = last;
-	while (low < high) {
-		int32 middle = low + (high - low + 1) / 2;
-		while (middle < high && IsContinuation((*fText)[middle]))
-			middle++;
-		if (WidthOf(start, middle) <= x)
-			low = middle;
-		else {
-			high = middle - 1;
-			while (high > low && IsContinuation((*fText)[high]))
-				high--;
-		}
-	}
+	// The last character that begins at x or before.
+	const Piece& piece = *(next - 1);
+	const int32 low = FittingPart(piece, x - piece.x);
 	if (low >= last)
 		return last;
-	const int32 next = low + CharacterLength(*fText, low);
-	return x < (WidthOf(start, low) + WidthOf(start, next)) / 2 ? low : std::min(next, last);
+	const int32 following = low + CharacterLength(fText, low);
+	return x < (XAt(line, low) + XAt(line, following)) / 2 ? low : std::min(following, last);
 }
 
 
-float
-TextLayout::WidthOf(int32 from, int32 to) const
-{
-	float width = 0;
-	while (from < to) {
-		const size_t found = fText->find('\t', from);
-		const int32 tab = found == std::string::npos ? to : std::min<int32>(found, to);
-		width += fFont.StringWidth(fText->data() + from, tab - from);
-		if (tab < to)
-			width = (std::floor(width / fTabWidth) + 1) * fTabWidth;
-		from = tab + 1;
-	}
-	return width;
-}
-
-
-/// Where the line from \a start has to be broken to be no wider than \a width; \a end when it fits.
+/// Where the line from \a start has to be broken to be no wider than the text; \a end when it fits.
 int32
-TextLayout::BreakLine(int32 start, int32 end, float width) const
+TextLayout::BreakLine(int32 start, int32 end) const
 {
-	int32 lastBreak = start;
-	int32 offset = start;
-	while (offset < end) {
-		int32 next = offset;
-		// Word by word, and a long word in pieces: a paragraph may be long, a line is not.
-		int32 measured = offset;
-		bool fits = true;
-		while (fits && next < end && (*fText)[next] != ' ' && (*fText)[next] != '\t') {
-			next += CharacterLength(*fText, next);
-			if (next - measured >= kMeasuredPiece) {
-				fits = WidthOf(start, next) <= width;
-				measured = next;
-			}
-		}
-		if (!fits || WidthOf(start, next) > width)
+	Piece piece = {start, 0, 0, 0, nullptr};
+	int32 over = start;
+	while (true) {
+		if (!NextPiece(end, &piece))
+			return end;
+		if (piece.x + piece.width > fWidth + kTolerance) {
+			over = FittingPart(piece, fWidth + kTolerance - piece.x);
 			break;
-		// Blanks at the end of a line may stick out.
-		while (next < end && ((*fText)[next] == ' ' || (*fText)[next] == '\t'))
-			next++;
-		lastBreak = next;
-		offset = next;
+		}
 	}
-	if (lastBreak > start || start == end)
-		return lastBreak;
 
+	// Blanks at the end of a line may stick out.
+	const auto isBlank = [this](
+							 int32 place) { return fText[place] == ' ' || fText[place] == '\t'; };
+	int32 next = over;
+	while (next < end && isBlank(next))
+		next++;
+	if (next > over || (over > start && isBlank(over - 1)))
+		return next;
+	while (next > start && !isBlank(next - 1))
+		next--;
+	if (next > start)
+		return next;
 	// A word wider than the line is broken anywhere, after one character at least.
-	offset = start + CharacterLength(*fText, start);
-	while (offset < end) {
-		const int32 next = offset + CharacterLength(*fText, offset);
-		if (WidthOf(start, next) > width)
-			return offset;
-		offset = next;
-	}
-	return end;
+	return std::max(over, start + CharacterLength(fText, start));
 }
 
 } // namespace BPrivate

@@ -5,15 +5,16 @@
 
 #include <string>
 
-#include <SupportDefs.h>
+#include "TextStyles.h"
 
 namespace BPrivate {
 
 /// The last change of a text: typing without a break counts as one. Taking it back is a change, too.
 class TextUndo {
 public:
-	/// \a removed gave way to \a inserted at \a offset.
-	void Note(int32 offset, const std::string& removed, const std::string& inserted)
+	/// \a removed, with its styles, gave way to \a inserted at \a offset.
+	void Note(
+		int32 offset, const std::string& removed, RunArray styles, const std::string& inserted)
 	{
 		const bool typedOn = fValid && !fSealed && removed.empty() && !inserted.empty()
 			&& offset == fOffset + static_cast<int32>(fInserted.size());
@@ -23,6 +24,7 @@ public:
 		}
 		fOffset = offset;
 		fRemoved = removed;
+		fStyles = std::move(styles);
 		fInserted = inserted;
 		fValid = true;
 		fSealed = false;
@@ -36,6 +38,8 @@ public:
 	bool IsEmpty() const { return !fValid; }
 	int32 Offset() const { return fOffset; }
 	const std::string& Removed() const { return fRemoved; }
+	/// Null when nothing was removed. The caller's; the next change is noted before another undo.
+	RunArray TakeStyles() { return std::move(fStyles); }
 	const std::string& Inserted() const { return fInserted; }
 
 private:
@@ -43,6 +47,7 @@ private:
 	bool fSealed = false;
 	int32 fOffset = 0;
 	std::string fRemoved;
+	RunArray fStyles;
 	std::string fInserted;
 };
 

@@ -5,25 +5,31 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstdlib>
 #include <cstring>
 
 #include <Cursor.h>
 #include <File.h>
 #include <Message.h>
+#include <ScrollBar.h>
+#include <ScrollView.h>
 #include <Window.h>
 
 #include "ControlLook.h"
 #include "TextLayout.h"
+#include "TextStyles.h"
 #include "TextUndo.h"
 
 namespace {
 
 constexpr float kDefaultTabWidth = 28;
 
-BFont
-StartFont(const BFont* font)
+std::unique_ptr<BPrivate::TextStyles>
+StartStyles(const BFont* font, const rgb_color* color)
 {
-	return font != NULL ? *font : *be_plain_font;
+	return std::make_unique<BPrivate::TextStyles>(
+		BPrivate::TextStyle{font != NULL ? *font : *be_plain_font,
+			color != NULL ? *color : ui_color(B_DOCUMENT_TEXT_COLOR)});
 }
 
 } // namespace
@@ -37,10 +43,11 @@ BTextView::BTextView(BRect frame, const char* name, BRect textRect, uint32 resiz
 BTextView::BTextView(BRect frame, const char* name, BRect textRect, const BFont* initialFont,
 	const rgb_color* initialColor, uint32 resizeMask, uint32 flags)
 	: BView(frame, name, resizeMask, flags | B_FRAME_EVENTS),
-	  fLayout(std::make_unique<BPrivate::TextLayout>()),
+	  fStyles(StartStyles(initialFont, initialColor)),
+	  fLayout(std::make_unique<BPrivate::TextLayout>(fText, *fStyles)),
 	  fUndo(std::make_unique<BPrivate::TextUndo>()),
 	  fTextRect(textRect),
-	  fColor(initialColor != NULL ? *initialColor : ui_color(B_DOCUMENT_TEXT_COLOR)),
+	  fScrollView(NULL),
 	  fChanged(false),
 	  fAnchor(0),
 	  fCaret(0),
@@ -57,8 +64,8 @@ BTextView::BTextView(BRect frame, const char* name, BRect textRect, const BFont*
 {
 	SetViewColor(ui_color(B_DOCUMENT_BACKGROUND_COLOR));
 	SetLowColor(ViewColor());
-	const BFont font = StartFont(initialFont);
-	SetFont(&font);
+	BView::SetFont(&fStyles->At(0).font);
+	Relayout();
 }
 
 
@@ -78,10 +85,11 @@ BTextView::BTextView(
 
 BTextView::BTextView(BMessage* archive)
 	: BView(archive),
-	  fLayout(std::make_unique<BPrivate::TextLayout>()),
+	  fStyles(StartStyles(NULL, NULL)),
+	  fLayout(std::make_unique<BPrivate::TextLayout>(fText, *fStyles)),
 	  fUndo(std::make_unique<BPrivate::TextUndo>()),
 	  fTextRect(Bounds()),
-	  fColor(ui_color(B_DOCUMENT_TEXT_COLOR)),
+	  fScrollView(NULL),
 	  fChanged(false),
 	  fAnchor(0),
 	  fCaret(0),
@@ -96,12 +104,21 @@ BTextView::BTextView(BMessage* archive)
 	  fAutoindent(false),
 	  fSelecting(false)
 {
-	Relayout();
 	archive->FindRect("_trect", &fTextRect);
-	archive->FindColor("_tcolor", &fColor);
+	BPrivate::TextStyle style = fStyles->At(0);
+	GetFont(&style.font);
+	archive->FindColor("_tcolor", &style.color);
+	fStyles->SetAll(style);
+	archive->FindBool("_stylable", &fStylable);
 	const char* text;
 	if (archive->FindString("_text", &text) == B_OK)
 		SetText(text);
+	const void* data;
+	ssize_t size;
+	if (archive->FindData("_runs", B_RAW_TYPE, &data, &size) == B_OK) {
+		if (const BPrivate::RunArray runs = BPrivate::ReadFlatRuns(data, size))
+			SetRunArray(0, TextLength(), runs.get());
+	}
 	int32 number;
 	if (archive->FindInt32("_max", &number) == B_OK)
 		fMaxBytes = number;
@@ -156,7 +173,16 @@ BTextView::Archive(BMessage* archive, bool deep) const
 	if (status == B_OK)
 		status = archive->AddFloat("_tab", fTabWidth);
 	if (status == B_OK)
-		status = archive->AddColor("_tcolor", fColor);
+		status = archive->AddColor("_tcolor", fStyles->At(0).color);
+	if (status == B_OK && fStylable)
+		status = archive->AddBool("_stylable", true);
+	if (status != B_OK || fStyles->IsOneStyle())
+		return status;
+	const BPrivate::RunArray runs = BPrivate::CopyRuns(*fStyles, 0, TextLength());
+	int32 size = 0;
+	void* data = FlattenRunArray(runs.get(), &size);
+	status = data != NULL ? archive->AddData("_runs", B_RAW_TYPE, data, size) : B_NO_MEMORY;
+	free(data);
 	return status;
 }
 
@@ -184,7 +210,7 @@ BTextView::WindowActivated(bool active)
 {
 	BView::WindowActivated(active);
 	if (IsFocus())
-		InvalidateText();
+		FocusChanged();
 }
 
 
@@ -192,7 +218,17 @@ void
 BTextView::FrameResized(float newWidth, float newHeight)
 {
 	BView::FrameResized(newWidth, newHeight);
+	FixScrollBars();
 	InvalidateText();
+}
+
+
+void
+BTextView::TargetedByScrollView(BScrollView* scrollView)
+{
+	fScrollView = scrollView;
+	BView::TargetedByScrollView(scrollView);
+	FixScrollBars();
 }
 
 
@@ -207,7 +243,7 @@ BTextView::MakeFocus(bool focus)
 	// Windows know the other editing shortcuts; a program's own one takes this one's place.
 	if (focus && fEditable && !Window()->HasShortcut('z', B_COMMAND_KEY))
 		Window()->AddShortcut('z', B_COMMAND_KEY, new BMessage(B_UNDO), NULL);
-	InvalidateText();
+	FocusChanged();
 }
 
 
@@ -227,6 +263,10 @@ void
 BTextView::SetFont(const BFont* font, uint32 mask)
 {
 	BView::SetFont(font, mask);
+	if (font == NULL)
+		return;
+	fStyles->Apply(0, std::max<int32>(TextLength(), 1), font, mask, NULL);
+	fNextStyle.reset();
 	Relayout();
 }
 
@@ -297,45 +337,6 @@ BTextView::GetText(int32 offset, int32 length, char* buffer) const
 }
 
 
-void
-BTextView::SetFontAndColor(const BFont* font, uint32 mode, const rgb_color* color)
-{
-	if (color != NULL)
-		fColor = *color;
-	if (font != NULL)
-		SetFont(font, mode);
-	InvalidateText();
-}
-
-
-void
-BTextView::SetFontAndColor(int32, int32, const BFont* font, uint32 mode, const rgb_color* color)
-{
-	SetFontAndColor(font, mode, color);
-}
-
-
-void
-BTextView::GetFontAndColor(int32, BFont* _font, rgb_color* _color) const
-{
-	GetFontAndColor(_font, NULL, _color);
-}
-
-
-void
-BTextView::GetFontAndColor(BFont* _font, uint32* _mode, rgb_color* _color, bool* _sameColor) const
-{
-	if (_font != NULL)
-		GetFont(_font);
-	if (_mode != NULL)
-		*_mode = B_FONT_ALL;
-	if (_color != NULL)
-		*_color = fColor;
-	if (_sameColor != NULL)
-		*_sameColor = true;
-}
-
-
 int32
 BTextView::CountLines() const
 {
@@ -360,11 +361,7 @@ BTextView::LineAt(int32 offset) const
 int32
 BTextView::LineAt(BPoint point) const
 {
-	if (fLayout->LineHeight() <= 0)
-		return 0;
-	const int32 line =
-		static_cast<int32>(std::floor((point.y - fTextRect.top) / fLayout->LineHeight()));
-	return std::clamp<int32>(line, 0, CountLines() - 1);
+	return fLayout->LineAtHeight(point.y - fTextRect.top);
 }
 
 
@@ -374,7 +371,7 @@ BTextView::PointAt(int32 offset, float* _height) const
 	offset = std::clamp<int32>(offset, 0, TextLength());
 	const int32 line = LineAt(offset);
 	if (_height != NULL)
-		*_height = fLayout->LineHeight();
+		*_height = fLayout->LineHeight(line);
 
 	float left = fTextRect.left;
 	if (fAlignment != B_ALIGN_LEFT) {
@@ -382,7 +379,7 @@ BTextView::PointAt(int32 offset, float* _height) const
 		const float space = std::max(fTextRect.Width() - fLayout->LineWidth(line), 0.0f);
 		left += std::floor(fAlignment == B_ALIGN_RIGHT ? space : space / 2);
 	}
-	return BPoint(left + fLayout->XAt(line, offset), fTextRect.top + line * fLayout->LineHeight());
+	return BPoint(left + fLayout->XAt(line, offset), fTextRect.top + fLayout->LineTop(line));
 }
 
 
@@ -392,7 +389,7 @@ BTextView::OffsetAt(BPoint point) const
 	const int32 line = LineAt(point);
 	if (point.y < fTextRect.top)
 		return 0;
-	if (point.y >= fTextRect.top + CountLines() * fLayout->LineHeight() && CountLines() > 1)
+	if (point.y >= fTextRect.top + fLayout->Height() && CountLines() > 1)
 		return TextLength();
 	const float left = PointAt(fLayout->LineStart(line)).x;
 	return fLayout->OffsetAt(line, point.x - left);
@@ -418,7 +415,7 @@ BTextView::LineWidth(int32 lineNumber) const
 float
 BTextView::LineHeight(int32 lineNumber) const
 {
-	return lineNumber >= 0 && lineNumber < CountLines() ? fLayout->LineHeight() : 0;
+	return lineNumber >= 0 && lineNumber < CountLines() ? fLayout->LineHeight(lineNumber) : 0;
 }
 
 
@@ -427,7 +424,9 @@ BTextView::TextHeight(int32 startLine, int32 endLine) const
 {
 	const int32 first = std::max<int32>(startLine, 0);
 	const int32 last = std::min(endLine, CountLines() - 1);
-	return last >= first ? (last - first + 1) * fLayout->LineHeight() : 0;
+	if (last < first)
+		return 0;
+	return fLayout->LineTop(last) + fLayout->LineHeight(last) - fLayout->LineTop(first);
 }
 
 
@@ -473,7 +472,15 @@ BTextView::GetInsets(float* _left, float* _top, float* _right, float* _bottom) c
 void
 BTextView::SetStylable(bool stylable)
 {
+	if (stylable == fStylable)
+		return;
 	fStylable = stylable;
+	fNextStyle.reset();
+	if (stylable || fStyles->IsOneStyle())
+		return;
+	const BPrivate::TextStyle style = fStyles->At(0);
+	fStyles->SetAll(style);
+	Relayout();
 }
 
 
@@ -623,13 +630,13 @@ BTextView::Draw(BRect updateRect)
 	const int32 first = LineAt(updateRect.LeftTop());
 	const int32 last = LineAt(updateRect.RightBottom());
 	for (int32 line = first; line <= last; line++)
-		DrawLine(line);
+		DrawLine(line, updateRect);
 
 	if (ShowsCaret()) {
 		float height;
 		const BPoint top = PointAt(fCaret, &height);
 		const float x = std::floor(top.x);
-		SetHighColor(DrawnColor());
+		SetHighColor(DrawnColor(fStyles->At(std::max<int32>(fCaret - 1, 0)).color));
 		StrokeLine(BPoint(x, top.y), BPoint(x, top.y + height - 1));
 	}
 	SetDrawingMode(B_OP_COPY);
@@ -637,7 +644,7 @@ BTextView::Draw(BRect updateRect)
 
 
 void
-BTextView::DrawLine(int32 line)
+BTextView::DrawLine(int32 line, BRect updateRect)
 {
 	const int32 start = fLayout->LineStart(line);
 	const int32 end = fLayout->LineEnd(line);
@@ -656,17 +663,22 @@ BTextView::DrawLine(int32 line)
 										  : std::ceil(top.x + fLayout->XAt(line, to)) - 1;
 		const rgb_color mark = ui_color(B_LIST_SELECTED_BACKGROUND_COLOR);
 		SetHighColor(BPrivate::BlendColors(ViewColor(), mark, active ? 1.0f : 0.5f));
-		FillRect(BRect(left, top.y, right, top.y + fLayout->LineHeight() - 1));
+		FillRect(BRect(left, top.y, right, top.y + fLayout->LineHeight(line) - 1));
 	}
 
-	SetHighColor(DrawnColor());
-	int32 offset = start;
-	while (offset < end) {
-		const size_t found = fText.find('\t', offset);
-		const int32 piece = found == std::string::npos ? end : std::min<int32>(found, end);
-		DrawString(fText.data() + offset, piece - offset,
-			BPoint(top.x + fLayout->XAt(line, offset), top.y + fLayout->Ascent()));
-		offset = piece + 1;
+	// Of a long line only what is seen, and what reaches into it.
+	const float reach = fLayout->LineHeight(line);
+	for (const BPrivate::TextLayout::Piece& piece : fLayout->LinePieces(line)) {
+		if (top.x + piece.x > updateRect.right + reach)
+			break;
+		if (piece.style == NULL || top.x + piece.x + piece.width < updateRect.left - reach)
+			continue;
+		// Not by the own SetFont(), which is that of the text.
+		BView::SetFont(&piece.style->font);
+		SetHighColor(DrawnColor(piece.style->color));
+		const std::string text = fLayout->Shown(piece.offset, piece.length);
+		DrawString(text.data(), static_cast<int32>(text.size()),
+			BPoint(top.x + piece.x, top.y + fLayout->Ascent(line)));
 	}
 }
 
@@ -681,9 +693,42 @@ BTextView::ShowsCaret() const
 void
 BTextView::Relayout()
 {
-	BFont font;
-	GetFont(&font);
-	fLayout->SetTo(fText, font, fWordWrap ? std::max(fTextRect.Width(), 1.0f) : 0, fTabWidth);
+	fLayout->SetTo(fWordWrap ? std::max(fTextRect.Width(), 1.0f) : 0, fTabWidth);
+	FixScrollBars();
+	InvalidateText();
+}
+
+
+// What lies around the text at the top and at the left is there at the other ends, too.
+void
+BTextView::FixScrollBars()
+{
+	const auto fit = [](BScrollBar* bar, float content, float seen, float step) {
+		seen = std::max(seen, 0.0f);
+		bar->SetRange(0, std::max(std::ceil(content) - 1 - seen, 0.0f));
+		bar->SetProportion(content > 0 ? (seen + 1) / content : 1);
+		bar->SetSteps(step, std::max(seen - step, step));
+	};
+	const BRect bounds = Bounds();
+	const float line = fLayout->LineHeight(0);
+	if (ScrollBar(B_VERTICAL) != NULL) {
+		fit(ScrollBar(B_VERTICAL), fLayout->Height() + 2 * std::max(fTextRect.top, 0.0f),
+			bounds.Height(), line);
+	}
+	if (ScrollBar(B_HORIZONTAL) != NULL) {
+		// A wrapped text is as wide as its rectangle. The caret needs a pixel behind the text.
+		const float width = fWordWrap ? fTextRect.Width() : fLayout->Width() + 1;
+		fit(ScrollBar(B_HORIZONTAL), width + 1 + 2 * std::max(fTextRect.left, 0.0f), bounds.Width(),
+			line);
+	}
+}
+
+
+void
+BTextView::FocusChanged()
+{
+	if (fScrollView != NULL)
+		fScrollView->SetBorderHighlighted(IsFocus() && Window() != NULL && Window()->IsActive());
 	InvalidateText();
 }
 
@@ -703,8 +748,9 @@ BTextView::ChangeEnded()
 }
 
 
+/// How a colour of the text is shown.
 rgb_color
-BTextView::DrawnColor() const
+BTextView::DrawnColor(rgb_color color) const
 {
-	return fColor;
+	return color;
 }

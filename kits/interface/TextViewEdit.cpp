@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstdlib>
 #include <cstring>
 
 #include <Beep.h>
@@ -12,11 +13,13 @@
 #include <Window.h>
 
 #include "TextLayout.h"
+#include "TextStyles.h"
 #include "TextUndo.h"
 
 namespace {
 
 constexpr const char* kPlainText = "text/plain";
+constexpr const char* kRunArray = "application/x-vnd.Be-text_run_array";
 
 /// The code point of the UTF-8 character of that length; bytes that are none count as themselves.
 uint32
@@ -77,7 +80,7 @@ BTextView::InsertAt(int32 offset, const char* text, int32 length, const text_run
 		fAnchor += grown;
 	SealUndo();
 	if (fUndo != NULL && grown > 0)
-		fUndo->Note(offset, "", fText.substr(offset, grown));
+		fUndo->Note(offset, "", NULL, fText.substr(offset, grown));
 	SealUndo();
 	TextChanged();
 }
@@ -104,11 +107,19 @@ BTextView::Delete(int32 startOffset, int32 endOffset)
 
 
 void
-BTextView::InsertText(const char* text, int32 length, int32 offset, const text_run_array*)
+BTextView::InsertText(const char* text, int32 length, int32 offset, const text_run_array* runs)
 {
+	// Text without styles of its own goes on in the style that is before it.
+	BPrivate::TextStyle style = fStyles->At(std::max<int32>(offset - 1, 0));
+	if (fNextStyle != NULL)
+		style = {fNextStyle->font, fNextStyle->color};
 	fText.insert(offset, text, length);
+	fStyles->Insert(offset, length, style);
+	if (fStylable && runs != NULL)
+		ApplyRuns(offset, offset + length, runs);
 	fChanged = true;
 	fLayout->Update(offset, 0, length);
+	FixScrollBars();
 	InvalidateText();
 }
 
@@ -117,27 +128,38 @@ void
 BTextView::DeleteText(int32 fromOffset, int32 toOffset)
 {
 	fText.erase(fromOffset, toOffset - fromOffset);
+	fStyles->Remove(fromOffset, toOffset);
 	fChanged = true;
 	fLayout->Update(fromOffset, toOffset - fromOffset, 0);
+	FixScrollBars();
 	InvalidateText();
 }
 
 
 /// Puts a text in place of a range, and the caret behind it.
 void
-BTextView::Replace(int32 from, int32 to, const char* text, int32 length)
+BTextView::Replace(int32 from, int32 to, const char* text, int32 length, const text_run_array* runs)
 {
 	const std::string removed = fText.substr(from, to - from);
 	const std::string wanted(text, length);
+	BPrivate::RunArray removedRuns;
+	if (from < to && !fStyles->IsOneStyle())
+		removedRuns = BPrivate::CopyRuns(*fStyles, from, to);
+	// What takes the place of a text looks like its start.
+	if (from < to && fNextStyle == NULL && fStylable) {
+		const BPrivate::TextStyle& style = fStyles->At(from);
+		fNextStyle = std::make_unique<text_run>(text_run{0, style.font, style.color});
+	}
 	if (from < to)
 		DeleteText(from, to);
 	const int32 before = TextLength();
 	if (length > 0)
-		InsertText(wanted.data(), length, from, NULL);
+		InsertText(wanted.data(), length, from, runs);
+	fNextStyle.reset();
 	// A subclass may have inserted another text.
 	const int32 grown = std::max<int32>(TextLength() - before, 0);
 	if (fUndo != NULL)
-		fUndo->Note(from, removed, fText.substr(from, grown));
+		fUndo->Note(from, removed, std::move(removedRuns), fText.substr(from, grown));
 	fCaret = from + grown;
 	fAnchor = fCaret;
 	TextChanged();
@@ -186,6 +208,7 @@ BTextView::Select(int32 startOffset, int32 endOffset)
 	fAnchor = std::clamp<int32>(startOffset, 0, TextLength());
 	fCaret = std::clamp<int32>(endOffset, 0, TextLength());
 	fWantedX = -1;
+	fNextStyle.reset();
 	SealUndo();
 	InvalidateText();
 }
@@ -211,7 +234,7 @@ BTextView::GetSelection(int32* _start, int32* _end) const
 void
 BTextView::Cut(BClipboard* clipboard)
 {
-	if (!fEditable)
+	if (!fEditable || IsTypingHidden())
 		return;
 	Copy(clipboard);
 	Delete();
@@ -224,10 +247,18 @@ BTextView::Copy(BClipboard* clipboard)
 	int32 start;
 	int32 end;
 	GetSelection(&start, &end);
-	if (start == end || clipboard == NULL || !clipboard->Lock())
+	if (start == end || IsTypingHidden() || clipboard == NULL || !clipboard->Lock())
 		return;
 	clipboard->Clear();
 	clipboard->Data()->AddData(kPlainText, B_MIME_TYPE, fText.data() + start, end - start);
+	if (fStylable) {
+		const BPrivate::RunArray runs = BPrivate::CopyRuns(*fStyles, start, end);
+		int32 size = 0;
+		if (void* data = FlattenRunArray(runs.get(), &size)) {
+			clipboard->Data()->AddData(kRunArray, B_MIME_TYPE, data, size);
+			free(data);
+		}
+	}
 	clipboard->Commit();
 	clipboard->Unlock();
 }
@@ -241,6 +272,9 @@ BTextView::Paste(BClipboard* clipboard)
 	const void* data = NULL;
 	ssize_t size = 0;
 	std::string text;
+	BPrivate::RunArray runs;
+	if (fStylable && clipboard->Data()->FindData(kRunArray, B_MIME_TYPE, &data, &size) == B_OK)
+		runs = BPrivate::ReadFlatRuns(data, size);
 	if (clipboard->Data()->FindData(kPlainText, B_MIME_TYPE, &data, &size) == B_OK)
 		text.assign(static_cast<const char*>(data), strnlen(static_cast<const char*>(data), size));
 	clipboard->Unlock();
@@ -252,7 +286,7 @@ BTextView::Paste(BClipboard* clipboard)
 	if (length == 0 || !IsAllowed(text.data(), length, end - start))
 		return;
 	SealUndo();
-	Replace(start, end, text.data(), length);
+	Replace(start, end, text.data(), length, runs.get());
 	SealUndo();
 	ScrollToSelection();
 }
@@ -308,9 +342,10 @@ BTextView::Undo(BClipboard*)
 	const int32 offset = fUndo->Offset();
 	const std::string text = fUndo->Removed();
 	const int32 inserted = static_cast<int32>(fUndo->Inserted().size());
+	const BPrivate::RunArray styles = fUndo->TakeStyles();
 	fUndo->Seal();
 	Replace(offset, std::min(offset + inserted, TextLength()), text.data(),
-		static_cast<int32>(text.size()));
+		static_cast<int32>(text.size()), styles.get());
 	fUndo->Seal();
 	ScrollToSelection();
 }

@@ -142,7 +142,7 @@ bool
 BTextView::ScrollByKey(char key)
 {
 	const BRect bounds = Bounds();
-	const float line = fLayout->LineHeight();
+	const float line = fLayout->LineHeight(0);
 	const float page = std::max(bounds.Height() - line, line);
 	float by;
 	switch (key) {
@@ -167,13 +167,13 @@ BTextView::ScrollByKey(char key)
 			break;
 
 		case B_END:
-			by = CountLines() * line;
+			by = fLayout->Height();
 			break;
 
 		default:
 			return false;
 	}
-	const float lowest = fTextRect.top + CountLines() * line - bounds.Height();
+	const float lowest = fTextRect.top + fLayout->Height() - bounds.Height();
 	ScrollTo(BPoint(bounds.left, std::clamp(bounds.top + by, 0.0f, std::max(lowest, 0.0f))));
 	return true;
 }
@@ -186,6 +186,7 @@ BTextView::MoveCaret(int32 offset, bool extend)
 	if (!extend)
 		fAnchor = fCaret;
 	fWantedX = -1;
+	fNextStyle.reset();
 	SealUndo();
 	InvalidateText();
 }
@@ -223,6 +224,9 @@ BTextView::VerticalTarget(int32 lines)
 int32
 BTextView::WordStart(int32 offset) const
 {
+	// Where words begin is part of what is hidden.
+	if (IsTypingHidden())
+		return 0;
 	while (offset > 0 && !IsWordByte(fText[offset - 1]))
 		offset--;
 	while (offset > 0 && IsWordByte(fText[offset - 1]))
@@ -234,6 +238,8 @@ BTextView::WordStart(int32 offset) const
 int32
 BTextView::WordEnd(int32 offset) const
 {
+	if (IsTypingHidden())
+		return TextLength();
 	while (offset < TextLength() && !IsWordByte(fText[offset]))
 		offset++;
 	while (offset < TextLength() && IsWordByte(fText[offset]))
@@ -268,8 +274,8 @@ BTextView::MouseDown(BPoint where)
 	const int32 clicks = MessageNumber(this, "clicks");
 	const bool extend = (MessageNumber(this, "modifiers") & B_SHIFT_KEY) != 0;
 	if (fSelectable && clicks == 2) {
-		int32 start = offset;
-		int32 end = offset;
+		int32 start = IsTypingHidden() ? 0 : offset;
+		int32 end = IsTypingHidden() ? TextLength() : offset;
 		while (start > 0 && IsWordByte(fText[start - 1]))
 			start--;
 		while (end < TextLength() && IsWordByte(fText[end]))

@@ -12,6 +12,7 @@
 
 class BClipboard;
 class BFile;
+class BScrollView;
 
 /// One style from an offset on.
 struct text_run {
@@ -29,13 +30,15 @@ struct text_run_array {
 namespace BPrivate {
 class TextInput;
 class TextLayout;
+class TextStyles;
 class TextUndo;
 } // namespace BPrivate
 
 /// UTF-8 text in lines. Offsets are bytes; a selection without length is the caret.
 ///
 /// Every insertion and deletion passes InsertText() and DeleteText(), where subclasses hook in. The text
-/// has one font and one colour. Lock the window as for any view.
+/// has one font and one colour, unless it is stylable: then each range may have its own. Lock the window
+/// as for any view.
 class BTextView : public BView {
 public:
 	/// \a textRect: where the text is laid out, in view coordinates; keep its width in step with the
@@ -65,7 +68,9 @@ public:
 	void MakeFocus(bool focus = true) override;
 	void MessageReceived(BMessage* message) override;
 	void GetPreferredSize(float* _width, float* _height) override;
+	/// Of the whole text.
 	void SetFont(const BFont* font, uint32 mask = B_FONT_ALL) override;
+	void TargetedByScrollView(BScrollView* scrollView) override;
 
 	/// Replaces the whole text, which no limit applies to, and puts the caret at its start.
 	void SetText(const char* text, const text_run_array* runs = NULL);
@@ -97,14 +102,30 @@ public:
 	virtual bool AcceptsPaste(BClipboard* clipboard);
 	virtual bool AcceptsDrop(const BMessage* message);
 
-	/// The style of the whole text: ranges have none of their own.
+	/// Of the selection, and without one of what is typed next; of the whole text when it is not stylable.
 	void SetFontAndColor(
 		const BFont* font, uint32 mode = B_FONT_ALL, const rgb_color* color = NULL);
+	/// Of a range, in bytes; of the whole text when it is not stylable.
 	void SetFontAndColor(int32 startOffset, int32 endOffset, const BFont* font,
 		uint32 mode = B_FONT_ALL, const rgb_color* color = NULL);
 	void GetFontAndColor(int32 offset, BFont* _font, rgb_color* _color = NULL) const;
+	/// Of the selection's start. \a _mode: what of the font is the same in the whole selection.
 	void GetFontAndColor(
 		BFont* _font, uint32* _mode, rgb_color* _color = NULL, bool* _sameColor = NULL) const;
+
+	/// Offsets of the runs are counted from \a startOffset. A text that is not stylable takes the first.
+	void SetRunArray(int32 startOffset, int32 endOffset, const text_run_array* runs);
+	/// The caller's, for FreeRunArray(); \a _size gets its length in bytes.
+	text_run_array* RunArray(int32 startOffset, int32 endOffset, int32* _size = NULL) const;
+	/// Null when there is no memory or the count is below 0.
+	static text_run_array* AllocRunArray(int32 entryCount, int32* outSize = NULL);
+	/// With so many runs more or less.
+	static text_run_array* CopyRunArray(const text_run_array* original, int32 countDelta = 0);
+	static void FreeRunArray(text_run_array* array);
+	/// As bytes for files and the clipboard, the caller's to free(). Null without a run array.
+	static void* FlattenRunArray(const text_run_array* runArray, int32* _size = NULL);
+	/// For FreeRunArray(). Null when the data begins otherwise; its length is not checked.
+	static text_run_array* UnflattenRunArray(const void* data, int32* _size = NULL);
 
 	int32 CountLines() const;
 	/// The line that the caret is in, from 0.
@@ -127,8 +148,12 @@ public:
 	void SetInsets(float left, float top, float right, float bottom);
 	void GetInsets(float* _left, float* _top, float* _right, float* _bottom) const;
 
+	/// A text that is no longer stylable takes the style of its start.
 	void SetStylable(bool stylable);
 	bool IsStylable() const;
+	/// For passwords: each character is shown as a dot, and nothing is copied.
+	void HideTyping(bool enabled);
+	bool IsTypingHidden() const;
 	void SetTabWidth(float width);
 	float TabWidth() const;
 	void MakeSelectable(bool selectable = true);
@@ -161,14 +186,17 @@ private:
 
 	// What a text control wants to know: the text is another one, and complete.
 	virtual void ChangeEnded();
-	virtual rgb_color DrawnColor() const;
+	virtual rgb_color DrawnColor(rgb_color color) const;
 
 	// Changes
-	void Replace(int32 from, int32 to, const char* text, int32 length);
+	void Replace(
+		int32 from, int32 to, const char* text, int32 length, const text_run_array* runs = NULL);
 	void InsertAt(int32 offset, const char* text, int32 length, const text_run_array* runs);
 	bool IsAllowed(const char* text, int32 length, int32 replaced);
 	void TextChanged();
 	void SealUndo();
+	void ApplyRuns(int32 from, int32 to, const text_run_array* runs);
+	void StylesChanged(int32 from, int32 to);
 
 	// Keys
 	bool MoveByKey(char key, bool extend, bool byWord);
@@ -184,15 +212,20 @@ private:
 	// Picture
 	void Relayout();
 	void InvalidateText();
-	void DrawLine(int32 line);
+	void DrawLine(int32 line, BRect updateRect);
 	bool ShowsCaret() const;
+	void FixScrollBars();
+	void FocusChanged();
 
 	std::string fText;
+	std::unique_ptr<BPrivate::TextStyles> fStyles;
+	// What is typed next, when it was chosen.
+	std::unique_ptr<text_run> fNextStyle;
 	std::unique_ptr<BPrivate::TextLayout> fLayout;
 	std::unique_ptr<BPrivate::TextUndo> fUndo;
 	std::set<uint32> fDisallowed;
 	BRect fTextRect;
-	rgb_color fColor;
+	BScrollView* fScrollView;
 	bool fChanged;
 	int32 fAnchor;
 	int32 fCaret;
