@@ -9,11 +9,13 @@
 #include <Control.h>
 #include <FilePanel.h>
 #include <Invoker.h>
+#include <MenuBar.h>
 #include <Message.h>
 #include <StringView.h>
 #include <TabView.h>
 
 #include "Commands.h"
+#include "GalleryMenus.h"
 #include "Pages.h"
 
 namespace {
@@ -22,12 +24,12 @@ const uint32 kMsgAlertAnswered = 'answ';
 const float kStatusHeight = 22;
 
 BView* (*const kPages[])(BRect) = {MakeButtonsPage, MakeTextPage, MakeSlidersPage, MakeBarsPage,
-	MakeColorsPage, MakeTabsPage, MakeListsPage, MakeDialogsPage};
+	MakeColorsPage, MakeTabsPage, MakeListsPage, MakeMenusPage, MakeDialogsPage};
 
 } // namespace
 
 GalleryWindow::GalleryWindow()
-	: BWindow(BRect(80, 60, 679, 479), "Gallery", B_TITLED_WINDOW, 0),
+	: BWindow(BRect(80, 60, 679, 499), "Gallery", B_TITLED_WINDOW, 0),
 	  fPages(nullptr),
 	  fStatus(nullptr)
 {
@@ -96,17 +98,16 @@ GalleryWindow::BuildPages()
 	background->SetResizingMode(B_FOLLOW_ALL);
 	AddChild(background);
 
+	BMenuBar* menuBar = MakeMenuBar(this);
+	background->AddChild(menuBar);
 	BRect frame = Bounds();
+	frame.top = menuBar->Frame().bottom + 1;
 	frame.bottom -= kStatusHeight;
 	frame.InsetBy(8, 8);
 	fPages = new BTabView(frame, "pages", B_WIDTH_FROM_LABEL, B_FOLLOW_ALL);
 	const BRect pageFrame = fPages->ContainerView()->Bounds();
-	for (BView* (*makePage)(BRect) : kPages) {
+	for (BView* (*makePage)(BRect) : kPages)
 		fPages->AddTab(makePage(pageFrame));
-		BMessage* message = new BMessage(GM_SHOW_PAGE);
-		message->AddInt32("index", fPages->CountTabs() - 1);
-		AddShortcut('0' + fPages->CountTabs(), B_COMMAND_KEY, message);
-	}
 	background->AddChild(fPages);
 
 	fStatus = new BStringView(BRect(10, frame.bottom + 6, frame.right, frame.bottom + 24),
@@ -123,7 +124,7 @@ GalleryWindow::ShowAlert(const BMessage* message)
 	const int32 count = std::clamp<int32>(message->GetInt32("buttons", 1), 1, 3);
 	BAlert* alert = new BAlert("Alert",
 		"An alert tells something or asks a question. This text is long enough for more than one "
-	    "line.",
+		"line.",
 		kLabels[0], count > 1 ? kLabels[1] : nullptr, count > 2 ? kLabels[2] : nullptr,
 		B_WIDTH_AS_USUAL, static_cast<alert_type>(message->GetInt32("type", B_INFO_ALERT)));
 	alert->Go(new BInvoker(new BMessage(kMsgAlertAnswered), this));

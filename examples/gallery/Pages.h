@@ -15,6 +15,7 @@ BView* MakeBarsPage(BRect frame);
 BView* MakeColorsPage(BRect frame);
 BView* MakeTabsPage(BRect frame);
 BView* MakeListsPage(BRect frame);
+BView* MakeMenusPage(BRect frame);
 BView* MakeDialogsPage(BRect frame);
 
 /// A view for a page, in the panel's colour.

@@ -5,7 +5,7 @@ save-png ${OUT}/buttons.png
 # The focus on one button, another one held down.
 key tab
 key tab
-move 160 80
+move 160 100
 press
 save-png ${OUT}/buttons-pressed.png
 release
@@ -36,6 +36,27 @@ click-view lvPlain
 save-png ${OUT}/lists.png
 
 key command+8
+save-png ${OUT}/menus.png
+click-item Sample
+wait-window Sample
+click-item "One of several"
+wait-window Sample
+save-png ${OUT}/menu.png
+wait-window "One of several"
+save-png ${OUT}/menu-sub.png
+key escape
+key escape
+wait-no-window Sample
+
+wait-window Gallery
+click-view mfFitted
+wait-window size
+save-png ${OUT}/menu-field.png
+key escape
+wait-no-window size
+
+wait-window Gallery
+key command+9
 save-png ${OUT}/dialogs.png
 
 click-view btnEmpty
@@ -73,7 +94,7 @@ click-view First
 wait-no-window Alert
 
 wait-window Gallery
-click-view btnOpen
+key command+o
 wait-window "gallery: Open"
 pause 300
 save-png ${OUT}/panel-open.png

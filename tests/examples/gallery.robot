@@ -22,8 +22,10 @@ key command+a
 key command+x
 expect-view efName ""
 click-view efBare
-key command+a
-key command+v
+click-item Edit
+click-item "Select all"
+click-item Edit
+click-item Paste
 expect-view efBare "Ada Lovelace"
 key enter
 expect-view svStatus "Used: efBare, value 0"
@@ -50,16 +52,23 @@ click-view lvPlain
 key up
 expect-view svStatus "Used: lvPlain, item 1"
 
-# An alert of each kind of answer.
 key command+8
-click-view btnWarning
+click-view mfFitted
+click-item Large
+expect-view svStatus "Used: a menu, item 2"
+
+# From a menu: an alert, and a panel.
+key command+9
+click-item Alert
+click-item Warning
 wait-window Alert
 click-view Second
 wait-no-window Alert
 wait-window Gallery
 expect-view svStatus "The alert was answered with button 2"
 
-click-view btnSave
+click-item File
+click-item "Save…"
 wait-window "gallery: Save"
 type "letter.txt"
 click-view Save
