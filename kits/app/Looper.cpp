@@ -387,7 +387,6 @@ void
 BLooper::Register(BWindow* window)
 {
 	fPort = Registry::Default().AddLooper(this, window);
-	fPort->Lock(B_INFINITE_TIMEOUT);
 	SetLooper(this, fPort.get());
 	fHandlers.push_back(this);
 }

@@ -48,6 +48,8 @@ Registry::AddLooper(BLooper* looper, BWindow* window)
 {
 	std::lock_guard<std::mutex> lock(fMutex);
 	auto port = std::make_shared<LooperPort>(fNextPort++, looper, window);
+	// Before others can find it: they must not use a looper that is still being made.
+	port->Lock(B_INFINITE_TIMEOUT);
 	fPorts[port->Id()] = port;
 	fLoopers[looper] = port;
 	return port;

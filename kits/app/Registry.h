@@ -29,6 +29,7 @@ class Registry {
 public:
 	static Registry& Default();
 
+	/// The port comes locked by the calling thread.
 	std::shared_ptr<LooperPort> AddLooper(BLooper* looper, BWindow* window);
 	void RemoveLooper(BLooper* looper);
 
