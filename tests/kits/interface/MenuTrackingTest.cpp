@@ -910,7 +910,8 @@ TEST_F(PopUpTest, AsynchronousGoReturnsAtOnceAndInvokes)
 
 TEST_F(PopUpTest, AsynchronousMenuDeletesItself)
 {
-	static std::atomic<int32> sDeleted(0);
+	static std::atomic<int32> sDeleted;
+	sDeleted = 0;
 	class GoingMenu : public BPopUpMenu {
 	public:
 		GoingMenu()
