@@ -1,17 +1,19 @@
 // SPDX-License-Identifier: MIT
 // Texts of BTranslationUtils. Styled text is a row of records, each with a header of words, high byte
 // first: its code, the header's bytes, the data's bytes. 'STXT' comes first, 'TEXT' holds the text and
-// 'STYL' its fonts and colours.
+// 'STYL' its fonts and colours (a flattened run array).
 #include <TranslationUtils.h>
 
+#include <cstdlib>
 #include <cstring>
+#include <memory>
 #include <string>
 #include <vector>
 
 #include <ByteOrder.h>
-#include <Font.h>
 #include <TextView.h>
 
+#include "interface/TextStyles.h"
 #include "translation/StreamBytes.h"
 
 namespace {
@@ -23,39 +25,12 @@ constexpr uint32 kStreamVersion = 100;
 constexpr uint32 kUnicode = 65535;
 constexpr size_t kRecordHeader = 12;
 
-// A flattened run array: this, a version, the number of runs, the runs.
-constexpr uint32 kRunsMagic = 'Ali!';
-constexpr size_t kRunNameLength = 64;
-
 class Bytes {
 public:
 	void AddWord(uint32 value)
 	{
 		value = B_HOST_TO_BENDIAN_INT32(value);
 		fText.append(reinterpret_cast<const char*>(&value), sizeof(value));
-	}
-
-	void AddShort(uint16 value)
-	{
-		value = B_HOST_TO_BENDIAN_INT16(value);
-		fText.append(reinterpret_cast<const char*>(&value), sizeof(value));
-	}
-
-	void AddFloat(float value)
-	{
-		uint32 word;
-		std::memcpy(&word, &value, sizeof(word));
-		AddWord(word);
-	}
-
-	void AddByte(uint8 value) { fText += static_cast<char>(value); }
-
-	/// Cut or filled up with zero bytes.
-	void AddName(const char* name)
-	{
-		std::string bytes(name);
-		bytes.resize(kRunNameLength - 1);
-		fText.append(bytes.c_str(), kRunNameLength);
 	}
 
 	void Add(const std::string& text) { fText += text; }
@@ -76,10 +51,18 @@ WordAt(const std::vector<uint8>& bytes, size_t place)
 }
 
 
-/// The text of the records. B_BAD_DATA when they are cut off or have no text.
+/// What the records hold.
+struct Contents {
+	std::string text;
+	BPrivate::RunArray runs;
+};
+
+
+/// B_BAD_DATA when a record is cut off or there is no text. Damaged styles are left out.
 status_t
-FindText(const std::vector<uint8>& bytes, std::string* text)
+ReadRecords(const std::vector<uint8>& bytes, Contents* contents)
 {
+	bool hasText = false;
 	size_t place = 0;
 	while (bytes.size() - place >= kRecordHeader) {
 		const uint32 magic = WordAt(bytes, place);
@@ -87,43 +70,26 @@ FindText(const std::vector<uint8>& bytes, std::string* text)
 		const uint64 dataSize = WordAt(bytes, place + 8);
 		if (headerSize < kRecordHeader || headerSize + dataSize > bytes.size() - place)
 			return B_BAD_DATA;
-		const size_t data = place + static_cast<size_t>(headerSize);
-		if (magic == kTextMagic) {
-			text->assign(
-				reinterpret_cast<const char*>(bytes.data()) + data, static_cast<size_t>(dataSize));
-			return B_OK;
-		}
-		place = data + static_cast<size_t>(dataSize);
+		const uint8* data = bytes.data() + place + headerSize;
+		if (magic == kTextMagic && !hasText) {
+			contents->text.assign(reinterpret_cast<const char*>(data), dataSize);
+			hasText = true;
+		} else if (magic == kStyleMagic && contents->runs == nullptr)
+			contents->runs = BPrivate::ReadFlatRuns(data, static_cast<ssize_t>(dataSize));
+		place += static_cast<size_t>(headerSize + dataSize);
 	}
-	return B_BAD_DATA;
+	return hasText && place == bytes.size() ? B_OK : B_BAD_DATA;
 }
 
 
-/// One run for all of the text: a text view has one font.
 std::string
 FlattenRuns(const BTextView* view)
 {
-	BFont font;
-	rgb_color color;
-	view->GetFontAndColor(0, &font, &color);
-	font_family family;
-	font_style style;
-	font.GetFamilyAndStyle(&family, &style);
-
-	Bytes runs;
-	runs.AddWord(kRunsMagic);
-	runs.AddWord(0);
-	runs.AddWord(1);
-	runs.AddWord(0); // the run's first byte
-	runs.AddName(family);
-	runs.AddName(style);
-	runs.AddFloat(font.Size());
-	runs.AddFloat(font.Shear());
-	runs.AddShort(font.Face());
-	for (uint8 part : {color.red, color.green, color.blue, color.alpha})
-		runs.AddByte(part);
-	runs.AddShort(0);
-	return runs.Text();
+	const BPrivate::RunArray runs(view->RunArray(0, view->TextLength()));
+	int32 size = 0;
+	std::unique_ptr<void, decltype(&std::free)> flat(
+		BTextView::FlattenRunArray(runs.get(), &size), &std::free);
+	return std::string(static_cast<const char*>(flat.get()), static_cast<size_t>(size));
 }
 
 } // namespace
@@ -150,11 +116,14 @@ BTranslationUtils::GetStyledText(
 	status_t status = BPrivate::ReadToEnd(fromStream, &bytes);
 	if (status != B_OK)
 		return status;
-	std::string text(bytes.begin(), bytes.end());
+	Contents contents;
 	if (bytes.size() >= kRecordHeader && WordAt(bytes, 0) == kStreamMagic)
-		status = FindText(bytes, &text);
+		status = ReadRecords(bytes, &contents);
+	else
+		contents.text.assign(bytes.begin(), bytes.end());
 	if (status == B_OK)
-		intoView->Insert(text.c_str(), static_cast<int32>(text.size()));
+		intoView->Insert(
+			contents.text.c_str(), static_cast<int32>(contents.text.size()), contents.runs.get());
 	return status;
 }
 

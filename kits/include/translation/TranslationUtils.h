@@ -26,7 +26,8 @@ public:
 	/// From the stream's present position to its end.
 	static BBitmap* GetBitmap(BPositionIO* stream, BTranslatorRoster* roster = NULL);
 
-	/// Inserts styled text ('STXT') or plain UTF-8 text at the view's caret, in the view's own font.
+	/// Inserts styled text ('STXT') or plain UTF-8 text at the view's caret; the styles count in a
+	/// stylable view.
 	/// Lock the view's window. Returns B_OK; B_BAD_VALUE for null; B_BAD_DATA or the stream's error,
 	/// nothing inserted.
 	static status_t GetStyledText(
@@ -34,7 +35,7 @@ public:
 	/// \a encoding: null or "UTF-8"; B_BAD_VALUE for another.
 	static status_t GetStyledText(BPositionIO* fromStream, BTextView* intoView,
 		const char* encoding, BTranslatorRoster* roster = NULL);
-	/// Writes the view's text as styled text with its font and colour. Lock the view's window. Returns
+	/// Writes the view's text as styled text with its fonts and colours. Lock the view's window. Returns
 	/// B_OK; B_BAD_VALUE for null; the stream's error.
 	static status_t PutStyledText(
 		BTextView* fromView, BPositionIO* intoStream, BTranslatorRoster* roster = NULL);

@@ -64,6 +64,29 @@ TEST_F(StyledTextTest, WrittenTextIsReadBack)
 }
 
 
+TEST_F(StyledTextTest, StylesAreReadBackIntoAStylableView)
+{
+	fView.SetStylable(true);
+	fView.SetText("one two");
+	const rgb_color red = make_color(255, 0, 0);
+	BFont large(be_plain_font);
+	large.SetSize(33);
+	fView.SetFontAndColor(4, 7, &large, B_FONT_ALL, &red);
+	const std::string bytes = Written();
+	fView.SetText("");
+	ASSERT_EQ(Read(bytes), B_OK);
+	ASSERT_STREQ(fView.Text(), "one two");
+	BFont font;
+	rgb_color color;
+	fView.GetFontAndColor(5, &font, &color);
+	EXPECT_EQ(font.Size(), 33);
+	EXPECT_EQ(color, red);
+	fView.GetFontAndColor(1, &font, &color);
+	EXPECT_NE(font.Size(), 33);
+	EXPECT_NE(color, red);
+}
+
+
 TEST_F(StyledTextTest, PlainTextIsInsertedAtTheCaret)
 {
 	fView.SetText("ad");
@@ -78,14 +101,22 @@ TEST_F(StyledTextTest, DamagedRecordsInsertNothing)
 	fView.SetText("text");
 	const std::string bytes = Written();
 	fView.SetText("kept");
-	// Up to where the text is whole.
-	for (size_t size = 12; size < 36; size++) {
+	for (size_t size = 12; size < bytes.size(); size++) {
+		// Without any styles it is a whole text.
+		if (size == 36)
+			continue;
 		EXPECT_EQ(Read(bytes.substr(0, size)), B_BAD_DATA) << size;
 		EXPECT_STREQ(fView.Text(), "kept") << size;
 	}
 	std::string damaged = bytes;
 	damaged[7] = 0;
 	EXPECT_EQ(Read(damaged), B_BAD_DATA);
+	// A run array that is none is left out; the caret is at the beginning.
+	damaged = bytes;
+	damaged[56] = 'x';
+	EXPECT_EQ(Read(damaged), B_OK);
+	EXPECT_STREQ(fView.Text(), "textkept");
+	fView.SetText("kept");
 	damaged = bytes;
 	damaged[24] = '\x7f';
 	EXPECT_EQ(Read(damaged), B_BAD_DATA);
