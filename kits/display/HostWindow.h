@@ -38,6 +38,10 @@ struct HostSizeLimits {
 };
 
 
+/// In a report of a move or size (bool): SetFrame() asked for it, so that the caller knows of it already.
+inline const char* const kAskedFor = "be:asked";
+
+
 /// Who hears from a host window. The calls come from the display's thread, or from a thread that injects
 /// input: hand the message to the looper and return. Take no looper's lock here and do not call the
 /// display, which holds its own lock. After the host window's destructor has begun nothing more comes.
@@ -54,7 +58,8 @@ public:
 	/// the window. While a button is held its moves and its release go to the window of the press.
 	/// B_KEY_DOWN, B_KEY_UP, B_UNMAPPED_KEY_DOWN, B_UNMAPPED_KEY_UP, B_MODIFIERS_CHANGED: as in the API,
 	/// to the active window.
-	/// B_WINDOW_ACTIVATED: "active". B_WINDOW_MOVED: "where". B_WINDOW_RESIZED: "width", "height".
+	/// B_WINDOW_ACTIVATED: "active". B_WINDOW_MOVED: "where". B_WINDOW_RESIZED: "width", "height". Both have
+	/// kAskedFor when they come of SetFrame().
 	/// B_MINIMIZE: "minimize" (the host already did it). What the host's zoom button does comes as a move
 	/// and a resize.
 	/// B_SCREEN_CHANGED: "frame", "mode". B_QUIT_REQUESTED: the close button.

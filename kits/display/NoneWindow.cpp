@@ -33,12 +33,14 @@ NoneWindow::SetFrame(BRect frame)
 	if (frame.LeftTop() != old.LeftTop()) {
 		auto message = std::make_unique<BMessage>(B_WINDOW_MOVED);
 		message->AddPoint("where", frame.LeftTop());
+		message->AddBool(kAskedFor, true);
 		fHub.Deliver(&fStacked, std::move(message));
 	}
 	if (frame.Width() != old.Width() || frame.Height() != old.Height()) {
 		auto message = std::make_unique<BMessage>(B_WINDOW_RESIZED);
 		message->AddInt32("width", frame.IntegerWidth());
 		message->AddInt32("height", frame.IntegerHeight());
+		message->AddBool(kAskedFor, true);
 		fHub.Deliver(&fStacked, std::move(message));
 	}
 }

@@ -218,19 +218,21 @@ QtDisplay::WindowOf(const StackedWindow* stacked) const
 
 
 void
-QtDisplay::ReportFrame(StackedWindow* window, BRect frame)
+QtDisplay::ReportFrame(StackedWindow* window, BRect frame, bool askedFor)
 {
 	BRect old = fHub.Frame(window);
 	fHub.SetFrame(window, frame);
 	if (frame.LeftTop() != old.LeftTop()) {
 		auto message = std::make_unique<BMessage>(B_WINDOW_MOVED);
 		message->AddPoint("where", frame.LeftTop());
+		message->AddBool(kAskedFor, askedFor);
 		fHub.Deliver(window, std::move(message));
 	}
 	if (frame.Width() != old.Width() || frame.Height() != old.Height()) {
 		auto message = std::make_unique<BMessage>(B_WINDOW_RESIZED);
 		message->AddInt32("width", frame.IntegerWidth());
 		message->AddInt32("height", frame.IntegerHeight());
+		message->AddBool(kAskedFor, askedFor);
 		fHub.Deliver(window, std::move(message));
 	}
 }

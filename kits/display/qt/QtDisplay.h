@@ -82,8 +82,8 @@ public:
 	bool Has(const QtHostWindow* window) const;
 	/// Null when it has gone.
 	QtWindow* WindowOf(const StackedWindow* stacked) const;
-	/// Tells the hub and, by messages, the window where it is now.
-	void ReportFrame(StackedWindow* window, BRect frame);
+	/// Tells the hub and, by messages, the window where it is now. \a askedFor: as its program wanted.
+	void ReportFrame(StackedWindow* window, BRect frame, bool askedFor);
 	/// The program's window at a place of the screen; not known where the host does not tell.
 	std::optional<StackedWindow*> WindowUnder(QPoint globalPosition) const;
 	/// Above which window \a window belongs.

@@ -70,7 +70,7 @@ void
 QtHostWindow::SetFrame(BRect frame)
 {
 	WithWindow([&](QtWindow& window) {
-		fDisplay.ReportFrame(&fStacked, frame);
+		fDisplay.ReportFrame(&fStacked, frame, true);
 		window.Place(frame);
 	});
 }

@@ -214,9 +214,10 @@ QtWindow::Place(BRect frame)
 	QRect wanted(static_cast<int>(frame.left), static_cast<int>(frame.top),
 		std::max(frame.IntegerWidth() + 1, 1), std::max(frame.IntegerHeight() + 1, 1));
 	ApplyLimits();
-	if (wanted == geometry())
+	if (wanted == (fRequested.empty() ? geometry() : fRequested.back()))
 		return;
-	if (isVisible())
+	// The host answers for a hidden window, too, and maybe only after it was shown.
+	if (handle() != nullptr)
 		fRequested.push_back(wanted);
 	setGeometry(wanted);
 }
@@ -388,7 +389,7 @@ QtWindow::GeometryChanged()
 	} else
 		fRequested.clear();
 	if (isVisible())
-		fDisplay.ReportFrame(fStacked, RectOf(now));
+		fDisplay.ReportFrame(fStacked, RectOf(now), false);
 }
 
 
