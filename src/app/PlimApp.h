@@ -61,7 +61,6 @@ public:
 private:
 	friend class PlimWin;
 
-	void InstallDocumentType(const char* type, const char* description);
 	void NewProject();
 	void SaveProject();
 	void SaveProjectAs();

@@ -2,6 +2,8 @@
 
 #include "codegen/ConfirmGenerateWin.h"
 
+#include <algorithm>
+
 #include <Box.h>
 #include <Button.h>
 #include <ListView.h>
@@ -13,11 +15,15 @@
 #include <TextView.h>
 
 #include "app/Dialogs.h"
+#include "app/MainWindow.h"
 #include "app/WindowGuard.h"
 #include "codegen/CodeGenerator.h"
 #include "codegen/FormParts.h"
 #include "designer/DesignForm.h"
 #include "model/AppComponent.h"
+#include "project/Project.h"
+#include "project/ProjectOperation.h"
+#include "project/ProjectWin.h"
 
 namespace {
 
@@ -35,7 +41,7 @@ constexpr float kMargin = 5;
 constexpr float kBoxInset = 8;
 constexpr float kFirstFieldTop = 18;
 constexpr float kFieldStep = 25;
-constexpr float kDivider = 95;
+constexpr float kLabelGap = 8;
 
 struct setting_field {
 	const char* viewName;
@@ -157,6 +163,10 @@ ConfirmGenerateWin::AddSettings(BView* parent)
 		MakeBox(BRect(kMargin, kSettingsTop, right, kSettingsBottom), "Application Settings:");
 	parent->AddChild(box);
 
+	float divider = 0;
+	for (const setting_field& setting : kSettings)
+		divider = std::max(divider, box->StringWidth(setting.label) + kLabelGap);
+
 	BRect frame(
 		kBoxInset, kFirstFieldTop, box->Bounds().right - kBoxInset, kFirstFieldTop + kFieldStep);
 	for (const setting_field& setting : kSettings) {
@@ -164,7 +174,7 @@ ConfirmGenerateWin::AddSettings(BView* parent)
 		BTextControl* field =
 			new BTextControl(frame, setting.viewName, setting.label, value.String(), nullptr);
 		box->AddChild(field);
-		field->SetDivider(kDivider);
+		field->SetDivider(divider);
 		field->TextView()->MakeEditable(false);
 		field->TextView()->MakeSelectable(false);
 		frame.OffsetBy(0, kFieldStep);
@@ -199,5 +209,16 @@ ConfirmGenerateWin::Generate()
 	fGenerateButton->SetEnabled(false);
 	fCancelButton->SetEnabled(false);
 	UpdateIfNeeded();
-	fGenerator->GenerateApp();
+
+	WindowRelease release;
+	PlimWin* mainWindow = MainWindow();
+	if (mainWindow == nullptr) {
+		fGenerator->GenerateApp();
+		return;
+	}
+	TProject* project = mainWindow->ProjectWindow()->Project();
+	TProjectOperation operation(project);
+	// The project that was shown may have been closed.
+	if (operation.IsBegun() && project->App() == fApp)
+		fGenerator->GenerateApp();
 }
