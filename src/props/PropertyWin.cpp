@@ -9,7 +9,7 @@
 #include <ListView.h>
 #include <Screen.h>
 
-#include "app/Preferences.h"
+#include "app/WindowFrame.h"
 #include "app/WindowGuard.h"
 #include "model/Component.h"
 #include "model/Event.h"
@@ -73,7 +73,7 @@ PropertyWin::QuitRequested()
 		Hide();
 		return false;
 	}
-	AppSettings.SetRect(kFrameSetting, Frame());
+	StoreWindowFrame(this, kFrameSetting);
 	return true;
 }
 
@@ -301,11 +301,7 @@ PropertyWin::PlaceWindow()
 		MoveTo(place);
 		ResizeTo(kWidth, kHeight);
 	}
-	BRect frame;
-	if (AppSettings.FindRect(kFrameSetting, &frame) == B_OK) {
-		MoveTo(frame.LeftTop());
-		ResizeTo(frame.Width(), frame.Height());
-	}
+	RestoreWindowFrame(this, kFrameSetting);
 }
 
 
