@@ -35,8 +35,8 @@ AddFields(BView* page)
 		new BMenuField(BRect(10, 94, 250, 118), "mfDisabled", "Disabled:", MakeSizes("off"));
 	disabled->SetEnabled(false);
 	BMenu* colours = new BMenu("Colour");
-	colours->AddItem(new BMenuItem("Red", new BMessage('colr')));
-	colours->AddItem(new BMenuItem("Green", new BMessage('colr')));
+	colours->AddItem(new BMenuItem("Light red", new BMessage('colr')));
+	colours->AddItem(new BMenuItem("Light green", new BMessage('colr')));
 	BMenuField* plain = new BMenuField(BRect(10, 126, 250, 150), "mfPlain", "Plain:", colours);
 	for (BMenuField* field : {fitted, fixed, disabled, plain}) {
 		field->SetDivider(70);
