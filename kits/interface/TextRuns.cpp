@@ -53,7 +53,7 @@ void
 CopyName(char* to, const char* from, size_t size)
 {
 	memset(to, 0, size);
-	strncpy(to, from, size - 1);
+	memcpy(to, from, strnlen(from, size - 1));
 }
 
 } // namespace
