@@ -30,6 +30,7 @@ QUIT = (32, 145)
 HELP_MENU = (83, 10)
 ABOUT = (110, 57)
 BACKGROUND = (250, 30)
+PANEL = (216, 216, 216)
 QUESTION = "The 'Application' project has changed. Save before closing?"
 DIALOG = "Generate Source files"
 # In the dialog.
@@ -126,6 +127,11 @@ class Session:
         check(self.program.returncode == 0, f"it ended with {self.program.returncode}: {self.output()[-3000:]}")
         for complaint in ("libbe:", "BE_CHECK_LOCKS:"):
             check(complaint not in self.output(), f"the kits complained: {self.output()[-3000:]}")
+
+
+def shown_in_row(desktop, y, left, right):
+    screen = desktop.picture()
+    return {screen.pixel(x, y) for x in range(left, right)}
 
 
 def begin_a_project(desktop, program, pictures):
@@ -225,7 +231,11 @@ def tell_of_a_bad_project(desktop, program, pictures):
     settings = desktop.folder / ".config" / "Plim_Settings"
     settings.write_bytes(b"\xff" * 1000)
     session = Session(desktop, program, pictures, bad)
-    session.wait_for_active("Warning")
+    warning = session.wait_for_active("Warning")
+    left, top, width, _ = desktop.geometry(warning)
+    # Below the title nothing is drawn: whatever lies above the box would show, as the floating palette must not.
+    strip = (left + 60, left + width - 5)
+    wait_for("nothing covers the box", lambda: shown_in_row(desktop, top + 3, *strip) == {PANEL})
     session.save_picture("bad-project")
     desktop.key("Return")
     desktop.wait_for_no_window("Warning")

@@ -252,12 +252,32 @@ QWindow*
 QtDisplay::WindowForTransients(const QtWindow* window) const
 {
 	auto focus = dynamic_cast<QtWindow*>(QGuiApplication::focusWindow());
-	if (focus != nullptr && focus != window)
+	bool hasFocus = focus != nullptr && focus != window;
+	// A modal window belongs above the floating ones, which window managers keep above the others.
+	if (window->Stacked()->IsModal() && !(hasFocus && focus->Stacked()->IsModal())) {
+		QtWindow* floating = FloatingWindow();
+		if (floating != nullptr)
+			return floating;
+	}
+	if (hasFocus)
 		return focus;
 	for (auto other = fWindows.rbegin(); other != fWindows.rend(); ++other) {
 		QtWindow* candidate = (*other)->Window();
 		if (candidate != nullptr && candidate != window && candidate->isVisible()
 			&& candidate->type() == Qt::Window)
+			return candidate;
+	}
+	return nullptr;
+}
+
+
+/// The youngest floating window that is shown, or none.
+QtWindow*
+QtDisplay::FloatingWindow() const
+{
+	for (auto other = fWindows.rbegin(); other != fWindows.rend(); ++other) {
+		QtWindow* candidate = (*other)->Window();
+		if (candidate != nullptr && candidate->isVisible() && candidate->Stacked()->IsFloating())
 			return candidate;
 	}
 	return nullptr;

@@ -106,6 +106,7 @@ private:
 	void ScreensChanged();
 	void FocusChanged(QWindow* focus);
 	void ApplicationStateChanged(bool active);
+	QtWindow* FloatingWindow() const;
 	void HideFloatingWindows();
 	void OverlayChanged();
 	void RepaintOverlay();
