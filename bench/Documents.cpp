@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: MIT
-// Writes a project of one form with many buttons, for bench/compare.
+// Writes a project of forms with many buttons, for bench/compare and bench/compare_start.
 //
-// usage: bench_documents COUNT FOLDER
+// usage: bench_documents COUNT FOLDER [FORMS]
+//
+// COUNT: of the buttons on each form. FORMS: how many, one to begin with.
 
 #include <cstdio>
 #include <cstdlib>
@@ -17,8 +19,8 @@
 int
 main(int argc, char** argv)
 {
-	if (argc != 3) {
-		fprintf(stderr, "usage: %s COUNT FOLDER\n", argv[0]);
+	if (argc != 3 && argc != 4) {
+		fprintf(stderr, "usage: %s COUNT FOLDER [FORMS]\n", argv[0]);
 		return 2;
 	}
 	setenv("BE_DISPLAY", "none", 1);
@@ -30,13 +32,15 @@ main(int argc, char** argv)
 
 	TProject project(FORM_HIDDEN);
 	project.App()->SetPropertyValue("Name", "Bench");
-	TDesignForm* form = project.NewForm();
-	PlaceButtons(form, atoi(argv[1]));
-	BString folder(argv[2]);
-	BString path(folder);
-	path << "/Form1.frm";
-	form->SetFilename(path.String());
-	path = folder;
+	const int formCount = argc == 4 ? atoi(argv[3]) : 1;
+	for (int i = 0; i < formCount; i++) {
+		TDesignForm* form = project.NewForm();
+		PlaceButtons(form, atoi(argv[1]));
+		BString path(argv[2]);
+		path << "/" << form->ComponentName() << ".frm";
+		form->SetFilename(path.String());
+	}
+	BString path(argv[2]);
 	path << "/bench.plim";
 	return project.SaveToFile(path.String(), true) ? 0 : 3;
 }
