@@ -13,6 +13,7 @@
 #include "ButtonForm.h"
 #include "app/Preferences.h"
 #include "designer/DesignForm.h"
+#include "model/Diagnostics.h"
 
 namespace {
 
@@ -31,7 +32,7 @@ FormFile(int32 count)
 
 
 void
-LoadForm(benchmark::State& state)
+Load(benchmark::State& state)
 {
 	const std::string path = FormFile(state.range(0));
 	for (auto _ : state) {
@@ -46,7 +47,25 @@ LoadForm(benchmark::State& state)
 	std::filesystem::remove(path);
 }
 
+/// As plimgen loads: nobody sees the diagnostics, so they are not put together.
+void
+LoadForm(benchmark::State& state)
+{
+	ShowDiagnostics(false);
+	Load(state);
+}
+
+
+/// With the diagnostics of the designer, some fifty lines for each button, into /dev/null.
+void
+LoadFormTalking(benchmark::State& state)
+{
+	ShowDiagnostics(true);
+	Load(state);
+}
+
 BENCHMARK(LoadForm)->RangeMultiplier(10)->Range(10, 10000)->Unit(benchmark::kMillisecond);
+BENCHMARK(LoadFormTalking)->Arg(1000)->Unit(benchmark::kMillisecond);
 
 } // namespace
 

@@ -193,11 +193,10 @@ TVisualComponent::GetPropertyValue(const char* name)
 void
 TVisualComponent::SetPropertyValue(const char* name, const char* value)
 {
-	if (name != nullptr && value != nullptr)
+	TViewLock lock(DTView());
+	if (lock.IsLocked() && name != nullptr && value != nullptr)
 		ApplyToView(name, value);
 	TComponent::SetPropertyValue(name, value);
-
-	TViewLock lock(DTView());
 	if (lock.IsLocked())
 		DTView()->Invalidate();
 }
@@ -212,10 +211,6 @@ TVisualComponent::OnSetConstructorParams(BString&)
 void
 TVisualComponent::ApplyToView(const char* name, const char* value)
 {
-	TViewLock lock(DTView());
-	if (!lock.IsLocked())
-		return;
-
 	const int edge = EdgeIndex(name);
 	if (edge >= 0)
 		SetEdge(DTView(), edge, strtol(value, nullptr, 10));

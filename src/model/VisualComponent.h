@@ -26,5 +26,6 @@ public:
 	void OnSetConstructorParams(BString& text) override;
 
 private:
+	// The view is there, its window locked.
 	void ApplyToView(const char* name, const char* value);
 };
