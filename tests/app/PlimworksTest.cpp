@@ -142,7 +142,7 @@ TEST_F(PlimworksTest, APaletteOfTwentyEntriesKeepsItsSizeAndScrolls)
 {
 	fEnvironment = "TEST_ENTRIES=20";
 	const command_result result = RunScript("wait-window Components\nclick-view Entry1\nmove 40 "
-	                                        "100\nwheel 200\nclick-view Entry20\nquit\n",
+											"100\nwheel 200\nclick-view Entry20\nquit\n",
 		"", ProgramWith({"counted"}));
 	ExpectCleanEnd(result);
 	EXPECT_TRUE(Contains(result.output, "20 Components in ")) << result.output;
