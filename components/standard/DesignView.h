@@ -8,6 +8,11 @@
 #include <ComponentKit.h>
 #include <View.h>
 
+/// Offers a message of the design surface to \a component, whose view got it. True when that was all it needs.
+///
+/// What is dropped on a component that holds no others goes to the view beneath.
+bool OfferDesignMessage(TComponent* component, BMessage* message);
+
 /// A view of class \a View that looks like itself but does not act like it: what the mouse does to it
 /// goes to its component, and it never takes the keyboard.
 ///
@@ -41,7 +46,7 @@ public:
 
 	void MessageReceived(BMessage* message) override
 	{
-		if (!fComponent->HandleComponentDesignMessage(message))
+		if (!OfferDesignMessage(fComponent, message))
 			View::MessageReceived(message);
 	}
 
@@ -57,6 +62,7 @@ public:
 	DesignGlass(TComponent* component, BView* covered);
 
 	void MouseDown(BPoint where) override;
+	void MessageReceived(BMessage* message) override;
 
 private:
 	TComponent* fComponent;

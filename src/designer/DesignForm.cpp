@@ -6,14 +6,19 @@
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
+#include <vector>
 
-#include <Autolock.h>
+#include <Message.h>
 
 #include "app/Dialogs.h"
+#include "app/WindowGuard.h"
 #include "designer/DesignFormView.h"
+#include "designer/FormHost.h"
+#include "designer/Inspector.h"
 #include "model/ColorText.h"
 #include "model/Diagnostics.h"
 #include "model/Property.h"
+#include "model/PropertyStore.h"
 #include "props/PropertyEditor.h"
 
 namespace {
@@ -26,27 +31,40 @@ struct form_shortcut {
 	uint32 command;
 };
 constexpr form_shortcut kShortcuts[] = {{'S', 8}, {'R', 13}, {'L', 11}, {'V', 6}};
+constexpr uint32 kMsgPaste = 6;
 constexpr uint32 kMsgSavePanel = 14;
 
-void
+/// Returns whether the property has another text now.
+bool
 WriteEdge(TComponent* component, const char* name, float edge)
 {
-	TProperty* property = component->FindProperty(name);
+	const TProperty* property = component->FindProperty(name);
 	if (property == nullptr || property->Editor() == nullptr)
-		return;
+		return false;
 	char text[1024];
 	snprintf(text, sizeof(text), "%d", static_cast<int>(lroundf(edge)));
+	const bool isOther = strcmp(property->Value(), text) != 0;
 	property->Editor()->SetValue(text, false);
+
+	// The component may have refused, and may have built its properties anew when it was asked.
+	property = component->FindProperty(name);
+	if (property == nullptr || strcmp(property->Value(), text) != 0)
+		return false;
+	// The editor wrote the property alone.
+	component->PropertyStore()->SetString(name, text);
+	return isOther;
 }
 
 
-void
+/// Returns whether a property has another text now.
+bool
 WriteEdges(TComponent* component, BRect frame)
 {
-	WriteEdge(component, "Left", frame.left);
-	WriteEdge(component, "Top", frame.top);
-	WriteEdge(component, "Right", frame.right);
-	WriteEdge(component, "Bottom", frame.bottom);
+	const bool left = WriteEdge(component, "Left", frame.left);
+	const bool top = WriteEdge(component, "Top", frame.top);
+	const bool right = WriteEdge(component, "Right", frame.right);
+	const bool bottom = WriteEdge(component, "Bottom", frame.bottom);
+	return left || top || right || bottom;
 }
 
 } // namespace
@@ -81,9 +99,21 @@ void
 TDesignForm::Show()
 {
 	BWindow::Show();
-	BAutolock lock(this);
-	if (lock.IsLocked())
-		UpdateWindowPosition();
+	{
+		WindowGuard guard(this);
+		if (guard.IsLocked())
+			UpdateWindowPosition();
+	}
+	DesignFormShown(true);
+}
+
+
+void
+TDesignForm::Hide()
+{
+	BWindow::Hide();
+	if (!fClosing)
+		DesignFormShown(false);
 }
 
 
@@ -99,6 +129,7 @@ TDesignForm::MessageReceived(BMessage* message)
 			ReplyToSave(message);
 			break;
 
+		case kMsgPaste:
 		case kMsgSavePanel:
 			fDesignView->MessageReceived(message);
 			break;
@@ -127,10 +158,25 @@ TDesignForm::QuitRequested()
 
 
 void
+TDesignForm::WindowActivated(bool active)
+{
+	BWindow::WindowActivated(active);
+	DesignFormActivated(active);
+}
+
+
+void
+TDesignForm::MouseDown(BPoint)
+{
+	ShowInInspector();
+}
+
+
+void
 TDesignForm::FrameMoved(BPoint origin)
 {
 	BWindow::FrameMoved(origin);
-	UpdateWindowPosition();
+	FollowWindow();
 }
 
 
@@ -139,7 +185,7 @@ TDesignForm::FrameResized(float width, float height)
 {
 	fDesignView->Invalidate();
 	BWindow::FrameResized(width, height);
-	UpdateWindowPosition();
+	FollowWindow();
 }
 
 
@@ -158,8 +204,8 @@ TDesignForm::SetPropertyValue(const char* name, const char* value)
 	if (name == nullptr || value == nullptr)
 		return;
 
-	BAutolock lock(this);
-	if (!lock.IsLocked())
+	WindowGuard guard(this);
+	if (!guard.IsLocked())
 		return;
 
 	if (strcmp(name, "Title") == 0) {
@@ -183,6 +229,22 @@ bool
 TDesignForm::Modified() const
 {
 	return fDesignView->Modified();
+}
+
+
+void
+TDesignForm::SetModified(bool modified)
+{
+	TFormComponent::SetModified(modified);
+	if (modified && fDesignView != nullptr)
+		fDesignView->SetModified(true);
+}
+
+
+bool
+TDesignForm::HandleComponentContextMessage(BMessage* message)
+{
+	return fDesignView->HandleComponentCommand(message);
 }
 
 
@@ -236,6 +298,51 @@ TDesignForm::ClearComponents(bool deleteComponents)
 }
 
 
+void
+TDesignForm::DesignFormShown(bool shown)
+{
+	if (shown) {
+		if (!fClosing)
+			Inspector::Show(this, fDesignView);
+		return;
+	}
+
+	std::vector<const TComponent*> components;
+	for (int32 i = 0; i < CountComponents(); i++)
+		components.push_back(ComponentAt(i));
+	Inspector::LeaveForm(this, components);
+}
+
+
+void
+TDesignForm::DesignFormActivated(bool active)
+{
+	if (fClosing)
+		return;
+	if (!active) {
+		SelectInForm(false);
+		return;
+	}
+	fDesignView->DeselectForms();
+	SelectInForm(true);
+	ShowInInspector();
+}
+
+
+void
+TDesignForm::ComponentSelected(TComponent* component)
+{
+	fDesignView->ComponentSelected(component);
+}
+
+
+void
+TDesignForm::ComponentMoved(TComponent* component, BPoint point)
+{
+	fDesignView->ComponentMoved(component, point);
+}
+
+
 bool
 TDesignForm::IsDropWaiting()
 {
@@ -257,17 +364,25 @@ TDesignForm::DoneDroppingComponent()
 }
 
 
+bool
+TDesignForm::AdoptComponent(TComponent* component)
+{
+	return fDesignView->AdoptComponent(component);
+}
+
+
 void
 TDesignForm::UpdateWindowPosition()
 {
-	WriteEdges(this, Frame());
+	WriteFrame(this, Frame());
 }
 
 
 void
 TDesignForm::UpdateComponentPosition(TComponent* component, BRect frame)
 {
-	WriteEdges(component, frame);
+	if (WriteFrame(component, frame))
+		fDesignView->SetModified(true);
 }
 
 
@@ -321,6 +436,47 @@ TDesignForm::InitControls()
 	SetDTFormView(fDesignView);
 	for (const form_shortcut& shortcut : kShortcuts)
 		AddShortcut(shortcut.key, B_COMMAND_KEY, new BMessage(shortcut.command), fDesignView);
+}
+
+
+/// Writes the edges of \a frame into the component's properties, and has them shown. Returns whether a text changed.
+bool
+TDesignForm::WriteFrame(TComponent* component, BRect frame)
+{
+	const bool isOther = WriteEdges(component, frame);
+	// The property window goes before the forms do when the program ends.
+	if (!fClosing)
+		Inspector::Refresh();
+	return isOther;
+}
+
+
+/// The window has another frame: it was moved by the user, or by its properties, or placed by the window system.
+void
+TDesignForm::FollowWindow()
+{
+	if (WriteFrame(this, Frame()) && IsActive())
+		fDesignView->SetModified(true);
+}
+
+
+/// Selects the form's component, or not, and none of the components on it.
+void
+TDesignForm::SelectInForm(bool formSelected)
+{
+	DesignerSelect(formSelected);
+	for (int32 i = 0; i < CountComponents(); i++)
+		ComponentAt(i)->DesignerSelect(false);
+	fDesignView->Invalidate();
+	fDesignView->RepaintChildren();
+}
+
+
+/// Points the property window at the form, unless it shows the form already.
+void
+TDesignForm::ShowInInspector()
+{
+	Inspector::ShowUnlessShown(this, fDesignView);
 }
 
 

@@ -35,9 +35,12 @@ public:
 	virtual ~TDesignForm();
 
 	// BWindow
+	/// Also points the property window at the form.
 	void Show() override;
+	void Hide() override;
 	void MessageReceived(BMessage* message) override;
 	bool QuitRequested() override;
+	void WindowActivated(bool active) override;
 	void FrameMoved(BPoint origin) override;
 	void FrameResized(float width, float height) override;
 
@@ -50,6 +53,9 @@ public:
 	void SetPropertyValue(const char* name, const char* value) override;
 	bool PropertyModified(const char* name, const char* oldValue, const char* newValue) override;
 	bool Modified() const override;
+	void SetModified(bool modified) override;
+	/// A command of a component's menu; see TDesignFormView::HandleComponentCommand().
+	bool HandleComponentContextMessage(BMessage* message) override;
 
 	// TComponentOwner, all forwarded to the design view
 	bool ComponentPropertyModified(TComponent* component, const char* name, const char* oldValue,
@@ -61,10 +67,23 @@ public:
 	TComponent* RemoveComponent(int32 index) override;
 	void ClearComponents(bool deleteComponents) override;
 
+	// TFormDesigner
+	/// Points the property window at the form, or away from it and its components.
+	void DesignFormShown(bool shown) override;
+	/// Selects the form itself and no component, here and in the project's other forms; selects nothing when the
+	/// window is no longer active.
+	void DesignFormActivated(bool active) override;
+
 	// TFormDesigner, forwarded to the design view
+	void ComponentSelected(TComponent* component) override;
+	void ComponentMoved(TComponent* component, BPoint point) override;
 	bool IsDropWaiting() override;
 	TComponent* CreateComponent(BView* parent, BRect frame) override;
 	void DoneDroppingComponent() override;
+	bool AdoptComponent(TComponent* component) override;
+
+	/// A press beside the components: points the property window at the form.
+	virtual void MouseDown(BPoint where);
 
 	/// Lets the window really close from now on.
 	void OKToClose(bool closing) { fClosing = closing; }
@@ -72,7 +91,7 @@ public:
 	/// Writes the window's edges, rounded, into the editors of "Left", "Top", "Right" and "Bottom".
 	void UpdateWindowPosition();
 
-	/// The same for \a component and \a frame, in its parent's coordinates.
+	/// The same for \a component and \a frame, in its parent's coordinates. Marks the form modified if that is new.
 	void UpdateComponentPosition(TComponent* component, BRect frame);
 
 	// Forwarded to the design view
@@ -90,6 +109,10 @@ public:
 
 private:
 	void InitControls();
+	bool WriteFrame(TComponent* component, BRect frame);
+	void FollowWindow();
+	void SelectInForm(bool formSelected);
+	void ShowInInspector();
 	bool ApplyEdge(const char* name, const char* value);
 	bool ApplyColor(const char* name, const char* value);
 	void ReplyToLoad(BMessage* message);

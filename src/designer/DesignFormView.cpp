@@ -4,6 +4,9 @@
 
 #include <cstring>
 
+#include <FilePanel.h>
+#include <PopUpMenu.h>
+
 #include "designer/DesignForm.h"
 #include "designer/FormHost.h"
 #include "designer/FormReader.h"
@@ -17,7 +20,6 @@ namespace {
 
 constexpr rgb_color kSurfaceColor = {216, 216, 216, 255};
 constexpr rgb_color kSelectionColor = {0, 200, 200, 255};
-constexpr int32 kNameSize = 80;
 
 } // namespace
 
@@ -125,13 +127,11 @@ TDesignFormView::CreateComponent(BView* parent, BRect frame)
 		return nullptr;
 	}
 
-	char name[kNameSize];
-	GetNewComponentName(component, this, name, sizeof(name));
-	component->SetComponentName(name);
-	component->SetPropertyValue("Name", name);
-	fForm->UpdateComponentPosition(component, frame);
+	NameComponent(component, frame);
 	PrintDiagnostic("Creating Component '%s'\n", component->ComponentName());
 	AddComponent(component);
+	SetModified(true);
+	SelectNew(component);
 	return component;
 }
 

@@ -3,11 +3,16 @@
 
 #pragma once
 
+#include <memory>
+
 #include <View.h>
 
 #include "model/FormComponent.h"
 #include "model/FormDesigner.h"
 
+class BFilePanel;
+class BMenu;
+class BPopUpMenu;
 class TDesignForm;
 class TLoadReport;
 class TPaletteEntry;
@@ -26,6 +31,11 @@ public:
 
 	// BView
 	void Draw(BRect updateRect) override;
+	/// Places the waiting palette entry's component, selects the form, or opens the form's menu.
+	void MouseDown(BPoint where) override;
+	/// Prints the key: the surface has no keyboard commands but the window's shortcuts.
+	void KeyDown(const char* bytes, int32 numBytes) override;
+	void MessageReceived(BMessage* message) override;
 
 	// TComponent
 	/// A new value of "Name" becomes the form's name. Always true.
@@ -47,6 +57,37 @@ public:
 	/// \a frame: in \a parent's coordinates. Returns none when no entry waits or it makes none.
 	TComponent* CreateComponent(BView* parent, BRect frame) override;
 	void DoneDroppingComponent() override;
+	bool AdoptComponent(TComponent* component) override;
+	/// Makes \a component the only selected one, and shows it in the property window.
+	void ComponentSelected(TComponent* component) override;
+	/// Shows the new place of \a component in the property window, if that shows it.
+	void ComponentMoved(TComponent* component, BPoint point) override;
+
+	/// Whether \a component is one of this form's, at any depth; it may be gone.
+	bool Lists(const TComponent* component) const;
+
+	/// Draws every component anew, with its selection marks.
+	void RepaintChildren();
+
+	/// Deselects every form of the project. Locks each in turn; this window's lock is given up meanwhile.
+	void DeselectForms();
+
+	/// Fill the two menus anew.
+	void InitComponentMenu();
+	void InitFormMenu();
+
+	/// Writes \a component's class, frame, properties and events into \a message, for the clipboard.
+	void StoreComponent(TComponent* component, BMessage* message);
+
+	/// Makes a component from a flattened record of StoreComponent(), at the pointer, under a new name.
+	///
+	/// Null, with nothing changed, when the record is damaged or no component library offers its class.
+	TComponent* RetrieveComponent(const void* record, ssize_t size);
+
+	/// A command of a component's menu, on the component that the property window shows.
+	///
+	/// True when it was finished here; false for those that the component may answer too.
+	bool HandleComponentCommand(BMessage* message);
 
 	/// Writes the form to \a path, which becomes its file. Locks the window where it reads views.
 	///
@@ -70,6 +111,33 @@ public:
 	void SetAsMainForm(bool isMainForm) { fIsMainForm = isMainForm; }
 
 private:
+	// Placing, selecting and moving with the mouse
+	void PlaceComponent(BPoint where);
+	void NameComponent(TComponent* component, BRect frame);
+	void SelectNew(TComponent* component);
+	void SelectForm();
+	void MoveComponent(BMessage* message);
+	void ResizeComponent(BMessage* message);
+	void TakeFromContainer(TComponent* component);
+	TComponent* FindComponent(const BMessage* message, bool* dropped, BPoint* corner) const;
+
+	// Commands
+	void OpenFormMenu(BPoint where);
+	void OpenComponentMenu(BMessage* message);
+	void Paste();
+	void SaveToItsFile();
+	void SaveAsChosen(BMessage* message);
+	void SaveOrWarn(const char* path);
+	void LoadTestForm();
+	void LayOutAfresh();
+	void DeleteAllComponents();
+	bool DeleteComponent(TComponent* component);
+	void MoveChildrenUp(TComponent* component, BView* parent);
+	bool CopyComponent(TComponent* component);
+
+	std::unique_ptr<BPopUpMenu> fComponentMenu;
+	std::unique_ptr<BPopUpMenu> fFormMenu;
+	std::unique_ptr<BFilePanel> fSavePanel;
 	TDesignForm* fForm;
 	char fFilename[256];
 	bool fModified;

@@ -15,6 +15,7 @@
 #include "model/Diagnostics.h"
 #include "model/Event.h"
 #include "model/Property.h"
+#include "model/ViewLock.h"
 #include "palette/PaletteCatalog.h"
 #include "palette/PaletteEntry.h"
 
@@ -34,14 +35,16 @@ TFormReader::Read(const char* path)
 		return false;
 	fPath = path;
 
-	if (!fForm->LockLooper())
-		return false;
 	BMessage part;
-	if (file.FindMessage("_FormProperties", &part) == B_OK)
-		ReadFormProperties(part);
-	if (file.FindMessage("_FormEvents", &part) == B_OK)
-		ReadFormEvents(part);
-	fForm->UnlockLooper();
+	{
+		TViewLock lock(fForm);
+		if (!lock.IsLocked())
+			return false;
+		if (file.FindMessage("_FormProperties", &part) == B_OK)
+			ReadFormProperties(part);
+		if (file.FindMessage("_FormEvents", &part) == B_OK)
+			ReadFormEvents(part);
+	}
 
 	if (file.FindMessage("Components", &part) != B_OK) {
 		PrintDiagnostic("No components found for '%s'\n", fForm->DesignWindow()->ComponentName());
@@ -136,9 +139,10 @@ TFormReader::CreateComponent(const char* savedName, const BMessage& record)
 	}
 
 	TComponent* component = nullptr;
-	if (fForm->LockLooper()) {
-		component = entry->CreateComponent(fForm, fForm, frame);
-		fForm->UnlockLooper();
+	{
+		TViewLock lock(fForm);
+		if (lock.IsLocked())
+			component = entry->CreateComponent(fForm, fForm, frame);
 	}
 	if (component == nullptr) {
 		PrintDiagnostic("Warning: Unable to create component '%s'\n", savedName);
@@ -164,7 +168,8 @@ TFormReader::CreateComponent(const char* savedName, const BMessage& record)
 void
 TFormReader::ReadProperties(TComponent* component, const BMessage& properties)
 {
-	if (!fForm->LockLooper())
+	TViewLock lock(fForm);
+	if (!lock.IsLocked())
 		return;
 	char* name;
 	type_code type;
@@ -178,14 +183,14 @@ TFormReader::ReadProperties(TComponent* component, const BMessage& properties)
 		if (property != nullptr)
 			property->ReadExtendedData(&properties);
 	}
-	fForm->UnlockLooper();
 }
 
 
 void
 TFormReader::ReadEvents(TComponent* component, const BMessage& events)
 {
-	if (!fForm->LockLooper())
+	TViewLock lock(fForm);
+	if (!lock.IsLocked())
 		return;
 	char* name;
 	type_code type;
@@ -194,7 +199,6 @@ TFormReader::ReadEvents(TComponent* component, const BMessage& events)
 		if (*name != '\0' && events.FindBool(name, &selected) == B_OK)
 			component->SetEventSelection(name, selected);
 	}
-	fForm->UnlockLooper();
 }
 
 
@@ -239,7 +243,8 @@ TFormReader::Nest(TComponent* child, TComponent* owner, const placement& place)
 		return;
 	}
 
-	if (!fForm->LockLooper())
+	TViewLock lock(fForm);
+	if (!lock.IsLocked())
 		return;
 	BView* view = child->DTView();
 	view->RemoveSelf();
@@ -247,7 +252,6 @@ TFormReader::Nest(TComponent* child, TComponent* owner, const placement& place)
 	container->AddComponent(child);
 	view->MoveTo(place.frame.LeftTop());
 	view->ResizeTo(place.frame.right - place.frame.left, place.frame.bottom - place.frame.top);
-	fForm->UnlockLooper();
 }
 
 

@@ -10,6 +10,7 @@
 #include "model/Diagnostics.h"
 #include "model/Event.h"
 #include "model/Property.h"
+#include "model/ViewLock.h"
 
 namespace {
 
@@ -110,11 +111,12 @@ TFormWriter::AddPlace(TComponent* component)
 	if (fProperties.AddString("_ClassName", component->ClassName()) != B_OK)
 		PrintDiagnostic("Warning: Unable to add class name\n");
 
-	if (fForm->LockLooper()) {
-		BView* view = component->DTView();
-		if (view == nullptr || fProperties.AddRect("_Frame", view->Frame()) != B_OK)
+	{
+		TViewLock lock(fForm);
+		const BView* view = component->DTView();
+		if (lock.IsLocked()
+			&& (view == nullptr || fProperties.AddRect("_Frame", view->Frame()) != B_OK))
 			PrintDiagnostic("Warning: Unable to add frame\n");
-		fForm->UnlockLooper();
 	}
 
 	if (component->Owner() == nullptr || fForm->IsForm(component->Owner()))

@@ -6,6 +6,7 @@
 
 #include <cstring>
 
+#include "model/ComponentDrag.h"
 #include "model/ComponentOwner.h"
 #include "model/Diagnostics.h"
 #include "model/Event.h"
@@ -53,6 +54,7 @@ TComponent::TComponent(TComponentOwner* owner, TFormDesigner* designer, TCompone
 
 TComponent::~TComponent()
 {
+	ComponentDrag::Forget(this);
 	// Not the overrides of derived classes: those are gone.
 	TComponent::ClearProperties(true);
 	delete fProperties;

@@ -201,6 +201,7 @@ public:
 	void StoreProperty(const char* name, const char* value);
 
 private:
+	bool IsOnSameForm(const TComponent* component) const;
 	void TakeIn(TComponent* component);
 	void SelectAlone();
 	void CreateChild(TComponentOwner* container, BPoint where, BView* view);

@@ -8,6 +8,7 @@
 #include <View.h>
 #include <Window.h>
 
+#include "model/ComponentDrag.h"
 #include "model/ComponentOwner.h"
 #include "model/DesignMessages.h"
 #include "model/Diagnostics.h"
@@ -97,24 +98,29 @@ TComponent::HandleComponentDesignMessage(BMessage* message)
 	if (message->FindPointer("component", &pointer) != B_OK || pointer == nullptr)
 		return false;
 
+	// A drop may come late, when the component is gone, or from another program.
 	TComponent* dragged = static_cast<TComponent*>(pointer);
+	BPoint corner;
+	const bool dropped = fDTView != nullptr && FindDroppedCorner(message, fDTView, &corner);
+	if (dropped ? ComponentDrag::Find(message) != dragged : !IsOnSameForm(dragged))
+		return false;
 	if (dragged == this) {
 		PrintDiagnostic("%s selected\n", ClassTypeName(this).String());
 		PassToParent(message, fDTView);
 		return false;
 	}
 
+	// From here on the dragged one belongs to this form, whose window is locked.
+	if (dropped && Designer() != nullptr && !Designer()->AdoptComponent(dragged))
+		return false;
 	BView* view = dragged->DTView();
 	if (fDTView == nullptr || view == nullptr)
 		return false;
 
-	BPoint corner;
-	if (FindDroppedCorner(message, fDTView, &corner)) {
-		// What holds this component cannot go into it; the drop is for the view beneath.
-		if (IsInside(fDTView, view)) {
-			PassToParent(message, fDTView);
-			return false;
-		}
+	if (dropped) {
+		// What holds this component cannot go into it, nor need another view look at the drop.
+		if (IsInside(fDTView, view))
+			return true;
 		TakeIn(dragged);
 		dragged->MoveComponentTo(corner);
 	}
@@ -127,6 +133,21 @@ TComponent::HandleComponentDesignMessage(BMessage* message)
 	if (Designer() != nullptr)
 		Designer()->ComponentMoved(dragged, leftTop);
 	return true;
+}
+
+
+/// Whether \a component, which may be gone, is one of the form of this one; true where that has no form.
+bool
+TComponent::IsOnSameForm(const TComponent* component) const
+{
+	const TFormDesigner* designer = Designer();
+	if (designer == nullptr || component == this)
+		return true;
+	for (int32 i = 0; i < designer->CountComponents(); i++) {
+		if (designer->ComponentAt(i) == component)
+			return true;
+	}
+	return false;
 }
 
 

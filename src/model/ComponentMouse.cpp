@@ -10,13 +10,13 @@
 #include <View.h>
 #include <Window.h>
 
+#include "model/ComponentDrag.h"
 #include "model/ComponentOwner.h"
 #include "model/DesignMessages.h"
 #include "model/Diagnostics.h"
 #include "model/FormDesigner.h"
+#include "model/RectTracking.h"
 #include "model/ViewLock.h"
-
-static const bigtime_t kPollInterval = 30000; // microseconds
 
 /// The side of the square at the right bottom corner that resizes, in pixels.
 static const float kHandleSize = 5;
@@ -25,22 +25,6 @@ static const float kHandleSize = 5;
 static const float kMinimumSize = 8;
 
 static const rgb_color kSelectionColor = {0, 200, 200, 255};
-
-
-/// Lets the user move the right bottom corner of \a start until all buttons are up.
-static BRect
-TrackCorner(BView* view, BRect start)
-{
-	view->BeginRectTracking(start, B_TRACK_RECT_CORNER);
-	BPoint point;
-	uint32 buttons;
-	do {
-		snooze(kPollInterval);
-		view->GetMouse(&point, &buttons);
-	} while (buttons != 0);
-	view->EndRectTracking();
-	return BRect(start.LeftTop(), point);
-}
 
 
 static bool
@@ -57,9 +41,14 @@ TComponent::DesignerMouseDown(BPoint where, BRect frame, BView* view)
 	if (view == nullptr || view->Window() == nullptr)
 		return;
 
+	int32 clicks = 1;
+	int32 pressed = 0;
 	const BMessage* press = view->Window()->CurrentMessage();
-	int32 clicks;
-	if (press != nullptr && press->FindInt32("clicks", &clicks) == B_OK && clicks > 1) {
+	if (press != nullptr) {
+		press->FindInt32("clicks", &clicks);
+		press->FindInt32("buttons", &pressed);
+	}
+	if (clicks > 1) {
 		DefaultEditAction(where);
 		return;
 	}
@@ -74,7 +63,10 @@ TComponent::DesignerMouseDown(BPoint where, BRect frame, BView* view)
 	uint32 buttons;
 	view->GetMouse(&point, &buttons);
 	if ((buttons & B_PRIMARY_MOUSE_BUTTON) == 0) {
-		if ((buttons & B_SECONDARY_MOUSE_BUTTON) != 0)
+		// A quick click is over by now, and asks for the menu all the same.
+		const bool isSecondaryClick = buttons == 0 && (pressed & B_PRIMARY_MOUSE_BUTTON) == 0
+			&& (pressed & B_SECONDARY_MOUSE_BUTTON) != 0;
+		if (isSecondaryClick || (buttons & B_SECONDARY_MOUSE_BUTTON) != 0)
 			AskForContextMenu(point, view);
 		return;
 	}
@@ -86,7 +78,7 @@ TComponent::DesignerMouseDown(BPoint where, BRect frame, BView* view)
 		return;
 	}
 	BMessage move(DTM_COMPONENT_MOVE);
-	move.AddPointer("component", this);
+	ComponentDrag::Begin(this, &move);
 	view->DragMessage(&move, frame);
 }
 
@@ -120,7 +112,9 @@ TComponent::SelectAlone()
 void
 TComponent::CreateChild(TComponentOwner* container, BPoint where, BView* view)
 {
-	BRect frame = TrackCorner(view, BRect(where, where));
+	BRect frame(where, where);
+	if (!TrackCorner(view, &frame))
+		return;
 	if (frame.Width() < kMinimumSize)
 		frame.right = frame.left + kMinimumSize;
 	if (frame.Height() < kMinimumSize)
@@ -151,7 +145,9 @@ void
 TComponent::ResizeByMouse(BRect frame, BView* view)
 {
 	// Too small a frame is dropped, not clamped.
-	const BRect newFrame = TrackCorner(view, frame);
+	BRect newFrame(frame);
+	if (!TrackCorner(view, &newFrame))
+		return;
 	if (newFrame.Width() >= kMinimumSize && newFrame.Height() >= kMinimumSize)
 		ResizeComponentTo(view, newFrame);
 

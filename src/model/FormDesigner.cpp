@@ -71,6 +71,13 @@ TFormDesigner::SetDTFormView(BView* view)
 
 
 bool
+TFormDesigner::AdoptComponent(TComponent*)
+{
+	return true;
+}
+
+
+bool
 TFormDesigner::IsForm(const TComponentOwner* owner) const
 {
 	if (owner == nullptr)

@@ -42,6 +42,10 @@ public:
 	/// Records the view on which the form is designed; not owned.
 	virtual void SetDTFormView(BView* view);
 
+	/// Makes \a component, with what is inside it, one of this form's when it is another form's so far: it has no
+	/// owner and its view no parent then. False when it cannot be had. True here.
+	virtual bool AdoptComponent(TComponent* component);
+
 	BView* DTFormView() const { return fDTFormView; }
 
 	/// Whether \a owner is the form itself, seen as its window or as its design surface, and not a

@@ -14,6 +14,7 @@
 #include <Window.h>
 #include <gtest/gtest.h>
 
+#include "model/ComponentDrag.h"
 #include "model/ComponentOwner.h"
 #include "model/ControlComponent.h"
 #include "model/DesignMessages.h"
@@ -165,7 +166,8 @@ protected:
 	/// As the system delivers it: \a where is on the screen, \a grab in the dragged rectangle.
 	BMessage DropMessage(TComponent* component, BPoint where, BPoint grab) const
 	{
-		BMessage message = MoveMessage(component);
+		BMessage message(DTM_COMPONENT_MOVE);
+		ComponentDrag::Begin(component, &message);
 		message.AddPoint("_drop_point_", where);
 		message.AddPoint("_drop_offset_", grab);
 		return message;
@@ -471,11 +473,57 @@ TEST_F(DesignViewTest, AContainerCannotGoIntoItsOwnChild)
 	outer.AddComponent(&inner);
 
 	BMessage drop = DropMessage(&outer, BPoint(180, 190), BPoint(0, 0));
-	EXPECT_FALSE(inner.HandleComponentDesignMessage(&drop));
+	EXPECT_TRUE(inner.HandleComponentDesignMessage(&drop));
 	EXPECT_EQ(outerView->Parent(), fSurface);
 	EXPECT_EQ(innerView->Parent(), outerView);
 	EXPECT_EQ(outerView->Frame(), BRect(100, 100, 200, 200));
 	EXPECT_EQ(inner.CountComponents(), 0);
+}
+
+
+TEST_F(DesignViewTest, ADropThatComesLateIsNotTaken)
+{
+	TBoxComponent box(&fDesigner);
+	AddView(&box, BRect(100, 100, 200, 200), fSurface);
+	BMessage late = DropMessage(&fComponent, BPoint(160, 170), BPoint(0, 0));
+	// The same component, dragged again; and one that is destroyed.
+	BMessage drop = DropMessage(&fComponent, BPoint(160, 170), BPoint(0, 0));
+	EXPECT_FALSE(box.HandleComponentDesignMessage(&late));
+	EXPECT_EQ(fView->Parent(), fSurface);
+
+	{
+		TPlainComponent gone(&fDesigner);
+		drop = DropMessage(&gone, BPoint(160, 170), BPoint(0, 0));
+	}
+	EXPECT_FALSE(box.HandleComponentDesignMessage(&drop));
+	EXPECT_EQ(box.CountComponents(), 0);
+}
+
+
+TEST_F(DesignViewTest, ADropFromAnotherProgramIsNotTaken)
+{
+	// The other program's pointer may be the same by chance.
+	TBoxComponent box(&fDesigner);
+	AddView(&box, BRect(100, 100, 200, 200), fSurface);
+	BMessage own = DropMessage(&fComponent, BPoint(160, 170), BPoint(0, 0));
+	BMessage drop = MoveMessage(&fComponent);
+	drop.AddInt64("drag", own.GetInt64("drag", 0) + 1);
+	drop.AddPoint("_drop_point_", BPoint(160, 170));
+	EXPECT_FALSE(box.HandleComponentDesignMessage(&drop));
+	drop.RemoveName("drag");
+	EXPECT_FALSE(box.HandleComponentDesignMessage(&drop));
+	EXPECT_EQ(fView->Parent(), fSurface);
+}
+
+
+TEST_F(DesignViewTest, AMoveOfAnUnknownComponentIsNotTaken)
+{
+	TBoxComponent box(&fDesigner);
+	AddView(&box, BRect(100, 100, 200, 200), fSurface);
+	BMessage move(DTM_COMPONENT_MOVE);
+	move.AddPointer("component", reinterpret_cast<void*>(16));
+	EXPECT_FALSE(box.HandleComponentDesignMessage(&move));
+	EXPECT_TRUE(fDesigner.fMoved.empty());
 }
 
 
