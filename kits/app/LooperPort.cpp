@@ -53,6 +53,7 @@ LooperPort::LooperPort(port_id id, BLooper* looper, BWindow* window)
 	  fThread(kNobody),
 	  fRunning(false),
 	  fClosed(false),
+	  fMovedByOthers(false),
 	  fOwner(kNobody),
 	  fLevels(0),
 	  fOlderHeld(nullptr)
@@ -181,7 +182,10 @@ LooperPort::WaitForMessage(bigtime_t timeout)
 {
 	Deadline deadline(timeout);
 	std::unique_lock<std::mutex> lock(fMutex);
-	return deadline.Wait(fArrived, lock, [this] { return !fMessages.empty(); });
+	const bool arrived = deadline.Wait(
+		fArrived, lock, [this] { return !fMessages.empty() || fMovedByOthers; });
+	fMovedByOthers = false;
+	return arrived;
 }
 
 
@@ -211,6 +215,13 @@ LooperPort::MoveInto(BMessageQueue* queue)
 	for (BMessage* message : arrived)
 		queue->AddMessage(message);
 	queue->Unlock();
+
+	// The looper may be about to wait for what it does not know to be in its queue.
+	if (!arrived.empty() && CurrentThread() != fThread) {
+		std::lock_guard<std::mutex> lock(fMutex);
+		fMovedByOthers = true;
+		fArrived.notify_all();
+	}
 }
 
 

@@ -60,7 +60,7 @@ public:
 	/// Takes over \a message; B_BAD_PORT_ID, and the message stays the caller's, when closed.
 	status_t Post(BMessage* message);
 	bool HasMessages() const;
-	/// Waits until a message arrives. False after \a timeout.
+	/// Waits until a message arrives, or another thread than the looper's has moved some. False after \a timeout.
 	bool WaitForMessage(bigtime_t timeout);
 	/// Takes the next message, NULL when there is none.
 	BMessage* Take();
@@ -95,6 +95,7 @@ private:
 	std::condition_variable fArrived;
 	std::condition_variable fClosedCondition;
 	bool fClosed;
+	bool fMovedByOthers;
 	std::deque<BMessage*> fMessages;
 	std::deque<Waiter*> fWaiters;
 

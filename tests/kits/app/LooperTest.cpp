@@ -371,6 +371,29 @@ TEST(LooperTest, TheMessageQueueShowsWhatWaits)
 }
 
 
+TEST(LooperTest, LookingAtTheQueueFromAnotherThreadLosesNoMessage)
+{
+	constexpr int32 kCount = 20000;
+	RecordingLooper* looper = new RecordingLooper;
+	int32 left = kCount;
+	looper->hook = [&](BMessage*) {
+		if (--left > 0)
+			looper->PostMessage(1);
+	};
+	looper->Run();
+	LooperGuard guard(looper);
+	std::atomic<bool> done(false);
+	std::thread watcher([&] {
+		while (!done)
+			looper->MessageQueue();
+	});
+	looper->PostMessage(1);
+	EXPECT_TRUE(looper->record.Wait(kCount));
+	done = true;
+	watcher.join();
+}
+
+
 class CountedMessage : public BMessage {
 public:
 	explicit CountedMessage(std::atomic<int32>* deleted)
