@@ -11,18 +11,22 @@
 #include "props/PropertyListItem.h"
 
 
-TComponentRows::TComponentRows() {}
+TComponentRows::TComponentRows()
+	: lock(nullptr)
+{
+}
 
 
 TComponentRows::~TComponentRows() {}
 
 
 bool
-TComponentRows::Read(TComponent* component, BLooper* lock, const std::atomic<uint32>& count)
+TComponentRows::Read(TComponent* component, BLooper* otherLock, const std::atomic<uint32>& count)
 {
 	const uint32 countBefore = count;
 	const BView* view = component->DTView();
-	WindowGuard guard(view != nullptr && view->Looper() != nullptr ? view->Looper() : lock);
+	lock = view != nullptr && view->Looper() != nullptr ? view->Looper() : otherLock;
+	WindowGuard guard(lock);
 	if (count != countBefore)
 		return false;
 	for (int32 i = 0; i < component->CountProperties(); i++) {

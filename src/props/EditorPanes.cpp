@@ -3,6 +3,9 @@
 
 #include "props/EditorPanes.h"
 
+#include <algorithm>
+#include <cmath>
+
 #include <Box.h>
 #include <Button.h>
 #include <MenuField.h>
@@ -21,6 +24,7 @@ namespace {
 constexpr float kInset = 5;
 constexpr float kButtonWidth = 25;
 constexpr float kLabelGap = 6;
+constexpr float kLabelPart = 0.6f; // at most, of a field's width
 constexpr const char* kPaneNames[] = {"String", "Modal", "List", "PickList", "None"};
 
 /// At most what a property's text holds: one filled to its last byte has no terminator of its own.
@@ -37,13 +41,26 @@ void
 SetLabel(Field* field, const BString& label)
 {
 	field->SetLabel(label.String());
-	field->SetDivider(field->StringWidth(label.String()) + kLabelGap);
+	const float width = field->StringWidth(label.String()) + kLabelGap;
+	field->SetDivider(std::min(width, std::floor(field->Bounds().Width() * kLabelPart)));
+}
+
+
+/// Gives the field the text that the editor shows, cut to what may be typed.
+void
+SetLimitedText(BTextControl* field, const TEditorState& state)
+{
+	// The limit of the property before must not keep any of the text out.
+	field->TextView()->SetMaxBytes(TPropertyText::kSize);
+	field->SetText(state.displayValue.String());
+	field->TextView()->SetMaxBytes(state.limit);
 }
 
 } // namespace
 
 TEditorState::TEditorState(TProperty* property, TPropertyEditor* editor, TPropEditType type)
-	: name(property->Name()),
+	: property(property),
+	  name(property->Name()),
 	  value(ShownText(property->Value())),
 	  limit(TPropertyText::kSize),
 	  hasEditor(editor != nullptr)
@@ -118,27 +135,25 @@ TEditorPanes::InitEditorFor(TPropEditType type)
 }
 
 
-void
-TEditorPanes::Show(TPropEditType type, TProperty* property, const TEditorState& state)
+bool
+TEditorPanes::Show(TPropEditType type, const TEditorState& state)
 {
-	ShowPane(type);
+	const bool focusLost = ShowPane(type);
 	BString label(state.name);
 	label << ":";
 	switch (type) {
 		case PET_STRING:
 			SetLabel(fStringField, label);
-			fStringField->TextView()->SetMaxBytes(state.limit);
-			fStringField->SetText(state.displayValue.String());
+			SetLimitedText(fStringField, state);
 			break;
 
 		case PET_MODAL:
 		{
 			SetLabel(fModalField, label);
-			fModalField->SetText(state.displayValue.String());
-			fModalField->TextView()->SetMaxBytes(state.limit);
+			SetLimitedText(fModalField, state);
 			fModalField->TextView()->MakeEditable(false);
 			BMessage* message = new BMessage(PWM_MODAL_EDIT_BUTTON);
-			message->AddPointer("prop", property);
+			message->AddPointer("prop", state.property);
 			fModalButton->SetMessage(message);
 			break;
 		}
@@ -150,12 +165,13 @@ TEditorPanes::Show(TPropEditType type, TProperty* property, const TEditorState& 
 
 		case PET_PICKLIST:
 			SetLabel(fPickField, label);
-			FillPickMenu(property, state);
+			FillPickMenu(state);
 			break;
 
 		case PET_NONE:
 			break;
 	}
+	return focusLost;
 }
 
 
@@ -206,15 +222,36 @@ TEditorPanes::SetModalText(const char* text)
 }
 
 
-void
+bool
 TEditorPanes::ShowPane(TPropEditType type)
 {
+	bool focusLost = false;
 	if (fShown != type) {
+		focusLost = TakeFocus(fShown);
 		fPanes[fShown]->Hide();
 		fShown = type;
 		fPanes[fShown]->Show();
 	}
 	fPanes[fShown]->Invalidate();
+	return focusLost;
+}
+
+
+/// Takes the keyboard focus from a pane that is about to be hidden. True when the pane had it.
+bool
+TEditorPanes::TakeFocus(TPropEditType type)
+{
+	const BWindow* window = fPanes[type]->Window();
+	BView* focus = window != nullptr ? window->CurrentFocus() : nullptr;
+	for (const BView* view = focus; view != fPanes[type]; view = view->Parent()) {
+		if (view == nullptr)
+			return false;
+	}
+	// A field tells of a change when it loses the focus, and this one is for a property that is shown no more.
+	for (BTextControl* field : {fStringField, fListField})
+		field->SetText("");
+	focus->MakeFocus(false);
+	return true;
 }
 
 
@@ -244,9 +281,11 @@ TEditorPanes::AddButton(TPropEditType type, const char* name, uint32 command)
 
 /// Offers the editor's choices, the one that is the property's value marked.
 void
-TEditorPanes::FillPickMenu(TProperty* property, const TEditorState& state)
+TEditorPanes::FillPickMenu(const TEditorState& state)
 {
 	fPickMenu->RemoveItems(0, fPickMenu->CountItems(), true);
+	// What the field shows while no item is marked.
+	fPickField->MenuItem()->SetLabel(state.value.String());
 	if (!state.hasEditor) {
 		fPickMenu->AddItem(new BMenuItem("No editor!", nullptr));
 		return;
@@ -254,7 +293,7 @@ TEditorPanes::FillPickMenu(TProperty* property, const TEditorState& state)
 
 	for (const BString& choice : state.choices) {
 		BMessage* message = new BMessage(PWM_PICK);
-		message->AddPointer("prop", property);
+		message->AddPointer("prop", state.property);
 		message->AddString("caption", choice);
 		BMenuItem* item = new BMenuItem(choice.String(), message);
 		fPickMenu->AddItem(item);

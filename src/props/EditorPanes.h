@@ -23,6 +23,7 @@ struct TEditorState {
 	/// Reads \a property and \a editor (may be null). Needs the lock of the component's form.
 	TEditorState(TProperty* property, TPropertyEditor* editor, TPropEditType type);
 
+	TProperty* property; // for messages; may be gone by the time they arrive
 	BString name;
 	BString value;
 	BString displayValue;
@@ -42,8 +43,10 @@ public:
 	/// Makes the controls of that pane.
 	void InitEditorFor(TPropEditType type);
 
-	/// Shows the pane of \a type with \a state of \a property.
-	void Show(TPropEditType type, TProperty* property, const TEditorState& state);
+	/// Shows the pane of \a type with \a state.
+	///
+	/// True when another pane was hidden that had the keyboard focus, which is nowhere now: give it to another view.
+	bool Show(TPropEditType type, const TEditorState& state);
 
 	/// Gives the keyboard focus to the shown pane's control, if it takes it.
 	void Focus();
@@ -61,10 +64,11 @@ public:
 private:
 	static constexpr int32 kCount = PET_NONE + 1;
 
-	void ShowPane(TPropEditType type);
+	bool ShowPane(TPropEditType type);
+	bool TakeFocus(TPropEditType type);
 	BTextControl* AddField(TPropEditType type, const char* name, float width, uint32 command);
 	BButton* AddButton(TPropEditType type, const char* name, uint32 command);
-	void FillPickMenu(TProperty* property, const TEditorState& state);
+	void FillPickMenu(const TEditorState& state);
 
 	BBox* fPanes[kCount];
 	TPropEditType fShown;

@@ -12,9 +12,8 @@ namespace {
 
 constexpr float kSeparator = 140;
 
-// The mark, seen from the row's right edge, and how far it stays from the top and the bottom.
-constexpr float kMarkLeft = 70;
-constexpr float kMarkRight = 64;
+// Half of the mark's width, and how far it stays from the row's top and bottom.
+constexpr float kMarkReach = 3;
 constexpr float kMarkInset = 3;
 constexpr float kMarkRadius = 2;
 
@@ -50,7 +49,8 @@ TEventListItem::DrawItem(BView* owner, BRect frame, bool)
 
 	DrawListRow(owner, frame, this, fName, kSeparator);
 	if (fMarked) {
-		const BRect mark(frame.right - kMarkLeft, frame.top + kMarkInset, frame.right - kMarkRight,
+		const float middle = frame.right - kMarkFromRight;
+		const BRect mark(middle - kMarkReach, frame.top + kMarkInset, middle + kMarkReach,
 			frame.bottom - kMarkInset);
 		owner->SetHighColor(kRowValueColor);
 		owner->FillRoundRect(mark, kMarkRadius, kMarkRadius);

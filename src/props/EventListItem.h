@@ -10,6 +10,9 @@ struct TEvent;
 /// An event's name, and a mark when the user wants a handler. The event is not owned.
 class TEventListItem : public BListItem {
 public:
+	/// The middle of the mark, in pixels left of the row's right edge.
+	static constexpr float kMarkFromRight = 67;
+
 	/// \a event: its component's form is locked.
 	explicit TEventListItem(TEvent* event);
 	virtual ~TEventListItem();

@@ -3,6 +3,8 @@
 
 #include "props/EventView.h"
 
+#include <cmath>
+
 #include <ListView.h>
 #include <ScrollBar.h>
 #include <ScrollView.h>
@@ -18,7 +20,6 @@ namespace {
 
 constexpr float kInset = 2;
 constexpr float kNameLeft = 6;
-constexpr float kSelectedLeft = 96; // above the marks of a window of the first size
 constexpr float kLabelGap = 2;
 
 } // namespace
@@ -32,20 +33,24 @@ TEventView::TEventView(BRect frame)
 	const float labelHeight = FontHeight(this, true);
 	const BRect bounds = Bounds();
 	const float labelBottom = kLabelGap + labelHeight;
-	BStringView* name = new BStringView(
-		BRect(kNameLeft, kLabelGap, kSelectedLeft - 1, labelBottom), "lblEventName", "Name:");
-	BStringView* selected =
-		new BStringView(BRect(kSelectedLeft, kLabelGap, bounds.right - kInset, labelBottom),
-			"lblEventSelected", "Selected:", B_FOLLOW_LEFT_RIGHT | B_FOLLOW_TOP);
-	for (BStringView* label : {name, selected}) {
-		label->SetViewColor(kPageColor);
-		label->SetLowColor(kPageColor);
-		AddChild(label);
-	}
-
 	BRect listFrame = bounds.InsetByCopy(kInset, kInset);
 	listFrame.top = labelBottom + kLabelGap + kInset;
 	listFrame.right -= B_V_SCROLL_BAR_WIDTH;
+
+	BStringView* name = new BStringView(BRect(kNameLeft, kLabelGap, kNameLeft + 10, labelBottom),
+		"lblEventName", "Name:");
+	BStringView* selected = new BStringView(BRect(0, kLabelGap, 10, labelBottom),
+		"lblEventSelected", "Selected:", B_FOLLOW_RIGHT | B_FOLLOW_TOP);
+	for (BStringView* label : {name, selected}) {
+		label->SetViewColor(kPageColor);
+		label->SetLowColor(kPageColor);
+		label->ResizeTo(std::ceil(label->StringWidth(label->Text())) + 1, labelHeight);
+		AddChild(label);
+	}
+	// Above the marks, which keep their distance from the right edge.
+	const float marks = listFrame.right - TEventListItem::kMarkFromRight;
+	selected->MoveTo(std::floor(marks - selected->Bounds().Width() / 2), kLabelGap);
+
 	fList = new BListView(listFrame, "lvEvents", B_SINGLE_SELECTION_LIST, B_FOLLOW_ALL_SIDES);
 	fList->SetSelectionMessage(new BMessage(PWM_EVENT_SELECTED));
 	fList->SetInvocationMessage(new BMessage(PWM_EVENT_INVOKED));
@@ -63,9 +68,7 @@ void
 TEventView::SetRows(TComponentRows* rows)
 {
 	ClearItems();
-	for (auto& row : rows->events)
-		fList->AddItem(row.release());
-	rows->events.clear();
+	AddRows(fList, &rows->events);
 }
 
 
@@ -88,6 +91,5 @@ TEventView::ClearItems()
 {
 	for (int32 i = 0; i < fList->CountItems(); i++)
 		static_cast<TEventListItem*>(fList->ItemAt(i))->Clear();
-	while (!fList->IsEmpty())
-		delete fList->RemoveItem(fList->CountItems() - 1);
+	DeleteRows(fList);
 }

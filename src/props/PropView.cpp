@@ -45,9 +45,7 @@ void
 TPropView::SetRows(TComponentRows* rows)
 {
 	ClearItems();
-	for (auto& row : rows->properties)
-		fList->AddItem(row.release());
-	rows->properties.clear();
+	AddRows(fList, &rows->properties);
 	if (fList->CountItems() == 0)
 		return;
 	fList->DeselectAll();
@@ -75,8 +73,7 @@ TPropView::ClearItems()
 {
 	for (int32 i = 0; i < fList->CountItems(); i++)
 		static_cast<TPropertyListItem*>(fList->ItemAt(i))->Clear();
-	while (!fList->IsEmpty())
-		delete fList->RemoveItem(fList->CountItems() - 1);
+	DeleteRows(fList);
 }
 
 

@@ -27,20 +27,29 @@ ShownText(const char* text)
 
 TPropertyListItem::TPropertyListItem(TProperty* property)
 	: fProperty(property),
+	  fEditor(property->Editor()),
 	  fName(property->Name())
 {
-	const TPropertyEditor* editor = property->Editor();
-	fValue = ShownText(editor != nullptr ? editor->GetDisplayValue() : property->Value());
+	fValue = ShownText(fEditor != nullptr ? fEditor->GetDisplayValue() : property->Value());
 }
 
 
 TPropertyListItem::~TPropertyListItem() {}
 
 
+void
+TPropertyListItem::GetProperty(TPropertyWatch* property, TPropertyEditor** editor) const
+{
+	property->SetTo(fProperty);
+	*editor = fEditor;
+}
+
+
 bool
 TPropertyListItem::Update(const TPropertyListItem& fresh)
 {
 	fProperty.SetTo(fresh.fProperty);
+	fEditor = fresh.fEditor;
 	if (fValue == fresh.fValue && fName == fresh.fName)
 		return false;
 	fName = fresh.fName;
@@ -56,8 +65,9 @@ TPropertyListItem::DrawItem(BView* owner, BRect frame, bool)
 	const rgb_color lowColor = owner->LowColor();
 
 	DrawListRow(owner, frame, this, fName.String(), kSeparator);
+	const float room = frame.Width() + 1 - kValueLeft - kRightMargin;
 	BString value(fValue);
-	owner->TruncateString(&value, B_TRUNCATE_MIDDLE, frame.Width() + 1 - kValueLeft - kRightMargin);
+	owner->TruncateString(&value, B_TRUNCATE_MIDDLE, room);
 	owner->SetHighColor(kRowValueColor);
 	owner->DrawString(value.String(), BPoint(frame.left + kValueLeft, frame.bottom - kBaseline));
 

@@ -8,6 +8,8 @@
 
 #include "props/PropertyWatch.h"
 
+class TPropertyEditor;
+
 /// A property's name and value in two columns.
 ///
 /// The row keeps copies of the texts, as they were when it was made, so that drawing needs the list's window
@@ -20,6 +22,9 @@ public:
 
 	/// Null after Clear(), or when the property is gone.
 	TProperty* Property() const { return fProperty.Property(); }
+
+	/// The property, if it still exists, and its editor, which may be null. Both may be asked for at any time.
+	void GetProperty(TPropertyWatch* property, TPropertyEditor** editor) const;
 
 	void Clear() { fProperty.SetTo(nullptr); }
 
@@ -34,6 +39,7 @@ public:
 
 private:
 	TPropertyWatch fProperty;
+	TPropertyEditor* fEditor;
 	BString fName;
 	BString fValue;
 };

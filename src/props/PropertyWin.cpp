@@ -7,6 +7,8 @@
 #include <memory>
 
 #include <ListView.h>
+#include <MessageRunner.h>
+#include <OS.h>
 #include <Screen.h>
 
 #include "app/WindowFrame.h"
@@ -32,6 +34,7 @@ constexpr float kHeight = 300;
 constexpr const char* kFrameSetting = "PropertyWinFrame";
 
 constexpr uint32 kMsgRefresh = 'rfsh';
+constexpr bigtime_t kFrameTime = 16000; // microseconds
 
 template <typename Row>
 Row*
@@ -49,11 +52,16 @@ PropertyWin::PropertyWin()
 	  fEventView(nullptr),
 	  fPanes(nullptr),
 	  fComponent(nullptr),
+	  fRowsLock(nullptr),
+	  fEditor(nullptr),
+	  fPropertyLock(nullptr),
+	  fPropertyCount(0),
 	  fDesignView(nullptr),
 	  fDesignWindow(nullptr),
 	  fClosing(false),
 	  fShownCount(0),
-	  fRefreshWaits(false)
+	  fRefreshWaits(false),
+	  fNextRefresh(0)
 {
 	PlaceWindow();
 	InitControls();
@@ -82,7 +90,7 @@ void
 PropertyWin::MessageReceived(BMessage* message)
 {
 	if (message->what == kMsgRefresh) {
-		RefreshDisplay();
+		RefreshInThisFrame();
 		return;
 	}
 
@@ -92,15 +100,16 @@ PropertyWin::MessageReceived(BMessage* message)
 		{
 			TPropertyEditor* editor = TakeSelectedProperty();
 			if (editor != nullptr)
-				SelectEditorFor(fProperty.Property(), editor, editor->Type(), false);
+				ShowEditor(fProperty, editor, editor->Type(), fPropertyLock, false);
 			break;
 		}
 
 		case PWM_PROPERTY_INVOKED:
 		{
 			TPropertyEditor* editor = TakeSelectedProperty();
-			if (editor != nullptr)
-				InvokeEditorFor(fProperty.Property(), editor, editor->Type());
+			if (editor != nullptr
+				&& ShowEditor(fProperty, editor, editor->Type(), fPropertyLock, true))
+				InvokeShownEditor(editor, editor->Type());
 			break;
 		}
 
@@ -190,16 +199,18 @@ PropertyWin::SetComponent(TComponent* component)
 	if (component == fComponent)
 		return;
 
-	// Both pages at once: while the component is read, another thread may show another one here.
+	// While the component is read, another thread may show another one here, and destroy the one before:
+	// no row of that may be left, and both pages change at once.
 	fComponent = component;
 	const uint32 count = ++fShownCount;
-	TComponentRows rows;
-	if (component == nullptr)
+	ClearWindow();
+	if (component == nullptr) {
 		fProperty.SetTo(nullptr);
-	else if (!rows.Read(component, fDesignWindow, fShownCount) || fShownCount != count)
 		return;
-	fPropView->SetRows(&rows);
-	fEventView->SetRows(&rows);
+	}
+	TComponentRows rows;
+	if (rows.Read(component, fDesignWindow, fShownCount) && fShownCount == count)
+		ShowRows(&rows);
 }
 
 
@@ -263,32 +274,15 @@ void
 PropertyWin::SelectEditorFor(
 	TProperty* property, TPropertyEditor* editor, TPropEditType type, bool focus)
 {
-	if (property == nullptr)
-		return;
-	TPropertyWatch watch(property);
-	const uint32 count = fShownCount;
-	std::unique_ptr<TEditorState> state;
-	{
-		WindowGuard guard(fDesignWindow);
-		if (watch.Property() != nullptr && fShownCount == count)
-			state = std::make_unique<TEditorState>(property, editor, type);
-	}
-	if (state == nullptr || fShownCount != count)
-		return;
-	fPanes->Show(type, property, *state);
-	if (focus)
-		fPanes->Focus();
+	ShowEditor(TPropertyWatch(property), editor, type, fDesignWindow, focus);
 }
 
 
 void
 PropertyWin::InvokeEditorFor(TProperty* property, TPropertyEditor* editor, TPropEditType type)
 {
-	SelectEditorFor(property, editor, type, true);
-	if (type == PET_MODAL || type == PET_LIST)
-		fPanes->PressButton();
-	else if (type == PET_PICKLIST && dynamic_cast<TBoolProperty*>(editor) != nullptr)
-		fPanes->FlipPick();
+	if (ShowEditor(TPropertyWatch(property), editor, type, fDesignWindow, true))
+		InvokeShownEditor(editor, type);
 }
 
 
@@ -305,12 +299,21 @@ PropertyWin::PlaceWindow()
 }
 
 
-/// The editor of the current property; none without one.
+/// Fills both pages.
+void
+PropertyWin::ShowRows(TComponentRows* rows)
+{
+	fRowsLock = rows->lock;
+	fPropView->SetRows(rows);
+	fEventView->SetRows(rows);
+}
+
+
+/// The editor of the current property; none without one. Only the lock of the property's form keeps the property.
 TPropertyEditor*
 PropertyWin::CurrentEditor() const
 {
-	const TProperty* property = fProperty.Property();
-	return property != nullptr ? property->Editor() : nullptr;
+	return fProperty.Property() != nullptr ? fEditor : nullptr;
 }
 
 
@@ -319,33 +322,83 @@ TPropertyEditor*
 PropertyWin::TakeSelectedProperty()
 {
 	const TPropertyListItem* row = SelectedRow<TPropertyListItem>(fPropView->List());
-	if (row == nullptr || row->Property() == nullptr)
+	if (row == nullptr)
 		return nullptr;
-	fProperty.SetTo(row->Property());
+	row->GetProperty(&fProperty, &fEditor);
+	fPropertyLock = fRowsLock;
+	fPropertyCount = fShownCount;
 	return CurrentEditor();
 }
 
 
-/// Hands \a value to the current property's editor with the design view locked.
+/// Shows the pane of \a type, filled with \a lock locked and the own lock given up.
+///
+/// The pane stays as it is, and the result is false, when the property is gone by then, or another component shown.
+bool
+PropertyWin::ShowEditor(const TPropertyWatch& property, TPropertyEditor* editor, TPropEditType type,
+	BLooper* lock, bool focus)
+{
+	TPropertyWatch watch;
+	watch.SetTo(property);
+	const uint32 count = fShownCount;
+	std::unique_ptr<TEditorState> state;
+	{
+		WindowGuard guard(lock);
+		TProperty* locked = watch.Property();
+		if (locked != nullptr && fShownCount == count)
+			state = std::make_unique<TEditorState>(locked, editor, type);
+	}
+	if (state == nullptr || fShownCount != count)
+		return false;
+	if (fPanes->Show(type, *state))
+		fPropView->List()->MakeFocus(true);
+	if (focus)
+		fPanes->Focus();
+	return true;
+}
+
+
+/// What a double click does beside showing the editor.
+void
+PropertyWin::InvokeShownEditor(TPropertyEditor* editor, TPropEditType type)
+{
+	if (type == PET_MODAL || type == PET_LIST)
+		fPanes->PressButton();
+	else if (type == PET_PICKLIST && dynamic_cast<TBoolProperty*>(editor) != nullptr)
+		fPanes->FlipPick();
+}
+
+
+/// Hands \a value to the current property's editor with the lock of the property's form.
 ///
 /// The property must still be there once the lock is. Without a design view to lock, the result is false and
 /// nothing changes when \a lockNeeded.
 bool
 PropertyWin::SetCurrentValue(const char* value, bool lockNeeded)
 {
-	const uint32 count = fShownCount;
+	// Copies: another property may become the current one while the own lock is given up.
+	TPropertyEditor* editor = fEditor;
+	TPropertyWatch property;
+	property.SetTo(fProperty);
 	BView* designView = fDesignView;
-	const TProperty* property = fProperty.Property();
-	WindowGuard guard(fDesignWindow);
-	if (!guard.IsLocked() && lockNeeded)
-		return false;
+	BLooper* designWindow = fDesignWindow;
+	BLooper* propertyLock = fPropertyLock != nullptr ? fPropertyLock : designWindow;
+	if (lockNeeded) {
+		WindowGuard guard(designWindow);
+		if (!guard.IsLocked())
+			return false;
+		if (propertyLock == designWindow) {
+			if (property.Property() != nullptr)
+				editor->SetValue(value, true);
+			designView->Invalidate();
+			return true;
+		}
+	}
 
-	TPropertyEditor* editor = CurrentEditor();
-	if (editor == nullptr || fShownCount != count || fProperty.Property() != property)
-		return true;
-	editor->SetValue(value, true);
-	if (guard.IsLocked() && lockNeeded)
-		designView->Invalidate();
+	// The property's component was shown before the one on the design view, or needs no design view.
+	WindowGuard guard(propertyLock);
+	if (property.Property() != nullptr)
+		editor->SetValue(value, true);
 	return true;
 }
 
@@ -354,11 +407,23 @@ void
 PropertyWin::EditModally()
 {
 	TPropertyEditor* editor = CurrentEditor();
-	if (editor == nullptr || !editor->ModalEdit())
+	if (editor == nullptr)
 		return;
+	// A component that is shown stays. One that is not any more needs the lock of its form for that.
+	const bool isShown = fShownCount == fPropertyCount;
+	bool edited;
+	BString text;
+	{
+		WindowGuard guard(isShown ? nullptr : fPropertyLock);
+		if (fProperty.Property() == nullptr)
+			return;
+		edited = editor->ModalEdit();
+		if (edited)
+			text = editor->GetDisplayValue();
+	}
 	// The current property may be another one by now.
-	if (CurrentEditor() == editor)
-		fPanes->SetModalText(editor->GetDisplayValue());
+	if (edited && CurrentEditor() == editor)
+		fPanes->SetModalText(text.String());
 }
 
 
@@ -385,13 +450,32 @@ PropertyWin::FlipEvent()
 }
 
 
+/// Refreshes now, or at the end of the frame in which it was done already. The last refresh asked for is always done.
+void
+PropertyWin::RefreshInThisFrame()
+{
+	const bigtime_t now = system_time();
+	if (now < fNextRefresh && fDelayedRefresh == nullptr) {
+		const BMessage refresh(kMsgRefresh);
+		fDelayedRefresh =
+			std::make_unique<BMessageRunner>(BMessenger(this), refresh, fNextRefresh - now, 1);
+		if (fDelayedRefresh->InitCheck() == B_OK)
+			return;
+	}
+	fDelayedRefresh.reset();
+	fNextRefresh = now + kFrameTime;
+	RefreshDisplay();
+}
+
+
 void
 PropertyWin::RefreshDisplay()
 {
+	// First: what changes from here on is shown by another refresh.
 	fRefreshWaits = false;
 	TPropertyEditor* editor = CurrentEditor();
 	if (editor != nullptr)
-		SelectEditorFor(fProperty.Property(), editor, editor->Type(), false);
+		ShowEditor(fProperty, editor, editor->Type(), fPropertyLock, false);
 	UpdateRows();
 }
 
@@ -406,6 +490,7 @@ PropertyWin::UpdateRows()
 	TComponentRows rows;
 	if (!rows.Read(fComponent, fDesignWindow, fShownCount) || fShownCount != count)
 		return;
+	fRowsLock = rows.lock;
 	fPropView->UpdateRows(&rows);
 	fEventView->UpdateRows(&rows);
 }

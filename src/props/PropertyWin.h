@@ -4,16 +4,19 @@
 #pragma once
 
 #include <atomic>
+#include <memory>
 
 #include <Window.h>
 
 #include "props/PropertyEditor.h"
 #include "props/PropertyWatch.h"
 
+class BMessageRunner;
 class TEditorPanes;
 class TEventView;
 class TPropView;
 class TabView;
+struct TComponentRows;
 
 /// The messages of the property window's own controls.
 enum {
@@ -56,7 +59,8 @@ public:
 	virtual void SetComponent(TComponent* component);
 	virtual TComponent* Component();
 
-	/// Shows the values as they are now, soon: calls until then cost nothing more. Any thread, no lock needed.
+	/// Shows the values as they are now, soon, and at most once a frame: calls until then cost nothing more. Any
+	/// thread, no lock needed.
 	virtual void UpdateDisplayValues();
 
 	/// The view whose window is locked around edits: that of the form that the component lives on, or null.
@@ -82,11 +86,16 @@ public:
 
 private:
 	void PlaceWindow();
+	void ShowRows(TComponentRows* rows);
 	TPropertyEditor* CurrentEditor() const;
 	TPropertyEditor* TakeSelectedProperty();
+	bool ShowEditor(const TPropertyWatch& property, TPropertyEditor* editor, TPropEditType type,
+		BLooper* lock, bool focus);
+	void InvokeShownEditor(TPropertyEditor* editor, TPropEditType type);
 	bool SetCurrentValue(const char* value, bool lockNeeded);
 	void EditModally();
 	void FlipEvent();
+	void RefreshInThisFrame();
 	void RefreshDisplay();
 	void UpdateRows();
 
@@ -95,11 +104,18 @@ private:
 	TEventView* fEventView;
 	TEditorPanes* fPanes;
 	TComponent* fComponent;
+	BLooper* fRowsLock; // that of the window of the form that the rows were read from
 	TPropertyWatch fProperty;
+	// Of the current property. Editors are never destroyed, so this one may be asked for its type at any time.
+	TPropertyEditor* fEditor;
+	BLooper* fPropertyLock;
+	uint32 fPropertyCount; // what fShownCount was when the property became the current one
 	BView* fDesignView;
 	BLooper* fDesignWindow;
 	bool fClosing;
 	// How often another component was shown. The one counted last is not destroyed before this changes.
 	std::atomic<uint32> fShownCount;
 	std::atomic<bool> fRefreshWaits;
+	bigtime_t fNextRefresh; // the end of the frame that was refreshed last
+	std::unique_ptr<BMessageRunner> fDelayedRefresh;
 };
