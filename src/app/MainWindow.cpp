@@ -121,8 +121,14 @@ QuitWindow(BWindow* window)
 {
 	if (window == nullptr)
 		return;
-	WindowGuard guard(window);
-	if (guard.IsLocked() && window->QuitRequested())
+	{
+		WindowGuard guard(window);
+		if (!guard.IsLocked() || !window->QuitRequested())
+			return;
+	}
+	// Without a guard, which needs its window until it is left, and with no lock held while the window ends.
+	WindowRelease release;
+	if (window->Lock())
 		window->Quit();
 }
 
@@ -170,7 +176,8 @@ PlimWin::ProjectWindow()
 
 	made = MadeOnce(fProjectWindow, [] { return new ProjectWin; });
 	// Only now, as the form's window asks for the project window.
-	made->NewProject(true);
+	if (made != nullptr)
+		made->NewProject(true);
 	return made;
 }
 
@@ -292,11 +299,15 @@ PlimWin::Quit()
 void
 PlimWin::QuitToolWindows()
 {
-	// First, as it shows what the project window owns.
+	// First the one that shows what the project window owns. Those that are gone are handed out no more.
 	QuitWindow(fPropertyWindow);
+	fPropertyWindow = nullptr;
 	QuitWindow(fProjectWindow);
+	fProjectWindow = nullptr;
 	QuitWindow(fDesignForm);
+	fDesignForm = nullptr;
 	QuitWindow(fPalette);
+	fPalette = nullptr;
 }
 
 
@@ -328,7 +339,7 @@ Window*
 PlimWin::MadeOnce(std::atomic<Window*>& window, Make make)
 {
 	Window* made = window;
-	if (made != nullptr)
+	if (made != nullptr || fQuitting)
 		return made;
 
 	// The new window may show itself, and may ask for others.

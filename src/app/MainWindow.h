@@ -18,7 +18,7 @@ class TDesignForm;
 /// The small window with the menu bar; it makes and hands out the designer's other windows.
 ///
 /// The accessors may be called from any thread without a lock. What they hand out is locked by a
-/// WindowGuard; it lives until the program quits, and the main window outlives it.
+/// WindowGuard; it lives until the program quits, and the main window outlives it. From then on they return null.
 class PlimWin : public BWindow {
 public:
 	PlimWin();
@@ -66,7 +66,7 @@ private:
 	std::atomic<ComponentPalette*> fPalette;
 	// Held while a window is made; its constructor may ask for other windows.
 	std::recursive_mutex fMaking;
-	bool fQuitting;
+	std::atomic<bool> fQuitting;
 };
 
 /// The main window, made on the first call; null in programs that are not the designer, and when it has quit.
