@@ -4,6 +4,7 @@
 #pragma once
 
 #include <cstring>
+#include <span>
 
 #include <ComponentKit.h>
 
@@ -14,9 +15,9 @@ struct choice {
 };
 
 /// The value of the choice called \a name; \a otherwise when there is none.
-template <class Value, size_t count>
+template <class Value>
 Value
-ChoiceValue(const choice (&choices)[count], const char* name, Value otherwise)
+ChoiceValue(std::span<const choice> choices, const char* name, Value otherwise)
 {
 	for (const choice& one : choices) {
 		if (strcmp(one.name, name) == 0)
@@ -30,22 +31,19 @@ ChoiceValue(const choice (&choices)[count], const char* name, Value otherwise)
 class TChoiceProperty : public TPickListProperty {
 public:
 	/// \a choices must outlive the editor.
-	template <size_t count>
-	TChoiceProperty(TComponent* component, TProperty* property, const choice (&choices)[count])
+	TChoiceProperty(TComponent* component, TProperty* property, std::span<const choice> choices)
 		: TPickListProperty(component, property),
-		  fChoices(choices),
-		  fCount(count)
+		  fChoices(choices)
 	{
 	}
 
 	void GetValuePickList(TStringList* list) override
 	{
 		TPickListProperty::GetValuePickList(list);
-		for (size_t i = 0; i < fCount; i++)
-			list->Add(fChoices[i].name);
+		for (const choice& one : fChoices)
+			list->Add(one.name);
 	}
 
 private:
-	const choice* fChoices;
-	size_t fCount;
+	std::span<const choice> fChoices;
 };

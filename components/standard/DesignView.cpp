@@ -2,8 +2,70 @@
 
 #include "DesignView.h"
 
+#include <cstdlib>
+#include <cstring>
+
+#include <Font.h>
 #include <Message.h>
 #include <Window.h>
+
+namespace {
+
+/// The value of the property; null when the component has none of that name.
+const char*
+ValueOf(TComponent* component, const char* name)
+{
+	const TProperty* property = component->FindProperty(name);
+	return property != nullptr ? property->Value() : nullptr;
+}
+
+
+BFont
+FontOf(TComponent* component)
+{
+	const char* name = ValueOf(component, "Font");
+	BFont font(be_plain_font);
+	if (name != nullptr && strcmp(name, "be_bold_font") == 0)
+		font = *be_bold_font;
+	else if (name != nullptr && strcmp(name, "be_fixed_font") == 0)
+		font = *be_fixed_font;
+	const char* size = ValueOf(component, "FontSize");
+	if (size != nullptr && atoi(size) > 0)
+		font.SetSize(atoi(size));
+	return font;
+}
+
+} // namespace
+
+void
+ShowLook(TComponent* component, BView* view)
+{
+	const char* color = ValueOf(component, "ViewColor");
+	rgb_color present = view->ViewColor();
+	if (color != nullptr)
+		view->SetViewColor(StrToRGBColor(color, &present));
+	color = ValueOf(component, "HighColor");
+	present = view->HighColor();
+	if (color != nullptr)
+		view->SetHighColor(StrToRGBColor(color, &present));
+	color = ValueOf(component, "LowColor");
+	present = view->LowColor();
+	if (color != nullptr)
+		view->SetLowColor(StrToRGBColor(color, &present));
+	const BFont font = FontOf(component);
+	view->SetFont(&font);
+}
+
+
+void
+TakeFromKeyboard(BView* view)
+{
+	// Also of a view that hands the flags on to one inside.
+	view->SetFlags(view->Flags() & ~(B_NAVIGABLE | B_NAVIGABLE_JUMP));
+	for (BView* child = view->ChildAt(0); child != nullptr; child = child->NextSibling())
+		TakeFromKeyboard(child);
+}
+
 
 bool
 OfferDesignMessage(TComponent* component, BMessage* message)

@@ -6,7 +6,17 @@
 #include <utility>
 
 #include <ComponentKit.h>
+#include <InterfaceDefs.h>
+#include <Message.h>
 #include <View.h>
+#include <ormi/views/FrameKeeper.h>
+
+/// Gives \a view the colours and the font that \a component has as properties, and that the program
+/// will have: when it gets into a window, a view takes its parent's.
+void ShowLook(TComponent* component, BView* view);
+
+/// Takes \a view and what is in it out of the keyboard's reach.
+void TakeFromKeyboard(BView* view);
 
 /// Offers a message of the design surface to \a component, whose view got it. True when that was all it needs.
 ///
@@ -14,7 +24,8 @@
 bool OfferDesignMessage(TComponent* component, BMessage* message);
 
 /// A view of class \a View that looks like itself but does not act like it: what the mouse does to it
-/// goes to its component, and it never takes the keyboard.
+/// goes to its component, and it never takes the keyboard. Its frame is what the user drew: it does not
+/// size itself. The selection is drawn over what is in it.
 ///
 /// It refers to the component only inside its hooks, so the component may be deleted first.
 template <class View>
@@ -26,11 +37,31 @@ public:
 		: View(std::forward<Arguments>(arguments)...),
 		  fComponent(component)
 	{
+		this->SetFlags(this->Flags() | B_WILL_DRAW | B_DRAW_ON_CHILDREN);
 	}
 
-	void Draw(BRect updateRect) override
+	void AttachedToWindow() override
 	{
-		View::Draw(updateRect);
+		Ormi::FrameKeeper keeper(this);
+		View::AttachedToWindow();
+		ShowLook(fComponent, this);
+	}
+
+	void AllAttached() override
+	{
+		View::AllAttached();
+		TakeFromKeyboard(this);
+	}
+
+	void SetFont(const BFont* font, uint32 mask = B_FONT_ALL) override
+	{
+		Ormi::FrameKeeper keeper(this);
+		View::SetFont(font, mask);
+	}
+
+	void DrawAfterChildren(BRect updateRect) override
+	{
+		View::DrawAfterChildren(updateRect);
 		fComponent->DesignerDrawSelection();
 	}
 
@@ -42,12 +73,17 @@ public:
 	void MouseUp(BPoint) override {}
 	void MouseMoved(BPoint, uint32, const BMessage*) override {}
 	void KeyDown(const char*, int32) override {}
+	void KeyUp(const char*, int32) override {}
 	void MakeFocus(bool) override {}
 
+	/// What the view itself would do with a message, such as scrolling or taking a dropped text, it does
+	/// in the program only.
 	void MessageReceived(BMessage* message) override
 	{
+		if (message->what == B_MOUSE_WHEEL_CHANGED)
+			return;
 		if (!OfferDesignMessage(fComponent, message))
-			View::MessageReceived(message);
+			BView::MessageReceived(message);
 	}
 
 private:

@@ -8,8 +8,20 @@
 #include "BoxComponent.h"
 #include "ButtonComponent.h"
 #include "CheckBoxComponent.h"
+#include "ColorControlComponent.h"
+#include "ListViewComponent.h"
+#include "MenuBarComponent.h"
+#include "MenuFieldComponent.h"
+#include "OutlineListViewComponent.h"
+#include "PictureButtonComponent.h"
+#include "PictureViewComponent.h"
+#include "PlainViewComponent.h"
+#include "RadioButtonComponent.h"
+#include "SliderComponent.h"
+#include "StatusBarComponent.h"
 #include "StringViewComponent.h"
 #include "TextControlComponent.h"
+#include "TextViewComponent.h"
 
 namespace {
 
@@ -36,8 +48,23 @@ TStandardEntry<TCheckBoxComponent> sCheckBox(1, "CheckBox", "TCheckBox");
 TStandardEntry<TTextControlComponent> sTextControl(2, "TextControl", "TTextControl");
 TStandardEntry<TStringViewComponent> sStringView(3, "StringView", "TStringView");
 TStandardEntry<TBoxComponent> sBox(4, "Box", "TBox");
+TStandardEntry<TRadioButtonComponent> sRadioButton(5, "RadioButton", "TRadioButton");
+TStandardEntry<TTextViewComponent> sTextView(6, "TextView", "TTextView");
+TStandardEntry<TPlainViewComponent> sView(7, "View", "TView");
+TStandardEntry<TListViewComponent> sListView(8, "ListView", "TListView");
+TStandardEntry<TOutlineListViewComponent> sOutlineListView(
+	9, "OutlineListView", "TOutlineListView");
+TStandardEntry<TMenuFieldComponent> sMenuField(10, "MenuField", "TMenuField");
+TStandardEntry<TMenuBarComponent> sMenuBar(11, "MenuBar", "TMenuBar");
+TStandardEntry<TSliderComponent> sSlider(12, "Slider", "TSlider");
+TStandardEntry<TStatusBarComponent> sStatusBar(13, "StatusBar", "TStatusBar");
+TStandardEntry<TColorControlComponent> sColorControl(14, "ColorControl", "TColorControl");
+TStandardEntry<TPictureViewComponent> sPictureView(15, "PictureView", "TPictureView");
+TStandardEntry<TPictureButtonComponent> sPictureButton(16, "PictureButton", "TPictureButton");
 
-TPaletteEntry* const kEntries[] = {&sButton, &sCheckBox, &sTextControl, &sStringView, &sBox};
+TPaletteEntry* const kEntries[] = {&sButton, &sCheckBox, &sTextControl, &sStringView, &sBox,
+	&sRadioButton, &sTextView, &sView, &sListView, &sOutlineListView, &sMenuField, &sMenuBar,
+	&sSlider, &sStatusBar, &sColorControl, &sPictureView, &sPictureButton};
 constexpr uint32 kEntryCount = sizeof(kEntries) / sizeof(kEntries[0]);
 
 } // namespace

@@ -4,6 +4,7 @@
 #include <cstdlib>
 #include <cstring>
 #include <string>
+#include <vector>
 
 #include <gtest/gtest.h>
 
@@ -16,6 +17,7 @@
 #include "model/Event.h"
 #include "palette/LibraryLoader.h"
 #include "palette/PaletteCatalog.h"
+#include "palette/PaletteEntry.h"
 #include "project/Project.h"
 #include "support/TemporaryFolder.h"
 
@@ -53,7 +55,10 @@ TEST(GeneratedCodeTest, EveryPropertyAndEventCompiles)
 	BApplication application("application/x-vnd.plimworks-ormi-test");
 	TLibraryLoader loader(&PaletteCatalog());
 	ASSERT_EQ(loader.LoadFolder(PLIM_BUILD_DIR "/bin/Components"), B_OK);
-	const char* const classes[] = {"TButton", "TCheckBox", "TTextControl", "TStringView", "TBox"};
+	std::vector<const char*> classes;
+	for (int32 i = 0; i < PaletteCatalog().CountPalEntries(); i++)
+		classes.push_back(PaletteCatalog().PalEntryAt(i)->ClassName());
+	ASSERT_FALSE(classes.empty());
 	TemporaryFolder folder;
 	{
 		TProject project(FORM_HIDDEN);
@@ -62,20 +67,22 @@ TEST(GeneratedCodeTest, EveryPropertyAndEventCompiles)
 		TickEvents(project.App());
 		TDesignForm* form = project.NewForm();
 		TickEvents(form);
-		TComponent* box = nullptr;
+		std::vector<TComponent*> containers;
 		float top = 10;
 		for (const char* className : classes) {
 			TComponent* component = Place(form, className, BRect(10, top, 200, top + 60));
 			ASSERT_NE(component, nullptr) << className;
 			TickEvents(component);
 			top += 70;
-			if (strcmp(className, "TBox") == 0)
-				box = component;
+			if (dynamic_cast<TComponentOwner*>(component) != nullptr)
+				containers.push_back(component);
 		}
-		for (const char* className : classes) {
-			TComponent* component = Place(form, className, BRect(10, 10, 100, 50), box);
-			ASSERT_NE(component, nullptr) << className;
-			TickEvents(component);
+		for (TComponent* container : containers) {
+			for (const char* className : classes) {
+				TComponent* component = Place(form, className, BRect(10, 10, 100, 50), container);
+				ASSERT_NE(component, nullptr) << className;
+				TickEvents(component);
+			}
 		}
 
 		TCodeGenerator generator;
@@ -92,6 +99,7 @@ TEST(GeneratedCodeTest, EveryPropertyAndEventCompiles)
 	// Something was ticked.
 	const std::string form = folder.Read("Form1.cpp");
 	for (const char* handler : {"TForm1::QuitRequested", "TForm1::Button1Click",
-			 "TForm1::Box1FrameMoved", "TForm1::TextControl2Enter"})
+			 "TForm1::Box1FrameMoved", "TForm1::TextControl2Enter", "TForm1::Slider1Modify",
+			 "TForm1::MenuBar1Invoke(BMenuItem *item)"})
 		EXPECT_NE(form.find(handler), std::string::npos) << handler;
 }

@@ -12,8 +12,13 @@
 #include <CheckBox.h>
 #include <StringView.h>
 
+#include <ormi/Choices.h>
+#include <ormi/Containers.h>
+#include <ormi/Displays.h>
+#include <ormi/Lists.h>
 #include <ormi/Part.h>
 #include <ormi/TextControl.h>
+#include <ormi/TextView.h>
 
 /// A push button. OnClick: pressed by mouse or keyboard.
 template <class Form>

@@ -7,6 +7,8 @@
 
 #include <View.h>
 
+#include <ormi/views/FrameKeeper.h>
+
 /// What a form knows of its view and its components.
 class TFormPart {
 public:
@@ -53,7 +55,8 @@ public:
 	template <class... Arguments>
 	explicit TPart(Form* form, Arguments&&... arguments)
 		: View(std::forward<Arguments>(arguments)...),
-		  fForm(form)
+		  fForm(form),
+		  fNeededFlags((this->Flags() & ~(B_WILL_DRAW | B_NAVIGABLE)) | B_FRAME_EVENTS)
 	{
 		View::SetFlags(this->Flags() | B_FRAME_EVENTS);
 	}
@@ -72,9 +75,13 @@ public:
 	}
 
 	/// Sets the flags that a designer chooses; those that the part's events and the view need stay.
-	void SetFlags(uint32 flags) override
+	void SetFlags(uint32 flags) override { View::SetFlags(flags | fNeededFlags); }
+
+	/// The frame stays as it was designed, however large the font is.
+	void SetFont(const BFont* font, uint32 mask = B_FONT_ALL) override
 	{
-		View::SetFlags(flags | B_FRAME_EVENTS | (this->Flags() & B_NAVIGABLE_JUMP));
+		Ormi::FrameKeeper keeper(this);
+		View::SetFont(font, mask);
 	}
 
 	void FormAttached() override { Call(OnAttachedToWindow); }
@@ -99,7 +106,10 @@ public:
 
 	void AttachedToWindow() override
 	{
-		View::AttachedToWindow();
+		{
+			Ormi::FrameKeeper keeper(this);
+			View::AttachedToWindow();
+		}
 		Call(OnAttachedToWindow);
 	}
 
@@ -171,6 +181,7 @@ protected:
 
 private:
 	Form* fForm;
+	uint32 fNeededFlags;
 	bool fHasFocus = false;
 };
 

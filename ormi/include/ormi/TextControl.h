@@ -26,6 +26,8 @@ public:
 	{
 		if (*label == '\0')
 			this->SetDivider(0);
+		// It made itself as high as its font needs.
+		this->ResizeTo(frame.Width(), frame.Height());
 		this->SetMessage(new BMessage);
 		this->SetModificationMessage(new BMessage);
 	}
