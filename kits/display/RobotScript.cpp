@@ -127,6 +127,7 @@ private:
 	Arguments Split(const std::string& line) const;
 	BPoint Place(const Arguments& arguments, size_t first);
 	status_t ViewDoesNot(const Arguments& arguments, status_t status);
+	status_t ItemDoesNot(const Arguments& arguments, status_t status);
 
 	status_t WaitWindow(const Arguments& arguments);
 	status_t WaitNoWindow(const Arguments& arguments);
@@ -145,6 +146,8 @@ private:
 	status_t Key(const Arguments& arguments);
 	status_t PrintView(const Arguments& arguments);
 	status_t PrintValue(const Arguments& arguments);
+	status_t PrintFrame(const Arguments& arguments);
+	status_t PrintItemFrame(const Arguments& arguments);
 	status_t ExpectView(const Arguments& arguments);
 	status_t ExpectValue(const Arguments& arguments);
 	status_t PrintWindows(const Arguments& arguments);
@@ -182,6 +185,8 @@ const ScriptRunner::Command ScriptRunner::kCommands[] = {
 	{"key", 1, 1, &ScriptRunner::Key},
 	{"print-view", 1, 1, &ScriptRunner::PrintView},
 	{"print-value", 1, 1, &ScriptRunner::PrintValue},
+	{"print-frame", 1, 1, &ScriptRunner::PrintFrame},
+	{"print-item-frame", 1, 1, &ScriptRunner::PrintItemFrame},
 	{"expect-view", 2, 2, &ScriptRunner::ExpectView},
 	{"expect-value", 2, 2, &ScriptRunner::ExpectValue},
 	{"print-windows", 0, 0, &ScriptRunner::PrintWindows},
@@ -227,6 +232,8 @@ ScriptRunner::RunLine(const std::string& line)
 			Fail("\"" + name + "\" takes another number of words (quote those with spaces)");
 		fFound.clear();
 		status_t status = (this->*command.run)(arguments);
+		// Another program may be waiting for what was printed.
+		fflush(stdout);
 		if (status != B_OK)
 			Fail("\"" + line + "\" failed: " + (fFound.empty() ? ReasonFor(status) : fFound));
 		return;
@@ -363,7 +370,13 @@ ScriptRunner::DoubleClickView(const Arguments& arguments)
 status_t
 ScriptRunner::ClickItem(const Arguments& arguments)
 {
-	status_t status = fRobot.ClickItem(arguments[0].c_str());
+	return ItemDoesNot(arguments, fRobot.ClickItem(arguments[0].c_str()));
+}
+
+
+status_t
+ScriptRunner::ItemDoesNot(const Arguments& arguments, status_t status)
+{
 	if (status == B_NAME_NOT_FOUND)
 		fFound = "no open menu and no menu bar has an item \"" + arguments[0] + "\"";
 	return status;
@@ -479,6 +492,37 @@ ScriptRunner::PrintValue(const Arguments& arguments)
 	if (status == B_OK)
 		printf("%s: %" B_PRId32 "\n", arguments[0].c_str(), value);
 	return ViewDoesNot(arguments, status);
+}
+
+
+static void
+PrintRect(const std::string& name, BRect frame)
+{
+	printf("%s: %g %g %g %g\n", name.c_str(), frame.left, frame.top, frame.right, frame.bottom);
+}
+
+
+status_t
+ScriptRunner::PrintFrame(const Arguments& arguments)
+{
+	BRect frame;
+	status_t status = fRobot.GetViewFrame(fWindow, arguments[0].c_str(), &frame);
+	if (status == B_OK && !frame.IsValid())
+		status = B_BAD_VALUE;
+	if (status == B_OK)
+		PrintRect(arguments[0], frame);
+	return ViewDoesNot(arguments, status);
+}
+
+
+status_t
+ScriptRunner::PrintItemFrame(const Arguments& arguments)
+{
+	BRect frame;
+	status_t status = fRobot.GetItemFrame(arguments[0].c_str(), &frame);
+	if (status == B_OK)
+		PrintRect(arguments[0], frame);
+	return ItemDoesNot(arguments, status);
 }
 
 
