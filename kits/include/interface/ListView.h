@@ -20,6 +20,7 @@ enum list_view_type {
 
 namespace BPrivate {
 class ListTyping;
+class PanelList;
 } // namespace BPrivate
 
 /// Items below each other, from y 0 without gaps. Indices count from 0.
@@ -156,6 +157,7 @@ protected:
 
 private:
 	friend class BOutlineListView;
+	friend class BPrivate::PanelList;
 
 	/// A press that may become a drag.
 	struct Press {

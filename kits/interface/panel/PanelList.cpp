@@ -16,6 +16,7 @@
 #include <Window.h>
 
 #include "interface/ControlLook.h"
+#include "interface/ListTyping.h"
 #include "interface/panel/PanelItem.h"
 #include "interface/panel/PanelLink.h"
 #include "interface/panel/PanelPaths.h"
@@ -83,6 +84,8 @@ void
 PanelList::SetFolder(const std::string& path, const std::string& select)
 {
 	StopWatching();
+	// What was typed was meant for the entries of the other folder.
+	fTyping->Clear();
 	fFolder = path;
 	fWanted = select;
 	fChangedWhileReading = false;

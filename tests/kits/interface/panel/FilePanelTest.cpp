@@ -292,6 +292,22 @@ TEST_F(FilePanelTest, AClickOnAColumnOrdersByIt)
 }
 
 
+TEST_F(FilePanelTest, TypingBeginsAnewInAnotherFolder)
+{
+	fFolder.Make("sub");
+	fFolder.Write("sub/one");
+	fFolder.Write("sub/two");
+	Open();
+	fRobot.Type("su");
+	EXPECT_EQ(Selected(), List{"sub"});
+	fRobot.Key("enter");
+	EXPECT_TRUE(WaitForRows({"one", "two"}));
+	// However soon it comes.
+	fRobot.Type("tw");
+	EXPECT_EQ(Selected(), List{"two"});
+}
+
+
 TEST_F(FilePanelTest, APathCanBeTyped)
 {
 	fFolder.Make("sub");
