@@ -322,7 +322,8 @@ TEST_F(MenuTest, ShortcutsAndLongLabelsNeedTheirWidth)
 TEST_F(MenuTest, MatrixHasTheFramesThatItIsGiven)
 {
 	BMenu menu("matrix", 100, 50);
-	EXPECT_FALSE(menu.AddItem(new CountedItem("lost"), 0));
+	CountedItem unplaced("lost");
+	EXPECT_FALSE(menu.AddItem(&unplaced, 0));
 	EXPECT_TRUE(menu.AddItem(new CountedItem("a"), BRect(10, 10, 29, 29)));
 	EXPECT_EQ(menu.ItemAt(0)->Frame(), BRect(10, 10, 29, 29));
 	float width, height;
