@@ -3,6 +3,7 @@
 #include "interface/WindowPainter.h"
 
 #include <algorithm>
+#include <vector>
 
 #include <Bitmap.h>
 #include <Message.h>
@@ -24,6 +25,18 @@ namespace {
 // With more rects than this their frame is presented: a copy too much is cheaper than the bookkeeping.
 const int32 kMaxDrawnRects = 32;
 
+
+/// Each of the regions meets others of its size: one after the other would take the square of their number.
+BRegion
+Union(std::vector<BRegion>& regions)
+{
+	for (size_t step = 1; step < regions.size(); step *= 2) {
+		for (size_t i = 0; i + step < regions.size(); i += 2 * step)
+			regions[i].Include(&regions[i + step]);
+	}
+	return std::move(regions[0]);
+}
+
 } // namespace
 
 
@@ -33,6 +46,7 @@ WindowPainter::WindowPainter(BWindow* window)
 	  fUpdating(nullptr),
 	  fBegunView(nullptr),
 	  fBegunState(0),
+	  fBegunIsClipped(false),
 	  fBegunGeneration(0),
 	  fGeneration(1),
 	  fDisabled(0),
@@ -100,9 +114,14 @@ WindowPainter::Begin(BView* view)
 		return nullptr;
 
 	uint32 state = view->fDrawing != nullptr ? view->fDrawing->serial : 0;
-	if (view != fBegunView || fBegunGeneration != fGeneration || fBegunState != state) {
-		fClip = DrawRegion(view);
-		fCanvas->SetClip(&fClip);
+	const bool isAnother = view != fBegunView || fBegunGeneration != fGeneration;
+	if (isAnother || fBegunState != state) {
+		const bool isClipped = view->State().clipping.has_value();
+		if (isAnother || isClipped || fBegunIsClipped) {
+			fClip = DrawRegion(view);
+			fCanvas->SetClip(&fClip);
+			fBegunIsClipped = isClipped;
+		}
 		fCanvas->SetState(ToCanvasState(*view, view->State(), view->OffsetInWindow()));
 		fBegunView = view;
 		fBegunState = state;
@@ -260,7 +279,7 @@ WindowPainter::DrawBackground(BView* view, const BRegion& region)
 	fCanvas->SetClip(&region);
 	fCanvas->SetState(state);
 	if (color != B_TRANSPARENT_COLOR)
-		fCanvas->FillRegion(region, B_SOLID_HIGH);
+		fCanvas->FillRect(region.Frame(), B_SOLID_HIGH);
 	if (background != nullptr)
 		background->Draw(*fCanvas, view->fBounds, view->OffsetInWindow());
 }
@@ -290,9 +309,14 @@ WindowPainter::VisibleRegion(BView* view) const
 	if ((view->fFlags & B_DRAW_ON_CHILDREN) != 0)
 		return visible;
 	BPoint offset = view->OffsetInWindow();
+	std::vector<BRegion> covered;
 	for (BView* child = view->fFirstChild; child != nullptr; child = child->fNextSibling) {
 		if (child->fShowLevel <= 0 && (child->fFlags & B_TRANSPARENT_BACKGROUND) == 0)
-			visible.Exclude(child->fBounds.OffsetToCopy(child->fLeftTop + offset));
+			covered.emplace_back(child->fBounds.OffsetToCopy(child->fLeftTop + offset));
+	}
+	if (!covered.empty()) {
+		BRegion all = Union(covered);
+		visible.Exclude(&all);
 	}
 	return visible;
 }

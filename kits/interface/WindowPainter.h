@@ -80,6 +80,7 @@ private:
 	// What the canvas was last set up for.
 	BView* fBegunView;
 	uint32 fBegunState;
+	bool fBegunIsClipped;
 	uint32 fBegunGeneration;
 	BRegion fClip;
 	// Counts what changes the visible parts of views, updates that begin and end included.
