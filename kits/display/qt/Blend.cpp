@@ -21,18 +21,6 @@ Mix(uint8 from, uint8 to, uint8 amount)
 }
 
 
-uint32
-MixPixels(uint32 from, uint32 to, uint8 amount)
-{
-	if (amount == 255)
-		return to;
-	rgb_color a = ColorOf(from);
-	rgb_color b = ColorOf(to);
-	return PixelOf({Mix(a.red, b.red, amount), Mix(a.green, b.green, amount),
-		Mix(a.blue, b.blue, amount), Mix(a.alpha, b.alpha, amount)});
-}
-
-
 int32
 Brightness(rgb_color color)
 {

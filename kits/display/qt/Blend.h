@@ -24,6 +24,21 @@ ColorOf(uint32 pixel)
 }
 
 
+/// \a from with \a amount of 255 parts of \a to, each channel rounded to the nearest value.
+inline uint32
+MixPixels(uint32 from, uint32 to, uint32 amount)
+{
+	// Two channels at a time, each with room for 16 bits; x / 255 is (x + x / 256) / 256, rounded.
+	const uint32 kPair = 0x00ff00ff;
+	const uint32 kHalf = 0x00800080;
+	auto mix = [amount](uint32 one, uint32 other) {
+		uint32 sum = one * (255 - amount) + other * amount + kHalf;
+		return (sum + ((sum >> 8) & kPair)) >> 8 & kPair;
+	};
+	return mix(from & kPair, to & kPair) | mix(from >> 8 & kPair, to >> 8 & kPair) << 8;
+}
+
+
 /// A drawing mode with its colours, applied to single pixels.
 ///
 /// The buffer's alpha is kept opaque unless \a hasAlpha.

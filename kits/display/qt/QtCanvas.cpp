@@ -9,6 +9,7 @@
 #include <Region.h>
 
 #include "display/qt/Mask.h"
+#include "display/qt/RoundedShape.h"
 
 namespace BPrivate {
 
@@ -25,6 +26,37 @@ Whole(float coordinate)
 	if (!(coordinate > -kFarthest))
 		return static_cast<int>(-kFarthest);
 	return static_cast<int>(std::floor(std::min(coordinate, kFarthest)));
+}
+
+
+// Between characters and in them there is much that is not covered.
+const int kMany = 8;
+
+
+bool
+IsBlank(const uint8* coverage)
+{
+	uint64 bytes;
+	memcpy(&bytes, coverage, kMany);
+	return bytes == 0;
+}
+
+
+/// Puts \a pixel onto \a count pixels, as far as they are covered. Without alpha the result is opaque.
+void
+CoverPixels(uint32* pixels, const uint8* coverage, int count, uint32 pixel, bool hasAlpha)
+{
+	const uint32 opaque = hasAlpha ? 0 : 0xff000000;
+	for (int i = 0; i < count; i++) {
+		if (i + kMany <= count && IsBlank(coverage + i)) {
+			i += kMany - 1;
+			continue;
+		}
+		if (coverage[i] == 255)
+			pixels[i] = pixel;
+		else if (coverage[i] != 0)
+			pixels[i] = MixPixels(pixels[i], pixel, coverage[i]) | opaque;
+	}
 }
 
 
@@ -243,6 +275,14 @@ QtCanvas::PaintMask(const Mask& mask, const pattern& pattern)
 		return;
 	bool isHigh;
 	bool isSolid = IsSolid(pattern, &isHigh);
+	uint32 pixel;
+	if (isSolid && fBlend.IsPlainFill(isHigh, &pixel)) {
+		ForEachSpan(mask.Area(), [&](int y, int left, int right) {
+			CoverPixels(
+				Row(y) + left, mask.Row(left, y), right - left + 1, pixel, fBuffer.hasAlpha);
+		});
+		return;
+	}
 	ForEachSpan(mask.Area(), [&](int y, int left, int right) {
 		uint32* row = Row(y);
 		const uint8* coverage = mask.Row(left, y);
@@ -262,13 +302,67 @@ QtCanvas::PaintTextMask(const Mask& mask)
 	if (mask.IsEmpty())
 		return;
 	ForEachSpan(mask.Area(), [&](int y, int left, int right) {
-		uint32* row = Row(y);
-		const uint8* coverage = mask.Row(left, y);
-		for (int x = left; x <= right; x++, coverage++) {
-			if (*coverage != 0)
-				row[x] = fBlend.Text(row[x], *coverage);
-		}
+		PaintTextRow(Row(y) + left, mask.Row(left, y), right - left + 1);
 	});
+}
+
+
+void
+QtCanvas::PaintTextRow(uint32* pixels, const uint8* coverage, int count)
+{
+	uint32 pixel;
+	if (fBlend.mode != B_OP_COPY && fBlend.IsPlainFill(true, &pixel)) {
+		CoverPixels(pixels, coverage, count, pixel, fBuffer.hasAlpha);
+		return;
+	}
+	for (int i = 0; i < count; i++) {
+		if (coverage[i] != 0)
+			pixels[i] = fBlend.Text(pixels[i], coverage[i]);
+	}
+}
+
+
+bool
+QtCanvas::PaintRounded(
+	BRect rect, float xRadius, float yRadius, bool stroked, const pattern& pattern)
+{
+	const BPoint leftTop = rect.LeftTop() + fState.origin;
+	const bool isWhole = fScale == 1 && leftTop.x == std::floor(leftTop.x)
+		&& leftTop.y == std::floor(leftTop.y) && rect.Width() == std::floor(rect.Width())
+		&& rect.Height() == std::floor(rect.Height());
+	bool isHigh;
+	uint32 pixel;
+	if (!isWhole || (stroked && fState.penSize != 1) || !RoundedShape::IsKept(xRadius, yRadius)
+		|| !IsSolid(pattern, &isHigh) || !fBlend.IsPlainFill(isHigh, &pixel))
+		return false;
+
+	const QRect whole = WholeRect(rect);
+	const RoundedShape& shape = RoundedShape::Of(xRadius, yRadius, stroked);
+	if (whole.width() < shape.Side() || whole.height() < shape.Side())
+		return false;
+
+	const int corner = shape.Corner();
+	ForEachSpan(whole, [&](int y, int left, int right) {
+		const uint8* coverage = shape.Row(y - whole.top(), whole.height());
+		auto cover = [&](int from, int to, const uint8* covered) {
+			from = std::max(from, left);
+			to = std::min(to, right);
+			if (from <= to)
+				CoverPixels(Row(y) + from, covered + from, to - from + 1, pixel, fBuffer.hasAlpha);
+		};
+		const int lastCorner = whole.right() - corner + 1;
+		cover(whole.left(), whole.left() + corner - 1, coverage - whole.left());
+		cover(lastCorner, whole.right(), coverage + corner + 1 - lastCorner);
+		const int from = std::max(whole.left() + corner, left);
+		const int to = std::min(lastCorner - 1, right);
+		const uint8 middle = coverage[corner];
+		uint32* row = Row(y);
+		if (middle == 255 && from <= to)
+			std::fill(row + from, row + to + 1, pixel);
+		for (int x = from; middle != 0 && middle != 255 && x <= to; x++)
+			CoverPixels(row + x, &middle, 1, pixel, fBuffer.hasAlpha);
+	});
+	return true;
 }
 
 

@@ -3,6 +3,7 @@
 #ifndef DISPLAY_QT_CANVAS_H
 #define DISPLAY_QT_CANVAS_H
 
+#include <algorithm>
 #include <vector>
 
 #include <QRect>
@@ -78,11 +79,16 @@ private:
 	void FillDevice(const QRect& device, const pattern& pattern);
 	void PaintMask(const Mask& mask, const pattern& pattern);
 	void PaintTextMask(const Mask& mask);
+	void PaintTextRow(uint32* pixels, const uint8* coverage, int count);
+	/// A rounded rect of whole pixels by its corners alone; false where it needs its whole outline.
+	bool PaintRounded(
+		BRect rect, float xRadius, float yRadius, bool stroked, const pattern& pattern);
 	template <typename Function>
 	void ForEachSpan(const QRect& device, Function function);
 	bool IsHigh(const pattern& pattern, int x, int y) const;
 
 	void DrawRun(const char* text, int32 length, BPoint where, float width);
+	bool DrawKnownRun(const char* text, int32 length, BPoint where);
 
 	// Outlines, in the buffer's coordinates
 	void StrokeOutline(const QPainterPath& outline, const pattern& pattern);
@@ -112,9 +118,13 @@ QtCanvas::ForEachSpan(const QRect& device, Function function)
 	if (!device.intersects(fClipBounds))
 		return;
 	for (const QRect& clip : fClip) {
-		QRect visible = clip & device;
-		for (int y = visible.top(); y <= visible.bottom(); y++)
-			function(y, visible.left(), visible.right());
+		const int left = std::max(clip.left(), device.left());
+		const int right = std::min(clip.right(), device.right());
+		const int bottom = std::min(clip.bottom(), device.bottom());
+		if (left > right)
+			continue;
+		for (int y = std::max(clip.top(), device.top()); y <= bottom; y++)
+			function(y, left, right);
 	}
 }
 

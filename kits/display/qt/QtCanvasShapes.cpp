@@ -188,7 +188,7 @@ QtCanvas::FillRegion(const BRegion& region, const pattern& pattern)
 void
 QtCanvas::StrokeRoundRect(BRect rect, float xRadius, float yRadius, const pattern& pattern)
 {
-	if (!rect.IsValid())
+	if (!rect.IsValid() || PaintRounded(rect, xRadius, yRadius, true, pattern))
 		return;
 	QPainterPath path;
 	path.addRoundedRect(CenterRect(rect), xRadius, yRadius);
@@ -199,7 +199,7 @@ QtCanvas::StrokeRoundRect(BRect rect, float xRadius, float yRadius, const patter
 void
 QtCanvas::FillRoundRect(BRect rect, float xRadius, float yRadius, const pattern& pattern)
 {
-	if (!rect.IsValid())
+	if (!rect.IsValid() || PaintRounded(rect, xRadius, yRadius, false, pattern))
 		return;
 	QPainterPath path;
 	path.addRoundedRect(EdgeRect(rect), xRadius, yRadius);

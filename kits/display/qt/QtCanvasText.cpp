@@ -19,6 +19,10 @@ namespace BPrivate {
 
 namespace {
 
+// Far outside of any buffer.
+const double kFarthestText = 1 << 24;
+
+
 bool
 IsSpace(uint32 character)
 {
@@ -89,6 +93,8 @@ QtCanvas::DrawString(const char* text, int32 length, const BPoint* locations, in
 void
 QtCanvas::DrawRun(const char* text, int32 length, BPoint where, float width)
 {
+	if (DrawKnownRun(text, length, where))
+		return;
 	// What is far outside needs no characters.
 	FontKey key = FontKey::Of(fState.font);
 	font_height height = fFonts.Height(key);
@@ -115,6 +121,37 @@ QtCanvas::DrawRun(const char* text, int32 length, BPoint where, float width)
 	painter.drawText(QPointF(0, 0), QString::fromUtf8(text, length));
 	painter.end();
 	PaintTextMask(mask);
+}
+
+
+/// Draws a short upright text by what is kept of it. False when nothing is kept of such a text.
+bool
+QtCanvas::DrawKnownRun(const char* text, int32 length, BPoint where)
+{
+	if (!TextRuns::IsKept(length) || fState.font.Rotation() != 0 || fState.font.Shear() != 90)
+		return false;
+	const double baseX = (static_cast<double>(where.x) + fState.origin.x) * fScale;
+	const double baseY = (static_cast<double>(where.y) + fState.origin.y) * fScale;
+	if (!(std::abs(baseX) < kFarthestText && std::abs(baseY) < kFarthestText))
+		return false;
+
+	const QPoint pixel(static_cast<int>(std::floor(baseX)), static_cast<int>(std::floor(baseY)));
+	const QPointF rest(baseX - pixel.x(), baseY - pixel.y());
+	const FontKey key = FontKey::Of(fState.font);
+	std::shared_ptr<const TextRun> run = fFonts.Runs().Find(key, text, length);
+	if (run == nullptr || run->scale != fScale || run->x != rest.x() || run->y != rest.y()) {
+		run = fFonts.MakeRun(key, text, length, fScale, rest);
+		if (run == nullptr)
+			return false;
+	}
+
+	const QRect area = run->area.translated(pixel);
+	ForEachSpan(area, [&](int y, int left, int right) {
+		const uint8* coverage =
+			run->coverage.data() + (y - area.top()) * area.width() + left - area.left();
+		PaintTextRow(Row(y) + left, coverage, right - left + 1);
+	});
+	return true;
 }
 
 } // namespace BPrivate

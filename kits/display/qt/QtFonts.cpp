@@ -11,10 +11,12 @@
 #include <QFontDatabase>
 #include <QFontInfo>
 #include <QFontMetricsF>
+#include <QPainter>
 #include <QString>
 #include <QStringList>
 
 #include "display/Utf8.h"
+#include "display/qt/Mask.h"
 
 namespace BPrivate {
 
@@ -22,13 +24,15 @@ namespace {
 
 // Qt counts in points of 96 to 72 pixels (the application object is told so).
 const double kPointsPerPixel = 0.75;
+// Pixels of a text that is kept.
+const double kLargestRun = 65536;
 
 
 /// The font and metrics that a thread used last: most text comes in runs of one font.
 struct LastFont {
 	FontKey key;
-	QFont font;
 	QFontMetricsF metrics;
+	font_height height;
 };
 
 
@@ -88,13 +92,37 @@ SameKey(const FontKey& a, const FontKey& b)
 }
 
 
+/// The smallest rect around what is covered.
+QRect
+InkOf(const Mask& mask)
+{
+	const QRect area = mask.Area();
+	QRect ink;
+	for (int y = area.top(); y <= area.bottom(); y++) {
+		const uint8* row = mask.Row(area.left(), y);
+		const uint8* end = row + area.width();
+		const uint8* first = std::find_if(row, end, [](uint8 coverage) { return coverage != 0; });
+		if (first == end)
+			continue;
+		const uint8* last = end - 1;
+		while (*last == 0)
+			last--;
+		ink |= QRect(QPoint(area.left() + static_cast<int>(first - row), y),
+			QPoint(area.left() + static_cast<int>(last - row), y));
+	}
+	return ink;
+}
+
+
 const LastFont&
 Last(QtFonts& fonts, const FontKey& key)
 {
 	thread_local std::optional<LastFont> last;
 	if (!last.has_value() || !SameKey(last->key, key)) {
-		QFont font = fonts.FontFor(key, 1);
-		last.emplace(LastFont{key, font, QFontMetricsF(font)});
+		const QFontMetricsF metrics(fonts.FontFor(key, 1));
+		last.emplace(LastFont{key, metrics,
+			{static_cast<float>(metrics.ascent()), static_cast<float>(metrics.descent()),
+				static_cast<float>(std::max(metrics.leading(), 0.0))}});
 	}
 	return *last;
 }
@@ -235,6 +263,22 @@ QtFonts::GetStandardFont(standard_font which, uint16* family, uint16* style, flo
 QFont
 QtFonts::FontFor(const FontKey& key, float scale)
 {
+	// The one that the thread asked for last: Qt has found what belongs to it already.
+	struct Known {
+		FontKey key;
+		float scale;
+		QFont font;
+	};
+	thread_local std::optional<Known> known;
+	if (!known.has_value() || known->scale != scale || !SameKey(known->key, key))
+		known.emplace(Known{key, scale, MakeFont(key, scale)});
+	return known->font;
+}
+
+
+QFont
+QtFonts::MakeFont(const FontKey& key, float scale)
+{
 	QFont font;
 	{
 		std::lock_guard<std::mutex> lock(fMutex);
@@ -269,9 +313,7 @@ QtFonts::FontFor(const FontKey& key, float scale)
 font_height
 QtFonts::Height(const FontKey& font)
 {
-	const QFontMetricsF& metrics = Last(*this, font).metrics;
-	return {static_cast<float>(metrics.ascent()), static_cast<float>(metrics.descent()),
-		static_cast<float>(std::max(metrics.leading(), 0.0))};
+	return Last(*this, font).height;
 }
 
 
@@ -280,8 +322,59 @@ QtFonts::StringWidth(const FontKey& font, const char* text, int32 length)
 {
 	if (length <= 0)
 		return 0;
+	const bool isKept = TextRuns::IsKept(length);
+	if (isKept) {
+		const std::shared_ptr<const TextRun> known = fRuns.Find(font, text, length);
+		if (known != nullptr)
+			return known->width;
+	}
 	const QFontMetricsF& metrics = Last(*this, font).metrics;
-	return static_cast<float>(metrics.horizontalAdvance(QString::fromUtf8(text, length)));
+	const float width =
+		static_cast<float>(metrics.horizontalAdvance(QString::fromUtf8(text, length)));
+	if (isKept) {
+		auto run = std::make_shared<TextRun>();
+		run->width = width;
+		fRuns.Keep(font, text, length, run);
+	}
+	return width;
+}
+
+
+std::shared_ptr<const TextRun>
+QtFonts::MakeRun(
+	const FontKey& font, const char* text, int32 length, float scale, const QPointF& rest)
+{
+	auto run = std::make_shared<TextRun>();
+	run->width = StringWidth(font, text, length);
+	run->scale = scale;
+	run->x = rest.x();
+	run->y = rest.y();
+
+	const font_height height = Height(font);
+	const double margin = font.size + 2;
+	const QRectF box(rest.x() - margin * scale, rest.y() - (height.ascent + margin) * scale,
+		(run->width + 2 * margin) * scale, (height.ascent + height.descent + 2 * margin) * scale);
+	if (box.width() * box.height() > kLargestRun)
+		return nullptr;
+	Mask mask(box.toAlignedRect());
+	if (mask.IsEmpty())
+		return nullptr;
+	QPainter painter(&mask.Image());
+	painter.setRenderHint(QPainter::TextAntialiasing, (font.flags & B_DISABLE_ANTIALIASING) == 0);
+	painter.translate(rest - mask.Area().topLeft());
+	painter.setPen(Qt::white);
+	painter.setFont(FontFor(font, scale));
+	painter.drawText(QPointF(0, 0), QString::fromUtf8(text, length));
+	painter.end();
+
+	run->area = InkOf(mask);
+	for (int y = run->area.top(); y <= run->area.bottom(); y++) {
+		const uint8* row = mask.Row(run->area.left(), y);
+		run->coverage.insert(run->coverage.end(), row, row + run->area.width());
+	}
+	run->coverage.shrink_to_fit();
+	fRuns.Keep(font, text, length, run);
+	return run;
 }
 
 

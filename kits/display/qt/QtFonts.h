@@ -8,8 +8,10 @@
 #include <vector>
 
 #include "display/FontEngine.h"
+#include "display/qt/TextRuns.h"
 
 class QFont;
+class QPointF;
 class QString;
 
 namespace BPrivate {
@@ -32,6 +34,13 @@ public:
 		const FontKey& font, const char* text, int32 count, float* escapements) override;
 	void GetGlyphBounds(const FontKey& font, const char* text, int32 count, BRect* bounds) override;
 
+	/// What is known of short texts.
+	TextRuns& Runs() { return fRuns; }
+
+	/// Draws the text for a baseline that starts at \a rest within a pixel, and keeps it. Null when it is too large.
+	std::shared_ptr<const TextRun> MakeRun(
+		const FontKey& font, const char* text, int32 length, float scale, const QPointF& rest);
+
 	/// The font for drawing at \a scale device pixels for each of the API's.
 	QFont FontFor(const FontKey& font, float scale);
 
@@ -50,11 +59,13 @@ private:
 		std::vector<Style> styles;
 	};
 
+	QFont MakeFont(const FontKey& font, float scale);
 	Family* FamilyAt(int32 index);
 	void ReadFamilies();
 	void FindStandardFonts();
 
 	// The lists are read when they are first asked for: the host may have a great many fonts.
+	TextRuns fRuns;
 	std::mutex fMutex;
 	bool fHasFamilies;
 	std::vector<Family> fFamilies;
