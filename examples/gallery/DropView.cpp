@@ -7,6 +7,9 @@
 
 #include <Entry.h>
 #include <Message.h>
+#include <Window.h>
+
+#include "Commands.h"
 
 namespace {
 
@@ -86,6 +89,7 @@ DropView::MessageReceived(BMessage* message)
 		TakeFiles(message);
 	else if (!TakeText(message))
 		SetLines("Something that is neither a file nor a text");
+	TellWindow();
 }
 
 
@@ -109,6 +113,18 @@ DropView::TakeText(const BMessage* message)
 		return false;
 	SetLines(BString(static_cast<const char*>(data), static_cast<int32>(size)));
 	return true;
+}
+
+
+void
+DropView::TellWindow()
+{
+	BString text("Dropped: ");
+	text << fLines;
+	text.ReplaceAll('\n', ' ');
+	BMessage tell(GM_TELL);
+	tell.AddString("text", text.Trim());
+	Window()->PostMessage(&tell);
 }
 
 

@@ -19,6 +19,7 @@ public:
 private:
 	void TakeFiles(const BMessage* message);
 	bool TakeText(const BMessage* message);
+	void TellWindow();
 	void SetLines(const BString& lines);
 
 	BString fLines;

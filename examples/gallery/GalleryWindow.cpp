@@ -68,6 +68,10 @@ GalleryWindow::MessageReceived(BMessage* message)
 			TellSaved(message);
 			break;
 
+		case GM_TELL:
+			fStatus->SetText(message->GetString("text", ""));
+			break;
+
 		case kMsgAlertAnswered:
 		{
 			BString text("The alert was answered with button ");

@@ -17,11 +17,11 @@ WHOLE_LIMIT = 220
 class Program:
     """A running exchange_program, or any other that prints lines."""
 
-    def __init__(self, desktop, command, name):
+    def __init__(self, desktop, command, name, **options):
         self.name = name
         self.seen = 0
         self.output_file = desktop.output_of(name)
-        self.process = desktop.start(command, name, stdin=subprocess.PIPE)
+        self.process = desktop.start(command, name, stdin=subprocess.PIPE, **options)
 
     def lines(self):
         text = self.output_file.read_text(encoding="utf-8", errors="replace")
