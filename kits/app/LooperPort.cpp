@@ -182,8 +182,8 @@ LooperPort::WaitForMessage(bigtime_t timeout)
 {
 	Deadline deadline(timeout);
 	std::unique_lock<std::mutex> lock(fMutex);
-	const bool arrived = deadline.Wait(
-		fArrived, lock, [this] { return !fMessages.empty() || fMovedByOthers; });
+	const bool arrived =
+		deadline.Wait(fArrived, lock, [this] { return !fMessages.empty() || fMovedByOthers; });
 	fMovedByOthers = false;
 	return arrived;
 }

@@ -37,8 +37,8 @@ TEventView::TEventView(BRect frame)
 	listFrame.top = labelBottom + kLabelGap + kInset;
 	listFrame.right -= B_V_SCROLL_BAR_WIDTH;
 
-	BStringView* name = new BStringView(BRect(kNameLeft, kLabelGap, kNameLeft + 10, labelBottom),
-		"lblEventName", "Name:");
+	BStringView* name = new BStringView(
+		BRect(kNameLeft, kLabelGap, kNameLeft + 10, labelBottom), "lblEventName", "Name:");
 	BStringView* selected = new BStringView(BRect(0, kLabelGap, 10, labelBottom),
 		"lblEventSelected", "Selected:", B_FOLLOW_RIGHT | B_FOLLOW_TOP);
 	for (BStringView* label : {name, selected}) {

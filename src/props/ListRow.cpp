@@ -20,7 +20,7 @@ constexpr rgb_color kDisabledNameColor = {100, 100, 100, 255};
 
 constexpr float kNameLeft = 4;
 constexpr float kNameMargin = 2; // before the line between the columns
-constexpr float kBaseline = 2; // above the bottom
+constexpr float kBaseline = 2;   // above the bottom
 
 } // namespace
 
