@@ -110,7 +110,7 @@ TEditorPanes::InitEditorFor(TPropEditType type)
 		case PET_MODAL:
 			fModalField = AddField(type, "efModalEdit", width - kButtonWidth, PWM_MODAL_EDIT_FIELD);
 			fModalField->TextView()->MakeEditable(false);
-			fModalField->TextView()->SetFlags(fModalField->TextView()->Flags() & ~B_NAVIGABLE);
+			fModalField->SetFlags(fModalField->Flags() & ~B_NAVIGABLE);
 			fModalButton = AddButton(type, "btnModalEdit", PWM_MODAL_EDIT_BUTTON);
 			break;
 
