@@ -189,8 +189,7 @@ Drag(benchmark::State& state)
 		state.counters["frames"] = static_cast<double>(system_time() - startTime) / 16000;
 		refreshes += sReads - before;
 	}
-	state.counters["refreshes"] =
-		benchmark::Counter(refreshes, benchmark::Counter::kAvgIterations);
+	state.counters["refreshes"] = benchmark::Counter(refreshes, benchmark::Counter::kAvgIterations);
 }
 
 BENCHMARK(Drag)->UseManualTime()->Unit(benchmark::kMillisecond)->Iterations(3);
