@@ -91,11 +91,21 @@ OfferDesignMessage(TComponent* component, BMessage* message)
 
 
 DesignGlass::DesignGlass(TComponent* component, BView* covered)
-	: BView(covered->Bounds(), "glass", B_FOLLOW_ALL_SIDES, 0),
+	: BView(covered->Bounds(), "glass", B_FOLLOW_ALL_SIDES, B_WILL_DRAW),
 	  fComponent(component)
 {
+	// Else the control draws nothing where the glass is, which is everywhere.
+	covered->SetFlags(covered->Flags() | B_DRAW_ON_CHILDREN);
 	SetViewColor(B_TRANSPARENT_COLOR);
 	covered->AddChild(this);
+}
+
+
+void
+DesignGlass::Draw(BRect)
+{
+	// Again, as the control's children lie over what it has drawn itself.
+	fComponent->DesignerDrawSelection();
 }
 
 

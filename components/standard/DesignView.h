@@ -91,12 +91,13 @@ private:
 };
 
 /// An invisible view over a control that has child views of its own: it keeps the mouse from them and
-/// hands it to the control's component.
+/// hands it to the control's component, and shows over them that the component is selected.
 class DesignGlass : public BView {
 public:
 	/// Covers \a covered, which it is added to.
 	DesignGlass(TComponent* component, BView* covered);
 
+	void Draw(BRect updateRect) override;
 	void MouseDown(BPoint where) override;
 	void MessageReceived(BMessage* message) override;
 

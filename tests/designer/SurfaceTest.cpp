@@ -155,8 +155,8 @@ SurfaceTest::Draw(const char* className, BRect frame)
 void
 SurfaceTest::Locked(const std::function<void()>& task) const
 {
-	BAutolock lock(fForm);
-	ASSERT_TRUE(lock.IsLocked());
+	WindowGuard guard(fForm);
+	ASSERT_TRUE(guard.IsLocked());
 	task();
 }
 

@@ -1,0 +1,302 @@
+// SPDX-License-Identifier: MIT
+// A user who does anything, in any order, on two forms: nothing gets lost or out of step.
+
+#include "designer/SurfaceTest.h"
+
+#include <cstdlib>
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+#include <random>
+#include <set>
+
+#include "app/WindowGuard.h"
+#include "model/Property.h"
+#include "model/PropertyStore.h"
+#include "support/Printers.h"
+
+namespace {
+
+constexpr const char* kClasses[] = {
+	"TButton", "TCheckBox", "TTextControl", "TStringView", "TBox", "TBox"};
+constexpr const char* kEdges[] = {"Left", "Top", "Right", "Bottom"};
+
+/// The usual test run has time for few; PLIM_RANDOM_ACTIONS says how many, PLIM_RANDOM_SEED which.
+constexpr int kUsualActions = 120;
+constexpr int kActionsBetweenSaves = 20;
+
+
+int
+Setting(const char* name, int usual)
+{
+	const char* value = getenv(name);
+	return value != nullptr ? atoi(value) : usual;
+}
+
+
+std::string
+Content(const std::string& path)
+{
+	std::ifstream file(path, std::ios::binary);
+	return std::string(std::istreambuf_iterator<char>(file), {});
+}
+
+} // namespace
+
+class DesignRandomTest : public SurfaceTest {
+protected:
+	DesignRandomTest()
+		: fSeed(Setting("PLIM_RANDOM_SEED", 1)),
+		  fRandom(fSeed),
+		  fForms{Form(), NewForm()}
+	{
+	}
+
+	int Number(int below) { return std::uniform_int_distribution<int>(0, below - 1)(fRandom); }
+
+	/// Now and then a little outside the form.
+	BPoint Place() { return BPoint(Number(320) - 10, Number(310) - 5); }
+
+	/// The middle, or the corner, of a component; none when there is none.
+	bool SomeComponent(bool handle, BPoint* where)
+	{
+		TComponent* component = nullptr;
+		Locked([&] {
+			if (Form()->CountComponents() > 0)
+				component = Form()->ComponentAt(Number(Form()->CountComponents()));
+		});
+		if (component == nullptr)
+			return false;
+		const BRect frame = FrameOnForm(component);
+		*where = handle ? frame.RightBottom() - BPoint(Number(6), Number(6))
+						: BPoint(static_cast<int>(frame.left + frame.right) / 2,
+							static_cast<int>(frame.top + frame.bottom) / 2);
+		// Beside the form there are other windows.
+		return BRect(0, 0, 300, 300).Contains(*where);
+	}
+
+	void Drag(BPoint from, BPoint to)
+	{
+		fRobot.MoveTo(from);
+		fRobot.Press();
+		fRobot.MoveTo(from + BPoint(4, 3));
+		fRobot.MoveTo(to);
+		if (Number(12) == 0)
+			fRobot.Key("escape");
+		fRobot.Release();
+	}
+
+	std::string Act()
+	{
+		BPoint where;
+		const int kind = Number(100);
+		if (kind < 20) {
+			const char* className = kClasses[Number(std::size(kClasses))];
+			Choose(className);
+			Drag(BPoint(Number(290) + 5, Number(290) + 5), Place());
+			return std::string("place ") + className;
+		}
+		if (kind < 50) {
+			if (SomeComponent(false, &where))
+				Drag(where, Place());
+			return "drag";
+		}
+		if (kind < 65) {
+			if (SomeComponent(true, &where))
+				Drag(where, Place());
+			return "resize";
+		}
+		if (kind < 72) {
+			fRobot.Click(BPoint(Number(300), Number(300)), 1 + Number(2));
+			return "click";
+		}
+		if (kind < 76) {
+			WorkOn(Form() == fForms[0] ? fForms[1] : fForms[0]);
+			return "other form";
+		}
+		if (kind < 82) {
+			if (SomeComponent(false, &where)) {
+				const BPoint distance(0, fForms[0] == Form() ? 320 : -320);
+				Drag(where, BPoint(Number(280) + 10, Number(280) + 10) + distance);
+			}
+			return "drag to the other form";
+		}
+		if (kind < 88) {
+			const char* commands[] = {"Copy", "Cut", "Delete"};
+			const char* command = commands[Number(3)];
+			if (SomeComponent(false, &where) && !ChooseFromMenu(where, command))
+				return std::string("no menu for ") + command;
+			return command;
+		}
+		if (kind < 95) {
+			fRobot.MoveTo(BPoint(Number(300), Number(300)));
+			std::set<TComponent*> before = Components();
+			fRobot.Key("command+v");
+			fRobot.Settle();
+			for (TComponent* component : Components()) {
+				if (before.count(component) == 0)
+					fPasted.insert(component);
+			}
+			return "paste";
+		}
+		if (kind < 98) {
+			if (SomeComponent(false, &where)) {
+				fRobot.Click(where);
+				const char* edge = kEdges[Number(4)];
+				TComponent* shown = Shown();
+				Locked([&] {
+					if (Form()->View()->Lists(shown))
+						shown->FindProperty(edge)->Editor()->SetValue(
+							std::to_string(Number(250) + 20).c_str(), true);
+				});
+				fEdited.insert(shown);
+			}
+			return "edit";
+		}
+		Answer(Number(4) > 0 ? 1 : 0);
+		if (!ChooseFromMenu(BPoint(298, 298), "Delete all components"))
+			fRobot.Key("escape");
+		Answer(0);
+		return "delete all";
+	}
+
+	std::set<TComponent*> Components() const
+	{
+		std::set<TComponent*> components;
+		Locked([&] {
+			for (int32 i = 0; i < Form()->CountComponents(); i++)
+				components.insert(Form()->ComponentAt(i));
+		});
+		return components;
+	}
+
+	void CheckForm(TDesignForm* form, const std::string& what)
+	{
+		WindowGuard guard(form);
+		std::set<std::string> names;
+		int32 onForm = 0;
+		int32 selected = form->IsDesignerSelected() ? 1 : 0;
+		for (int32 i = 0; i < form->CountComponents(); i++) {
+			TComponent* component = form->ComponentAt(i);
+			const std::string name = component->ComponentName();
+			SCOPED_TRACE(what + ": " + name);
+			EXPECT_TRUE(names.insert(name).second);
+			EXPECT_EQ(name, component->FindProperty("Name")->Value());
+			EXPECT_EQ(component->Designer(), static_cast<TFormDesigner*>(form->View()));
+			selected += component->IsDesignerSelected() ? 1 : 0;
+
+			BView* view = component->DTView();
+			ASSERT_NE(view, nullptr);
+			ASSERT_EQ(view->Window(), form);
+			int32 lists = 0;
+			const TComponentOwner* holder = nullptr;
+			for (int32 k = 0; k < form->CountComponents(); k++) {
+				TComponent* other = form->ComponentAt(k);
+				TComponentOwner* container = dynamic_cast<TComponentOwner*>(other);
+				for (int32 m = 0; container != nullptr && m < container->CountComponents(); m++)
+					lists += container->ComponentAt(m) == component ? 1 : 0;
+				if (other->DTView() == view->Parent())
+					holder = container;
+			}
+			if (view->Parent() == form->View()) {
+				onForm++;
+				EXPECT_EQ(lists, 0);
+				EXPECT_TRUE(component->Owner() == nullptr || form->IsForm(component->Owner()));
+			} else {
+				EXPECT_NE(holder, nullptr);
+				EXPECT_EQ(component->Owner(), holder);
+				EXPECT_EQ(lists, 1);
+			}
+			CheckEdges(component);
+		}
+		EXPECT_EQ(form->View()->CountChildren(), onForm) << what;
+		EXPECT_LE(selected, 1) << what;
+	}
+
+	void CheckEdges(TComponent* component)
+	{
+		const BRect frame = component->DTView()->Frame();
+		const int32 edges[] = {static_cast<int32>(frame.left), static_cast<int32>(frame.top),
+			static_cast<int32>(frame.right), static_cast<int32>(frame.bottom)};
+		bool isTold = true;
+		for (int i = 0; i < 4; i++) {
+			const std::string value = component->FindProperty(kEdges[i])->Value();
+			EXPECT_STREQ(component->GetPropertyValue(kEdges[i]), value.c_str());
+			isTold = isTold && value == std::to_string(edges[i]);
+		}
+		// A pasted component tells the frame that was copied, and an edited one what was typed, until it is moved.
+		if (!isTold)
+			EXPECT_TRUE(fPasted.count(component) + fEdited.count(component) > 0) << frame.left;
+		else {
+			fPasted.erase(component);
+			fEdited.erase(component);
+		}
+	}
+
+	void CheckInspector(const std::string& what)
+	{
+		TComponent* shown = Shown();
+		bool isThere = shown == nullptr;
+		for (TDesignForm* form : fForms) {
+			WindowGuard guard(form);
+			isThere = isThere || shown == form || form->View()->Lists(shown);
+		}
+		EXPECT_TRUE(isThere) << what;
+	}
+
+	std::string SaveAgain(const std::string& from, const char* name)
+	{
+		const std::string path = fFolder / name;
+		TDesignForm* form = new TDesignForm("Again", FORM_HIDDEN);
+		EXPECT_TRUE(form->LoadFromFile(from.c_str()));
+		EXPECT_TRUE(form->SaveToFile(path.c_str()));
+		form->Lock();
+		form->Quit();
+		return path;
+	}
+
+	void CheckDocument(TDesignForm* form, const std::string& what)
+	{
+		// A longer file would keep its tail.
+		for (const char* name : {"first.frm", "second.frm", "third.frm"})
+			std::filesystem::remove(fFolder / name);
+		const std::string first = fFolder / "first.frm";
+		bool isTold = true;
+		{
+			WindowGuard guard(form);
+			EXPECT_TRUE(form->SaveToFile(first.c_str()));
+			EXPECT_FALSE(form->Modified());
+			for (int32 i = 0; i < form->CountComponents(); i++)
+				isTold = isTold
+					&& fPasted.count(form->ComponentAt(i)) + fEdited.count(form->ComponentAt(i))
+						== 0;
+		}
+		const std::string second = SaveAgain(first, "second.frm");
+		EXPECT_TRUE(!isTold || Content(first) == Content(second)) << what;
+		EXPECT_TRUE(Content(second) == Content(SaveAgain(second, "third.frm"))) << what;
+	}
+
+	const int fSeed;
+	std::mt19937 fRandom;
+	TDesignForm* fForms[2];
+	std::set<TComponent*> fPasted;
+	std::set<TComponent*> fEdited;
+};
+
+
+TEST_F(DesignRandomTest, AnythingInAnyOrderKeepsAllInStep)
+{
+	const int actions = Setting("PLIM_RANDOM_ACTIONS", kUsualActions);
+	for (int i = 0; i < actions && !HasFailure(); i++) {
+		const std::string what =
+			"seed " + std::to_string(fSeed) + ", action " + std::to_string(i) + " (" + Act() + ")";
+		EXPECT_TRUE(fRobot.Settle()) << what;
+		for (TDesignForm* form : fForms)
+			CheckForm(form, what);
+		CheckInspector(what);
+		if (i % kActionsBetweenSaves == kActionsBetweenSaves - 1) {
+			for (TDesignForm* form : fForms)
+				CheckDocument(form, what);
+		}
+	}
+}
