@@ -8,6 +8,7 @@
 
 #include <Region.h>
 
+#include "display/qt/CoverPixels.h"
 #include "display/qt/Mask.h"
 #include "display/qt/RoundedShape.h"
 
@@ -26,37 +27,6 @@ Whole(float coordinate)
 	if (!(coordinate > -kFarthest))
 		return static_cast<int>(-kFarthest);
 	return static_cast<int>(std::floor(std::min(coordinate, kFarthest)));
-}
-
-
-// Between characters and in them there is much that is not covered.
-const int kMany = 8;
-
-
-bool
-IsBlank(const uint8* coverage)
-{
-	uint64 bytes;
-	memcpy(&bytes, coverage, kMany);
-	return bytes == 0;
-}
-
-
-/// Puts \a pixel onto \a count pixels, as far as they are covered. Without alpha the result is opaque.
-void
-CoverPixels(uint32* pixels, const uint8* coverage, int count, uint32 pixel, bool hasAlpha)
-{
-	const uint32 opaque = hasAlpha ? 0 : 0xff000000;
-	for (int i = 0; i < count; i++) {
-		if (i + kMany <= count && IsBlank(coverage + i)) {
-			i += kMany - 1;
-			continue;
-		}
-		if (coverage[i] == 255)
-			pixels[i] = pixel;
-		else if (coverage[i] != 0)
-			pixels[i] = MixPixels(pixels[i], pixel, coverage[i]) | opaque;
-	}
 }
 
 

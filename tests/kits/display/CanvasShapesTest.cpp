@@ -2,6 +2,7 @@
 // Which pixels lines, rects and outlines cover.
 #include <cmath>
 #include <limits>
+#include <vector>
 
 #include <Region.h>
 
@@ -177,6 +178,33 @@ TEST_F(CanvasShapesTest, ARoundRectHasStraightSidesAndOpenCorners)
 	EXPECT_EQ(fCanvas->PixelAt(BPoint(7, 9)), kBlack);
 	EXPECT_EQ(fCanvas->PixelAt(BPoint(1, 1)), kWhite);
 	EXPECT_EQ(fCanvas->PixelAt(BPoint(7, 5)), kWhite);
+}
+
+
+TEST_F(CanvasShapesTest, ARoundRectIsTheSameOfOneColourAsOfAPatternOfIt)
+{
+	fState.highColor = kRed;
+	fState.lowColor = kRed;
+	const BRect kRects[] = {BRect(1, 1, 18, 10), BRect(2, 1, 10, 9), BRect(3, 2, 6, 5),
+		BRect(-6, -4, 9, 8), BRect(1.5f, 1, 15, 10.25f)};
+	for (const BRect& rect : kRects) {
+		for (float radius : {0.0f, 0.5f, 1.0f, 2.0f, 3.0f, 4.5f}) {
+			for (bool stroked : {false, true}) {
+				std::vector<uint32> pixels[2];
+				for (const pattern& pattern : {B_SOLID_HIGH, B_MIXED_COLORS}) {
+					auto canvas = BPrivate::Display::Get().MakeCanvas(20, 12, 1);
+					canvas->SetState(fState);
+					if (stroked)
+						canvas->StrokeRoundRect(rect, radius, radius / 2 + 1, pattern);
+					else
+						canvas->FillRoundRect(rect, radius, radius / 2 + 1, pattern);
+					pixels[pattern == B_SOLID_HIGH ? 0 : 1] = canvas->ReadPicture().pixels;
+				}
+				EXPECT_TRUE(pixels[0] == pixels[1])
+					<< testing::PrintToString(rect) << " with a radius of " << radius << (stroked ? ", stroked" : "");
+			}
+		}
+	}
 }
 
 

@@ -5,6 +5,7 @@
 #include <thread>
 #include <vector>
 
+#include <Region.h>
 #include <String.h>
 
 #include "CanvasFixture.h"
@@ -125,6 +126,50 @@ TEST_F(CanvasTextTest, OverSmoothsAgainstWhatIsThere)
 			static_cast<uint8>(pixel), 255};
 		ASSERT_EQ(color.red, color.green);
 	}
+}
+
+
+TEST_F(CanvasTextTest, ATextThatIsDrawnAgainHasTheSamePixels)
+{
+	const auto drawnAt = [](BPoint where, const BRegion* clip = nullptr) {
+		auto canvas = BPrivate::Display::Get().MakeCanvas(200, 60, 1);
+		canvas->SetClip(clip);
+		canvas->DrawString("A label", 7, where, nullptr);
+		return canvas->ReadPicture().pixels;
+	};
+	const std::vector<uint32> first = drawnAt(BPoint(10, 40));
+	const std::vector<uint32> shifted = drawnAt(BPoint(10.5f, 40));
+	EXPECT_FALSE(shifted == first);
+	EXPECT_TRUE(drawnAt(BPoint(10, 40)) == first);
+	EXPECT_TRUE(drawnAt(BPoint(10.5f, 40)) == shifted);
+
+	const BRegion clip(BRect(14, 34, 30, 60));
+	std::vector<uint32> clipped = first;
+	for (int32 i = 0; i < 200 * 60; i++) {
+		if (!clip.Contains(i % 200, i / 200))
+			clipped[i] = 0xffffffff;
+	}
+	EXPECT_TRUE(drawnAt(BPoint(10, 40), &clip) == clipped);
+}
+
+
+TEST_F(CanvasTextTest, TextLeavesTheUnusedByteOfPixelsBesideItAlone)
+{
+	std::vector<uint32> pixels(61 * 20, 0x00ffffff);
+	BPrivate::PixelBuffer buffer{pixels.data(), 61, 20, 61 * 4, false};
+	auto canvas = BPrivate::Display::Get().MakeCanvas(buffer);
+	BPrivate::CanvasState state;
+	state.mode = B_OP_OVER;
+	canvas->SetState(state);
+	canvas->DrawString("Label", 5, BPoint(2, 15), nullptr);
+	int32 inked = 0;
+	for (uint32 pixel : pixels) {
+		if (pixel == 0x00ffffff)
+			continue;
+		EXPECT_EQ(pixel >> 24, 0xffu);
+		inked++;
+	}
+	EXPECT_GT(inked, 50);
 }
 
 
