@@ -177,6 +177,7 @@ TProject::NewForm()
 		form->SetPropertyValue("Name", name.String());
 		// Nothing that the user would miss.
 		form->TFormComponent::SetModified(false);
+		form->View()->SetModified(false);
 	}
 	Enter({form, BString(), BString()}, name.String());
 	MarkApp(true);
