@@ -5,7 +5,6 @@
 #include <cstdlib>
 #include <cstring>
 
-#include <Font.h>
 #include <Message.h>
 #include <Window.h>
 
@@ -20,19 +19,15 @@ ValueOf(TComponent* component, const char* name)
 }
 
 
-BFont
+const BFont*
 FontOf(TComponent* component)
 {
 	const char* name = ValueOf(component, "Font");
-	BFont font(be_plain_font);
 	if (name != nullptr && strcmp(name, "be_bold_font") == 0)
-		font = *be_bold_font;
-	else if (name != nullptr && strcmp(name, "be_fixed_font") == 0)
-		font = *be_fixed_font;
-	const char* size = ValueOf(component, "FontSize");
-	if (size != nullptr && atoi(size) > 0)
-		font.SetSize(atoi(size));
-	return font;
+		return be_bold_font;
+	if (name != nullptr && strcmp(name, "be_fixed_font") == 0)
+		return be_fixed_font;
+	return be_plain_font;
 }
 
 } // namespace
@@ -52,8 +47,19 @@ ShowLook(TComponent* component, BView* view)
 	present = view->LowColor();
 	if (color != nullptr)
 		view->SetLowColor(StrToRGBColor(color, &present));
-	const BFont font = FontOf(component);
-	view->SetFont(&font);
+	view->SetFont(FontOf(component));
+}
+
+
+BFont
+InDesignedSize(TComponent* component, const BFont* font)
+{
+	BFont sized(*font);
+	const bool isSystems = font == be_plain_font || font == be_bold_font || font == be_fixed_font;
+	const char* size = ValueOf(component, "FontSize");
+	if (isSystems && size != nullptr && atoi(size) > 0)
+		sized.SetSize(atoi(size));
+	return sized;
 }
 
 

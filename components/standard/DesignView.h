@@ -6,6 +6,7 @@
 #include <utility>
 
 #include <ComponentKit.h>
+#include <Font.h>
 #include <InterfaceDefs.h>
 #include <Message.h>
 #include <View.h>
@@ -14,6 +15,10 @@
 /// Gives \a view the colours and the font that \a component has as properties, and that the program
 /// will have: when it gets into a window, a view takes its parent's.
 void ShowLook(TComponent* component, BView* view);
+
+/// \a font, but one of the system's three in the size that \a component has as a property: the program
+/// sets the size after the font.
+BFont InDesignedSize(TComponent* component, const BFont* font);
 
 /// Takes \a view and what is in it out of the keyboard's reach.
 void TakeFromKeyboard(BView* view);
@@ -56,7 +61,8 @@ public:
 	void SetFont(const BFont* font, uint32 mask = B_FONT_ALL) override
 	{
 		Ormi::FrameKeeper keeper(this);
-		View::SetFont(font, mask);
+		const BFont sized = InDesignedSize(fComponent, font);
+		View::SetFont(&sized, mask);
 	}
 
 	void DrawAfterChildren(BRect updateRect) override

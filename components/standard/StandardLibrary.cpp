@@ -17,9 +17,11 @@
 #include "PictureViewComponent.h"
 #include "PlainViewComponent.h"
 #include "RadioButtonComponent.h"
+#include "ScrollViewComponent.h"
 #include "SliderComponent.h"
 #include "StatusBarComponent.h"
 #include "StringViewComponent.h"
+#include "TabViewComponent.h"
 #include "TextControlComponent.h"
 #include "TextViewComponent.h"
 
@@ -61,10 +63,12 @@ TStandardEntry<TStatusBarComponent> sStatusBar(13, "StatusBar", "TStatusBar");
 TStandardEntry<TColorControlComponent> sColorControl(14, "ColorControl", "TColorControl");
 TStandardEntry<TPictureViewComponent> sPictureView(15, "PictureView", "TPictureView");
 TStandardEntry<TPictureButtonComponent> sPictureButton(16, "PictureButton", "TPictureButton");
+TStandardEntry<TScrollViewComponent> sScrollView(17, "ScrollView", "TScrollView");
+TStandardEntry<TTabViewComponent> sTabView(18, "TabView", "TTabView");
 
 TPaletteEntry* const kEntries[] = {&sButton, &sCheckBox, &sTextControl, &sStringView, &sBox,
 	&sRadioButton, &sTextView, &sView, &sListView, &sOutlineListView, &sMenuField, &sMenuBar,
-	&sSlider, &sStatusBar, &sColorControl, &sPictureView, &sPictureButton};
+	&sSlider, &sStatusBar, &sColorControl, &sPictureView, &sPictureButton, &sScrollView, &sTabView};
 constexpr uint32 kEntryCount = sizeof(kEntries) / sizeof(kEntries[0]);
 
 } // namespace

@@ -3,6 +3,8 @@
 #include <Box.h>
 #include <Button.h>
 #include <CheckBox.h>
+#include <MenuBar.h>
+#include <RadioButton.h>
 #include <StringView.h>
 #include <TextControl.h>
 
@@ -85,7 +87,12 @@ TEST_F(StandardLibraryTest, EachClassHasItsNameHeaderAndOwnPropertiesAndEvents)
 			{"OnClick"}},
 		{"TPictureButton", "PictureButton", "PictureButton.h",
 			{"Label", "OffFile", "OnFile", "Behavior"}, {"OnClick"}},
+		{"TScrollView", "ScrollView", "ScrollView.h", {"Border", "ResizingMode"}, {}},
+		{"TTabView", "TabView", "TabView.h",
+			{"Tabs", "Selection", "TabWidth", "TabSide", "ResizingMode"}, {"OnChange"}},
 	};
+	EXPECT_EQ(PaletteCatalog().CountPalEntries(), static_cast<int32>(std::size(kCases)) + 2);
+	EXPECT_LE(std::size(kCases), 19u);
 	TDesignForm* form = NewForm();
 	for (const auto& row : kCases) {
 		TPaletteEntry* entry = PaletteCatalog().FindPalEntry(row.className);
@@ -211,6 +218,159 @@ TEST_F(StandardLibraryTest, ABoxShowsLabelAndBorderAndHoldsComponents)
 	TComponent* button = Place(form, "TButton", "Button1", BRect(10, 30, 80, 54), component);
 	EXPECT_EQ(button->DTView()->Parent(), box);
 	EXPECT_NE(dynamic_cast<TComponentOwner*>(component), nullptr);
+}
+
+
+TEST_F(StandardLibraryTest, EachContainerHoldsComponents)
+{
+	TDesignForm* form = NewForm();
+	for (const char* name : {"TBox", "TView", "TScrollView", "TTabView"}) {
+		TComponent* container = Place(form, name, name, BRect(10, 10, 200, 150));
+		ASSERT_NE(dynamic_cast<TComponentOwner*>(container), nullptr) << name;
+		TComponent* button = Place(form, "TButton", "Button1", BRect(10, 30, 80, 54), container);
+		EXPECT_EQ(button->DTView()->Parent(), container->DTView()) << name;
+		EXPECT_EQ(button->DTView()->Frame(), BRect(10, 30, 80, 54)) << name;
+	}
+}
+
+
+TEST_F(StandardLibraryTest, SavingAndLoadingKeepsEveryPropertyOfEachClass)
+{
+	TDesignForm* form = NewForm();
+	TComponent* tabs = nullptr;
+	for (int32 i = 0; i < PaletteCatalog().CountPalEntries(); i++) {
+		const char* className = PaletteCatalog().PalEntryAt(i)->ClassName();
+		TComponent* component = Place(form, className, className, BRect(15, 25, 140, 97));
+		if (component == nullptr)
+			continue;
+		if (strcmp(className, "TTabView") == 0)
+			tabs = component;
+		for (int32 k = 0; k < component->CountProperties(); k++) {
+			TProperty* property = component->PropertyAt(k);
+			TStringList list(20);
+			if (property->Editor() != nullptr)
+				property->Editor()->GetValuePickList(&list);
+			// The last choice, and an odd text or number elsewhere.
+			const char* value = list.CountItems() > 0 ? list.StringAt(list.CountItems() - 1)
+				: property->IsQuoted()                ? "A|>B|C"
+													  : "";
+			if (strcmp(property->Name(), "Name") != 0 && *value != '\0')
+				Set(component, property->Name(), value);
+		}
+	}
+	ASSERT_NE(tabs, nullptr);
+	TComponent* onPage = Place(form, "TButton", "OnPage", BRect(10, 30, 80, 54), tabs);
+	Set(onPage, "Page", "1");
+	const std::string path = fFolder / "all.frm";
+	Save(form, path);
+	ASSERT_TRUE(fResult);
+
+	TDesignForm* loaded = NewForm("Form2");
+	Load(loaded, path);
+	ASSERT_TRUE(fResult);
+	ASSERT_EQ(loaded->CountComponents(), form->CountComponents());
+	for (int32 i = 0; i < form->CountComponents(); i++) {
+		TComponent* before = form->ComponentAt(i);
+		TComponent* after = Find(loaded, before->ComponentName());
+		ASSERT_NE(after, nullptr) << before->ComponentName();
+		EXPECT_EQ(after->DTView()->Frame(), before->DTView()->Frame()) << before->ComponentName();
+		ASSERT_EQ(after->CountProperties(), before->CountProperties()) << before->ComponentName();
+		for (int32 k = 0; k < before->CountProperties(); k++) {
+			const TProperty* property = before->PropertyAt(k);
+			EXPECT_STREQ(after->FindProperty(property->Name())->Value(), property->Value())
+				<< before->ComponentName() << " " << property->Name();
+		}
+	}
+	EXPECT_TRUE(Find(loaded, "OnPage")->DTView()->IsHidden());
+}
+
+
+TEST_F(StandardLibraryTest, OfSeveralCheckedRadioButtonsTheLastOneIsShown)
+{
+	TDesignForm* form = NewForm();
+	TComponent* box = Place(form, "TBox", "Box1", BRect(10, 10, 200, 150));
+	TComponent* first = Place(form, "TRadioButton", "First");
+	TComponent* second = Place(form, "TRadioButton", "Second");
+	TComponent* inside = Place(form, "TRadioButton", "Inside", BRect(10, 30, 80, 54), box);
+	for (TComponent* component : {first, second, inside})
+		Set(component, "Checked", "true");
+	EXPECT_EQ(ViewOf<BRadioButton>(first)->Value(), B_CONTROL_OFF);
+	EXPECT_EQ(ViewOf<BRadioButton>(second)->Value(), B_CONTROL_ON);
+	EXPECT_EQ(ViewOf<BRadioButton>(inside)->Value(), B_CONTROL_ON);
+	EXPECT_STREQ(first->FindProperty("Checked")->Value(), "true");
+
+	Set(second, "Checked", "false");
+	EXPECT_EQ(ViewOf<BRadioButton>(first)->Value(), B_CONTROL_ON);
+	Set(second, "Checked", "true");
+	second->DTView()->RemoveSelf();
+	EXPECT_EQ(ViewOf<BRadioButton>(first)->Value(), B_CONTROL_ON);
+	form->View()->AddChild(second->DTView());
+}
+
+
+TEST_F(StandardLibraryTest, TheFirstListInAScrollViewFillsIt)
+{
+	TDesignForm* form = NewForm();
+	TComponent* scroll = Place(form, "TScrollView", "ScrollView1", BRect(10, 10, 110, 90));
+	TComponent* list = Place(form, "TListView", "ListView1", BRect(30, 30, 50, 50), scroll);
+	EXPECT_EQ(list->DTView()->Frame(), BRect(2, 2, 84, 64));
+	EXPECT_STREQ(list->FindProperty("Right")->Value(), "84");
+	Set(scroll, "Vertical", "false");
+	EXPECT_EQ(list->DTView()->Frame(), BRect(2, 2, 98, 64));
+	Set(scroll, "Border", "B_NO_BORDER");
+	EXPECT_EQ(list->DTView()->Frame(), BRect(0, 0, 100, 65));
+	Set(scroll, "Right", "150");
+	EXPECT_STREQ(list->FindProperty("Right")->Value(), "140");
+	EXPECT_EQ(Params(scroll), "true,false,B_NO_BORDER");
+	EXPECT_FALSE(scroll->FindProperty("Horizontal")->IsGenerated());
+
+	TComponent* other = Place(form, "TListView", "ListView2", BRect(30, 30, 50, 50), scroll);
+	EXPECT_EQ(other->DTView()->Frame(), BRect(30, 30, 50, 50));
+}
+
+
+TEST_F(StandardLibraryTest, ATabViewShowsTheComponentsOfItsPage)
+{
+	TDesignForm* form = NewForm();
+	TComponent* tabs = Place(form, "TTabView", "TabView1", BRect(10, 10, 200, 150));
+	TComponent* first = Place(form, "TButton", "First", BRect(10, 40, 80, 64), tabs);
+	EXPECT_STREQ(first->FindProperty("Page")->Value(), "0");
+	Set(tabs, "Selection", "1");
+	EXPECT_TRUE(first->DTView()->IsHidden(first->DTView()));
+	TComponent* second = Place(form, "TButton", "Second", BRect(10, 40, 80, 64), tabs);
+	EXPECT_STREQ(second->FindProperty("Page")->Value(), "1");
+	EXPECT_FALSE(second->DTView()->IsHidden(second->DTView()));
+
+	BString text;
+	EXPECT_TRUE(tabs->OnGenInitForm(text));
+	EXPECT_STREQ(text.String(), "$COMPONENT->SetPage(Second,1);");
+	EXPECT_FALSE(first->FindProperty("Page")->IsGenerated());
+
+	// Through the editor, as the property window does it.
+	CapturedOutput output;
+	second->FindProperty("Page")->Editor()->SetValue("0", true);
+	first->FindProperty("Page")->Editor()->SetValue("7", true);
+	EXPECT_TRUE(second->DTView()->IsHidden(second->DTView()));
+	EXPECT_FALSE(first->DTView()->IsHidden(first->DTView()));
+	// Who leaves is seen again.
+	dynamic_cast<TComponentOwner*>(tabs)->RemoveComponent(second);
+	EXPECT_FALSE(second->DTView()->IsHidden(second->DTView()));
+}
+
+
+TEST_F(StandardLibraryTest, AMenuBarIsNotTheMenuBarOfTheFormsWindow)
+{
+	TDesignForm* form = NewForm();
+	BMenuBar* windowBar = form->KeyMenuBar();
+	TComponent* component = Place(form, "TMenuBar", "MenuBar1", BRect(0, 0, 300, 30));
+	EXPECT_EQ(form->KeyMenuBar(), windowBar);
+	EXPECT_EQ(component->DTView()->Frame(), BRect(0, 0, 300, 30));
+	Set(component, "Items", "File|>Open|>-|>Quit|Edit");
+	BMenuBar* bar = ViewOf<BMenuBar>(component);
+	ASSERT_EQ(bar->CountItems(), 2);
+	EXPECT_EQ(bar->SubmenuAt(0)->CountItems(), 3);
+	Set(component, "Items", "");
+	EXPECT_EQ(bar->CountItems(), 0);
 }
 
 

@@ -30,6 +30,29 @@ ScrolledFrame(BRect frame, bool horizontal, bool vertical, border_style border)
 }
 
 
+/// Lets \a bar, which may be null, scroll what is \a used of a page through what is \a seen of it: the
+/// page's last pixel and the view's, along the bar.
+inline void
+FitScrollBar(BScrollBar* bar, float used, float seen)
+{
+	const float kStep = 10;
+	if (bar == nullptr)
+		return;
+	bar->SetRange(0, std::max(0.0f, used - seen));
+	bar->SetProportion(used > seen ? (seen + 1) / (used + 1) : 1);
+	bar->SetSteps(kStep, std::max(kStep, seen - kStep));
+}
+
+
+/// Whether a scroll view lets \a view scroll itself.
+inline bool
+IsScrollable(const BView* view)
+{
+	return dynamic_cast<const BListView*>(view) != nullptr
+		|| dynamic_cast<const BTextView*>(view) != nullptr;
+}
+
+
 /// A scroll view that other views are added to.
 ///
 /// A list or a text that is added first fills it and is scrolled. Everything else lies on a page that is
@@ -53,9 +76,7 @@ public:
 	/// Hides the base's: see above for where \a child goes.
 	void AddChild(BView* child, BView* before = nullptr)
 	{
-		const bool scrolls = dynamic_cast<BListView*>(child) != nullptr
-			|| dynamic_cast<BTextView*>(child) != nullptr;
-		if (scrolls && Target() == fPage && fPage->CountChildren() == 0) {
+		if (IsScrollable(child) && Target() == fPage && fPage->CountChildren() == 0) {
 			const BRect frame = fPage->Frame();
 			SetTarget(child);
 			Place(child, frame);
@@ -78,8 +99,8 @@ public:
 		BRect used(0, 0, -1, -1);
 		for (BView* child = fPage->ChildAt(0); child != nullptr; child = child->NextSibling())
 			used = used | child->Frame();
-		FitBar(ScrollBar(B_HORIZONTAL), used.right, fPage->Bounds().Width());
-		FitBar(ScrollBar(B_VERTICAL), used.bottom, fPage->Bounds().Height());
+		FitScrollBar(ScrollBar(B_HORIZONTAL), used.right, fPage->Bounds().Width());
+		FitScrollBar(ScrollBar(B_VERTICAL), used.bottom, fPage->Bounds().Height());
 	}
 
 	using BScrollView::SetViewColor;
@@ -110,8 +131,6 @@ public:
 	}
 
 private:
-	static constexpr float kStep = 10;
-
 	ScrollPane(
 		BRect, const char* name, BView* page, bool horizontal, bool vertical, border_style border)
 		: BScrollView(
@@ -132,15 +151,6 @@ private:
 	{
 		view->MoveTo(frame.LeftTop());
 		view->ResizeTo(frame.Width(), frame.Height());
-	}
-
-	static void FitBar(BScrollBar* bar, float used, float seen)
-	{
-		if (bar == nullptr)
-			return;
-		bar->SetRange(0, std::max(0.0f, used - seen));
-		bar->SetProportion(used > seen ? (seen + 1) / (used + 1) : 1);
-		bar->SetSteps(kStep, std::max(kStep, seen - kStep));
 	}
 
 	/// A target may follow no side of its own accord.
