@@ -77,10 +77,13 @@ class Program:
 
     def __init__(self, screen, path, count):
         self.screen = screen
-        started = time.monotonic_ns()
+        started, served = time.monotonic_ns(), used(screen.server.pid)
         self.process = subprocess.Popen([str(path), str(count)], env=screen.environment, stdin=subprocess.PIPE,
                                         stdout=subprocess.PIPE)
-        self.start = (screen.wait_for(SMALL_MARK, RED) - started) / 1e6
+        wall = screen.wait_for(SMALL_MARK, RED) - started
+        settle(self.process.pid)
+        # As do() has it.
+        self.start = [spent / 1e6 for spent in (wall, used(self.process.pid), used(screen.server.pid) - served)]
 
     def do(self, order, color):
         """Milliseconds on the clock, and of processor time of the program and of the server."""
@@ -201,7 +204,7 @@ def joined(rounds):
     def times(values):
         return min(values), statistics.median(values)
 
-    result = {"start": times([start for each in rounds for start in each["start"]]),
+    result = {"start": [times(column) for column in zip(*(start for each in rounds for start in each["start"]))],
               "idle": min(each["idle"] for each in rounds)}
     result["open"] = [times(column) for column in zip(*(each["open"] for each in rounds))]
     result["repaint"] = [times(column) for column in zip(*(row for each in rounds for row in each.get("repaint", [])))]
@@ -212,7 +215,7 @@ def joined(rounds):
 
 def print_times(results):
     print(f"\nwindows, milliseconds, best / median; {COUNT} buttons; \"cpu\" is the program's and the server's\n")
-    print(f"{'':>13} {'start':>15} {'open':>15} {'its cpu':>13} {'repaint':>15} {'its cpu':>13} {'idle, ms/s':>11}")
+    print(f"{'':>13} {'start':>15} {'its cpu':>13} {'open':>15} {'its cpu':>13} {'repaint':>15} {'its cpu':>13} {'idle, ms/s':>11}")
 
     def pair(values, width):
         return f"{values[0]:.1f} / {values[1]:.1f}".rjust(width)
@@ -222,13 +225,14 @@ def print_times(results):
 
     for name, result in results.items():
         repaint = result["repaint"]
-        print(f"{name:>13} {pair(result['start'], 15)} {pair(result['open'][0], 15)} {both(result['open']):>13}"
+        print(f"{name:>13} {pair(result['start'][0], 15)} {both(result['start']):>13}"
+              f" {pair(result['open'][0], 15)} {both(result['open']):>13}"
               f" {pair(repaint[0], 15) if repaint else '':>15} {both(repaint) if repaint else '':>13}"
               f" {result['idle']:>11.2f}")
     if "FLTK" in results and "kits" in results:
         own, other = results["kits"], results["FLTK"]
         print("\nkits to FLTK, medians: start %.2f, open %.2f, repaint %.2f" % (
-            own["start"][1] / other["start"][1], own["open"][0][1] / other["open"][0][1],
+            own["start"][0][1] / other["start"][0][1], own["open"][0][1] / other["open"][0][1],
             own["repaint"][0][1] / other["repaint"][0][1]))
 
 

@@ -50,7 +50,8 @@ StopModule()
 Display*
 StartModule()
 {
-	void* module = dlopen(ModulePath().c_str(), RTLD_NOW | RTLD_LOCAL);
+	// Most functions of Qt that it refers to are never called: they are not looked up before they are.
+	void* module = dlopen(ModulePath().c_str(), RTLD_LAZY | RTLD_LOCAL);
 	if (module == nullptr) {
 		fprintf(stderr, "libbe: no display: %s; nothing will be shown\n", dlerror());
 		return nullptr;

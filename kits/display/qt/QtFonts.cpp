@@ -132,6 +132,7 @@ Last(QtFonts& fonts, const FontKey& key)
 
 QtFonts::QtFonts()
 	: fHasFamilies(false),
+	  fHasStandard(),
 	  fStandardFamilies(),
 	  fStandardStyles()
 {
@@ -149,29 +150,30 @@ QtFonts::ReadFamilies()
 		if (utf8.size() <= B_FONT_FAMILY_LENGTH && !QFontDatabase::isPrivateFamily(name))
 			fFamilies.push_back({utf8, false, {}});
 	}
-	FindStandardFonts();
 }
 
 
 void
-QtFonts::FindStandardFonts()
+QtFonts::FindStandardFont(standard_font which)
 {
-	for (standard_font which : {kPlainFont, kBoldFont, kFixedFont}) {
-		std::string name = StandardFamily(which).toStdString();
-		auto found = std::find_if(fFamilies.begin(), fFamilies.end(),
-			[&](const Family& family) { return family.name == name; });
-		if (found == fFamilies.end())
-			continue;
+	if (fHasStandard[which])
+		return;
+	fHasStandard[which] = true;
+	ReadFamilies();
+	std::string name = StandardFamily(which).toStdString();
+	auto found = std::find_if(fFamilies.begin(), fFamilies.end(),
+		[&](const Family& family) { return family.name == name; });
+	if (found == fFamilies.end())
+		return;
 
-		int32 index = static_cast<int32>(found - fFamilies.begin());
-		fStandardFamilies[which] = static_cast<uint16>(index);
-		uint16 wanted = which == kBoldFont ? B_BOLD_FACE : B_REGULAR_FACE;
-		Family* family = FamilyAt(index);
-		for (size_t i = 0; i < family->styles.size(); i++) {
-			if (family->styles[i].face == wanted) {
-				fStandardStyles[which] = static_cast<uint16>(i);
-				break;
-			}
+	int32 index = static_cast<int32>(found - fFamilies.begin());
+	fStandardFamilies[which] = static_cast<uint16>(index);
+	uint16 wanted = which == kBoldFont ? B_BOLD_FACE : B_REGULAR_FACE;
+	Family* family = FamilyAt(index);
+	for (size_t i = 0; i < family->styles.size(); i++) {
+		if (family->styles[i].face == wanted) {
+			fStandardStyles[which] = static_cast<uint16>(i);
+			break;
 		}
 	}
 }
@@ -253,7 +255,7 @@ void
 QtFonts::GetStandardFont(standard_font which, uint16* family, uint16* style, float* size)
 {
 	std::lock_guard<std::mutex> lock(fMutex);
-	ReadFamilies();
+	FindStandardFont(which);
 	*family = fStandardFamilies[which];
 	*style = fStandardStyles[which];
 	*size = 12;
@@ -283,8 +285,10 @@ QtFonts::MakeFont(const FontKey& key, float scale)
 	{
 		std::lock_guard<std::mutex> lock(fMutex);
 		const Family* family = FamilyAt(key.family);
-		if (family == nullptr)
+		if (family == nullptr) {
+			FindStandardFont(kPlainFont);
 			family = FamilyAt(fStandardFamilies[kPlainFont]);
+		}
 		if (family != nullptr) {
 			font.setFamily(QString::fromStdString(family->name));
 			if (key.style < family->styles.size()) {

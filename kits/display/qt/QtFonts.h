@@ -62,13 +62,14 @@ private:
 	QFont MakeFont(const FontKey& font, float scale);
 	Family* FamilyAt(int32 index);
 	void ReadFamilies();
-	void FindStandardFonts();
+	void FindStandardFont(standard_font which);
 
 	// The lists are read when they are first asked for: the host may have a great many fonts.
 	TextRuns fRuns;
 	std::mutex fMutex;
 	bool fHasFamilies;
 	std::vector<Family> fFamilies;
+	bool fHasStandard[3];
 	uint16 fStandardFamilies[3];
 	uint16 fStandardStyles[3];
 };

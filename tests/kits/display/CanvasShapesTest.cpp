@@ -201,7 +201,8 @@ TEST_F(CanvasShapesTest, ARoundRectIsTheSameOfOneColourAsOfAPatternOfIt)
 					pixels[pattern == B_SOLID_HIGH ? 0 : 1] = canvas->ReadPicture().pixels;
 				}
 				EXPECT_TRUE(pixels[0] == pixels[1])
-					<< testing::PrintToString(rect) << " with a radius of " << radius << (stroked ? ", stroked" : "");
+					<< testing::PrintToString(rect) << " with a radius of " << radius
+					<< (stroked ? ", stroked" : "");
 			}
 		}
 	}
