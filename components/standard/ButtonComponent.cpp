@@ -5,46 +5,23 @@
 #include <Button.h>
 
 #include "DesignView.h"
-#include "SourceText.h"
+
+namespace {
+
+// The mark of a default button lies around its frame.
+constexpr property_row kProperties[] = {
+	{"Default", "false", PropertyKind::kBool, "$COMPONENT->MakeDefault($VALUE);", {}, nullptr},
+};
+
+constexpr event_row kEvents[] = {{"OnClick", nullptr}};
+constexpr const char* kParameters[] = {"Label"};
+constexpr component_description kDescription = {
+	"Button", "TButton", "Button.h", kProperties, kEvents, kParameters};
+
+} // namespace
 
 TButtonComponent::TButtonComponent(TFormDesigner* designer, BRect frame)
-	: TControlComponent(nullptr, designer)
+	: TStandardComponent(designer, kDescription)
 {
-	SetComponentName("Button");
-	SetClassName("TButton");
-	InitPropertyList();
-	InitEventList();
-	SetDTView(new DesignView<BButton>(this, frame, "TButton", "", nullptr));
-}
-
-
-void
-TButtonComponent::InitPropertyList()
-{
-	TControlComponent::InitPropertyList();
-	TProperty* isDefault = new TProperty(this, "Default", "false", nullptr, true);
-	AddPropAndEditor(isDefault, new TBoolProperty(this, isDefault),
-		"$COMPONENT->MakeDefault($VALUE);", nullptr, false);
-}
-
-
-void
-TButtonComponent::InitEventList()
-{
-	TControlComponent::InitEventList();
-	AddEvent(new TEvent("OnClick", nullptr, nullptr, false));
-}
-
-
-const char*
-TButtonComponent::HeaderFile()
-{
-	return "Button.h";
-}
-
-
-void
-TButtonComponent::OnSetConstructorParams(BString& text)
-{
-	AppendLiteral(text, FindProperty("Label")->Value());
+	SetDesignView(new DesignView<BButton>(this, frame, "TButton", "", nullptr));
 }

@@ -3,17 +3,12 @@
 
 #pragma once
 
-#include <ComponentKit.h>
+#include "StandardComponent.h"
 
 /// A BButton. Properties beside those of every control: "Default" (bool). Events: "OnClick".
 ///
 /// A default button's mark lies around its frame and shows when the program runs, not at design time.
-class TButtonComponent : public TControlComponent {
+class TButtonComponent : public TStandardComponent<TControlComponent> {
 public:
 	TButtonComponent(TFormDesigner* designer, BRect frame);
-
-	void InitPropertyList() override;
-	void InitEventList() override;
-	const char* HeaderFile() override;
-	void OnSetConstructorParams(BString& text) override;
 };

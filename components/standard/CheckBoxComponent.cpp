@@ -2,65 +2,33 @@
 
 #include "CheckBoxComponent.h"
 
-#include <cstring>
-
 #include <CheckBox.h>
 
 #include "DesignView.h"
-#include "SourceText.h"
+
+namespace {
+
+void
+ShowTick(BView* view, const char* value, const property_row&)
+{
+	static_cast<BCheckBox*>(view)->SetValue(
+		strcmp(value, "true") == 0 ? B_CONTROL_ON : B_CONTROL_OFF);
+}
+
+
+constexpr property_row kProperties[] = {
+	{"Checked", "false", PropertyKind::kBool, "$COMPONENT->SetValue($VALUE);", {}, ShowTick},
+};
+
+constexpr event_row kEvents[] = {{"OnChange", nullptr}};
+constexpr const char* kParameters[] = {"Label"};
+constexpr component_description kDescription = {
+	"CheckBox", "TCheckBox", "CheckBox.h", kProperties, kEvents, kParameters};
+
+} // namespace
 
 TCheckBoxComponent::TCheckBoxComponent(TFormDesigner* designer, BRect frame)
-	: TControlComponent(nullptr, designer)
+	: TStandardComponent(designer, kDescription)
 {
-	SetComponentName("CheckBox");
-	SetClassName("TCheckBox");
-	InitPropertyList();
-	InitEventList();
-	SetDTView(new DesignView<BCheckBox>(this, frame, "TCheckBox", "", nullptr));
-}
-
-
-void
-TCheckBoxComponent::InitPropertyList()
-{
-	TControlComponent::InitPropertyList();
-	TProperty* checked = new TProperty(this, "Checked", "false", nullptr, true);
-	AddPropAndEditor(
-		checked, new TBoolProperty(this, checked), "$COMPONENT->SetValue($VALUE);", nullptr, false);
-}
-
-
-void
-TCheckBoxComponent::InitEventList()
-{
-	TControlComponent::InitEventList();
-	AddEvent(new TEvent("OnChange", nullptr, nullptr, false));
-}
-
-
-void
-TCheckBoxComponent::SetPropertyValue(const char* name, const char* value)
-{
-	TControlComponent::SetPropertyValue(name, value);
-	if (name == nullptr || value == nullptr || strcmp(name, "Checked") != 0)
-		return;
-	if (DTView()->LockLooper()) {
-		static_cast<BCheckBox*>(DTView())->SetValue(
-			strcmp(value, "true") == 0 ? B_CONTROL_ON : B_CONTROL_OFF);
-		DTView()->UnlockLooper();
-	}
-}
-
-
-const char*
-TCheckBoxComponent::HeaderFile()
-{
-	return "CheckBox.h";
-}
-
-
-void
-TCheckBoxComponent::OnSetConstructorParams(BString& text)
-{
-	AppendLiteral(text, FindProperty("Label")->Value());
+	SetDesignView(new DesignView<BCheckBox>(this, frame, "TCheckBox", "", nullptr));
 }

@@ -4,12 +4,10 @@
 
 #include <ormi/views/MenuItems.h>
 
+#include "Choices.h"
 #include "DesignView.h"
 
 namespace {
-
-constexpr choice kAlignments[] = {{"B_ALIGN_LEFT", B_ALIGN_LEFT}, {"B_ALIGN_RIGHT", B_ALIGN_RIGHT},
-	{"B_ALIGN_CENTER", B_ALIGN_CENTER}};
 
 constexpr property_row kProperties[] = {
 	ShownBy<&BMenuField::SetEnabled>("Enabled", "true"),

@@ -6,12 +6,10 @@
 
 #include <ormi/views/Containers.h>
 
+#include "Choices.h"
 #include "DesignView.h"
 
 namespace {
-
-constexpr choice kBorders[] = {{"B_FANCY_BORDER", B_FANCY_BORDER},
-	{"B_PLAIN_BORDER", B_PLAIN_BORDER}, {"B_NO_BORDER", B_NO_BORDER}};
 
 /// A scroll view is made with its bars, so this one makes another inside when they change.
 class DesignScrollView : public DesignView<BView> {

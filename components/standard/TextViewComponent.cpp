@@ -4,12 +4,10 @@
 
 #include <ormi/views/TextPane.h>
 
+#include "Choices.h"
 #include "DesignView.h"
 
 namespace {
-
-constexpr choice kAlignments[] = {{"B_ALIGN_LEFT", B_ALIGN_LEFT}, {"B_ALIGN_RIGHT", B_ALIGN_RIGHT},
-	{"B_ALIGN_CENTER", B_ALIGN_CENTER}};
 
 void
 ShowText(BView* view, const char* text, const property_row&)
