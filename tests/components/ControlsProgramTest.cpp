@@ -12,6 +12,7 @@
 
 #include <Application.h>
 #include <Bitmap.h>
+#include <TabView.h>
 #include <TranslationUtils.h>
 #include <View.h>
 
@@ -356,4 +357,26 @@ TEST_F(ControlsProgramTest, ASelectedComponentShowsItsHandleOverWhatIsInIt)
 		const rgb_color kSelection = {0, 200, 200, 255};
 		EXPECT_EQ(fRobot.Picture().Count(handle, kSelection), 36) << place.name;
 	}
+}
+
+
+TEST_F(ControlsProgramTest, ADoubleClickOnATabShowsItsPage)
+{
+	BPoint beta;
+	Locked([&] {
+		const BTabView* tabs = dynamic_cast<const BTabView*>(fComponents["Pages"]->DTView());
+		const BRect tab = tabs->TabFrame(1);
+		beta = BPoint((tab.left + tab.right) / 2, (tab.top + tab.bottom) / 2);
+	});
+	fRobot.Click(FrameInWindow("Pages").LeftTop() + beta, 2);
+	fRobot.Settle();
+	Locked([&] {
+		EXPECT_STREQ(fComponents["Pages"]->FindProperty("Selection")->Value(), "1");
+		EXPECT_TRUE(fComponents["OnAlpha"]->DTView()->IsHidden());
+		EXPECT_FALSE(fComponents["OnBeta"]->DTView()->IsHidden());
+	});
+	// A single click on the other one only selects the component.
+	fRobot.Click(FrameInWindow("Pages").LeftTop() + BPoint(20, 10));
+	fRobot.Settle();
+	EXPECT_STREQ(fComponents["Pages"]->FindProperty("Selection")->Value(), "1");
 }
