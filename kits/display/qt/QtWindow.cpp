@@ -261,7 +261,10 @@ QtWindow::ShowAgain()
 	// Minimized along with its parent it would come back so, and take the parent with it again.
 	if ((windowStates() & Qt::WindowMinimized) != 0)
 		setWindowStates(windowStates() & ~Qt::WindowMinimized);
+	// A window manager gives the focus to what appears, but it is the window that the user went to that has it.
+	setProperty("_q_showWithoutActivating", true);
 	setVisible(true);
+	setProperty("_q_showWithoutActivating", QVariant());
 }
 
 
