@@ -1,0 +1,65 @@
+// SPDX-License-Identifier: MIT
+// The design surface on displays of any scale: components are where the pointer put them, and are drawn there.
+
+#include "designer/SurfaceTest.h"
+
+#include <cmath>
+
+#include "support/Printers.h"
+
+class DesignScaleTest : public SurfaceTest {
+protected:
+	/// Whether a selection's colour is in the middle of a pixel of the API.
+	static bool IsMarked(const WindowPicture& picture, float x, float y)
+	{
+		const float scale = picture.width / 301.0f;
+		const rgb_color color = picture.At(static_cast<int32>(std::floor((x + 0.5f) * scale)),
+			static_cast<int32>(std::floor((y + 0.5f) * scale)));
+		return color.red == 0 && color.green == 200 && color.blue == 200;
+	}
+
+	void CheckSelected(TComponent* component, BRect frame)
+	{
+		EXPECT_EQ(FrameOnForm(component), frame);
+		EXPECT_EQ(ToldFrame(component), Frame(component));
+		const WindowPicture picture = fRobot.Picture();
+		for (float x = frame.left; x <= frame.right; x++) {
+			EXPECT_TRUE(IsMarked(picture, x, frame.top)) << x;
+			EXPECT_TRUE(IsMarked(picture, x, frame.bottom)) << x;
+			EXPECT_FALSE(IsMarked(picture, x, frame.top - 1)) << x;
+			EXPECT_FALSE(IsMarked(picture, x, frame.bottom + 1)) << x;
+		}
+		for (float y = frame.top; y <= frame.bottom; y++) {
+			EXPECT_TRUE(IsMarked(picture, frame.left, y)) << y;
+			EXPECT_TRUE(IsMarked(picture, frame.right, y)) << y;
+			EXPECT_FALSE(IsMarked(picture, frame.left - 1, y)) << y;
+			EXPECT_FALSE(IsMarked(picture, frame.right + 1, y)) << y;
+		}
+		for (float x = frame.left + 1; x < frame.right; x++) {
+			for (float y = frame.top + 1; y < frame.bottom; y++) {
+				const bool isHandle = x >= frame.right - 5 && y >= frame.bottom - 5;
+				EXPECT_EQ(IsMarked(picture, x, y), isHandle) << x << ", " << y;
+			}
+		}
+	}
+};
+
+
+TEST_F(DesignScaleTest, ComponentsAreDrawnWhereTheyWerePut)
+{
+	TComponent* button = Draw("TButton", BRect(21, 33, 121, 63));
+	ASSERT_NE(button, nullptr);
+	CheckSelected(button, BRect(21, 33, 121, 63));
+	fRobot.Drag(BPoint(40, 40), BPoint(77, 155));
+	CheckSelected(button, BRect(58, 148, 158, 178));
+	fRobot.Drag(BPoint(155, 175), BPoint(203, 211));
+	CheckSelected(button, BRect(58, 148, 203, 211));
+
+	// Within a box
+	Draw("TBox", BRect(5, 5, 295, 140));
+	TComponent* inside = Draw("TTextControl", BRect(31, 27, 150, 51));
+	CheckSelected(inside, BRect(31, 27, 150, 51));
+	EXPECT_EQ(Frame(inside), BRect(26, 22, 145, 46));
+	fRobot.Drag(BPoint(147, 49), BPoint(160, 60));
+	CheckSelected(inside, BRect(31, 27, 160, 60));
+}
