@@ -312,25 +312,37 @@ QtCanvas::PaintRounded(
 		return false;
 
 	const int corner = shape.Corner();
+	const int firstRight = whole.right() - corner + 1;
 	ForEachSpan(whole, [&](int y, int left, int right) {
-		const uint8* coverage = shape.Row(y - whole.top(), whole.height());
-		auto cover = [&](int from, int to, const uint8* covered) {
-			from = std::max(from, left);
-			to = std::min(to, right);
-			if (from <= to)
-				CoverPixels(Row(y) + from, covered + from, to - from + 1, pixel, fBuffer.hasAlpha);
-		};
-		const int lastCorner = whole.right() - corner + 1;
-		cover(whole.left(), whole.left() + corner - 1, coverage - whole.left());
-		cover(lastCorner, whole.right(), coverage + corner + 1 - lastCorner);
-		const int from = std::max(whole.left() + corner, left);
-		const int to = std::min(lastCorner - 1, right);
-		const uint8 middle = coverage[corner];
 		uint32* row = Row(y);
-		if (middle == 255 && from <= to)
-			std::fill(row + from, row + to + 1, pixel);
-		for (int x = from; middle != 0 && middle != 255 && x <= to; x++)
-			CoverPixels(row + x, &middle, 1, pixel, fBuffer.hasAlpha);
+		const int line = y - whole.top();
+		const bool isBetweenCorners = line >= corner && line < whole.height() - corner;
+		if (isBetweenCorners && !stroked) {
+			std::fill(row + left, row + right + 1, pixel);
+			return;
+		}
+		if (isBetweenCorners) {
+			for (int x : {whole.left(), whole.right()}) {
+				if (x >= left && x <= right)
+					row[x] = pixel;
+			}
+			return;
+		}
+
+		const uint8* coverage = shape.Row(line, whole.height());
+		auto cover = [&](int first, const uint8* covered) {
+			const int from = std::max(first, left);
+			const int to = std::min(first + corner - 1, right);
+			if (from <= to)
+				CoverPixels(
+					row + from, covered + from - first, to - from + 1, pixel, fBuffer.hasAlpha);
+		};
+		cover(whole.left(), coverage);
+		cover(firstRight, coverage + corner + 1);
+		const uint8 middle = coverage[corner];
+		const int to = std::min(firstRight - 1, right);
+		for (int x = std::max(whole.left() + corner, left); middle != 0 && x <= to; x++)
+			row[x] = MixPixels(row[x], pixel, middle) | (fBuffer.hasAlpha ? 0 : pixel & 0xff000000);
 	});
 	return true;
 }
