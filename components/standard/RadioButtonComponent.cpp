@@ -22,32 +22,34 @@ public:
 	void AttachedToWindow() override
 	{
 		DesignView::AttachedToWindow();
-		ShowGroup(Parent(), nullptr);
+		if (fIsChecked)
+			ShowGroup(Parent(), nullptr);
 	}
 
 	void DetachedFromWindow() override
 	{
 		DesignView::DetachedFromWindow();
-		ShowGroup(Parent(), this);
+		if (fIsChecked)
+			ShowGroup(Parent(), this);
 	}
 
 private:
 	/// Without \a leaving, which may be null.
 	void ShowGroup(BView* parent, const DesignRadioButton* leaving)
 	{
-		if (parent == nullptr) {
-			BControl::SetValue(fIsChecked ? B_CONTROL_ON : B_CONTROL_OFF);
-			return;
-		}
-		bool isFound = false;
-		for (int32 i = parent->CountChildren() - 1; i >= 0; i--) {
-			DesignRadioButton* button = dynamic_cast<DesignRadioButton*>(parent->ChildAt(i));
+		BView* first = parent != nullptr ? parent->ChildAt(0) : this;
+		DesignRadioButton* last = nullptr;
+		for (BView* child = first; child != nullptr; child = child->NextSibling()) {
+			DesignRadioButton* button = dynamic_cast<DesignRadioButton*>(child);
 			if (button == nullptr || button == leaving)
 				continue;
-			const bool isOn = button->fIsChecked && !isFound;
-			isFound = isFound || isOn;
-			button->BControl::SetValue(isOn ? B_CONTROL_ON : B_CONTROL_OFF);
+			button->SetValue(B_CONTROL_OFF);
+			if (button->fIsChecked)
+				last = button;
 		}
+		// Turns those beside it off.
+		if (last != nullptr)
+			last->SetValue(B_CONTROL_ON);
 	}
 
 	bool fIsChecked = false;

@@ -14,11 +14,18 @@ namespace {
 /// A scroll view is made with its bars, so this one makes another inside when they change.
 class DesignScrollView : public DesignView<BView> {
 public:
-	DesignScrollView(TComponent* component, BRect frame)
-		: DesignView(component, frame, "TScrollView", B_FOLLOW_NONE, B_WILL_DRAW),
+	DesignScrollView(TScrollViewComponent* component, BRect frame)
+		: DesignView(component, frame, "TScrollView", B_FOLLOW_NONE, B_WILL_DRAW | B_FRAME_EVENTS),
+		  fComponent(component),
 		  fGlass(new DesignGlass(component, this))
 	{
 		Rebuild();
+	}
+
+	void FrameResized(float newWidth, float newHeight) override
+	{
+		DesignView::FrameResized(newWidth, newHeight);
+		fComponent->Fit();
 	}
 
 	using BView::SetViewColor;
@@ -67,6 +74,7 @@ private:
 		TakeFromKeyboard(fPane);
 	}
 
+	TScrollViewComponent* fComponent;
 	BView* fGlass;
 	Ormi::ScrollPane* fPane = nullptr;
 	bool fHorizontal = true;
@@ -139,22 +147,35 @@ TScrollViewComponent::AddComponent(TComponent* component)
 bool
 TScrollViewComponent::RemoveComponent(TComponent* component)
 {
-	const bool isRemoved = TComponentOwner::RemoveComponent(component);
-	Fit();
-	return isRemoved;
+	ReleaseBars();
+	return TComponentOwner::RemoveComponent(component);
 }
 
 
 TComponent*
 TScrollViewComponent::RemoveComponent(int32 index)
 {
-	TComponent* component = TComponentOwner::RemoveComponent(index);
-	Fit();
-	return component;
+	ReleaseBars();
+	return TComponentOwner::RemoveComponent(index);
 }
 
 
-/// Fits the component that fills the view into it, or the bars to those that lie in it.
+/// The bars let go of what they scroll. What is left keeps its frame for now: the view may be about to
+/// lose all of it.
+void
+TScrollViewComponent::ReleaseBars()
+{
+	DesignScrollView* view = static_cast<DesignScrollView*>(DTView());
+	if (view == nullptr || !view->LockLooper())
+		return;
+	for (orientation direction : {B_HORIZONTAL, B_VERTICAL}) {
+		if (view->Bar(direction) != nullptr)
+			view->Bar(direction)->SetTarget(static_cast<BView*>(nullptr));
+	}
+	view->UnlockLooper();
+}
+
+
 void
 TScrollViewComponent::Fit()
 {

@@ -21,8 +21,12 @@ public:
 	bool RemoveComponent(TComponent* component) override;
 	TComponent* RemoveComponent(int32 index) override;
 
-private:
+	/// Fits the component that fills the view into it, or the bars to those that lie in it. Locks the
+	/// view's window.
 	void Fit();
+
+private:
+	void ReleaseBars();
 	TComponent* Filler() const;
 	void FitFiller(TComponent* filler, BRect frame);
 };

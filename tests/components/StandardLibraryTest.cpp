@@ -326,6 +326,12 @@ TEST_F(StandardLibraryTest, TheFirstListInAScrollViewFillsIt)
 
 	TComponent* other = Place(form, "TListView", "ListView2", BRect(30, 30, 50, 50), scroll);
 	EXPECT_EQ(other->DTView()->Frame(), BRect(30, 30, 50, 50));
+
+	// Taking the first one out, as for deleting them all, leaves the other one's frame to the user.
+	dynamic_cast<TComponentOwner*>(scroll)->RemoveComponent(list);
+	EXPECT_EQ(list->DTView()->ScrollBar(B_HORIZONTAL), nullptr);
+	EXPECT_EQ(other->DTView()->Frame(), BRect(30, 30, 50, 50));
+	EXPECT_STREQ(other->FindProperty("Right")->Value(), "50");
 }
 
 
