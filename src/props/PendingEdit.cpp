@@ -35,6 +35,9 @@ TPendingEdit::TPendingEdit(const TPendingEdit& other)
 bool
 TPendingEdit::Read(BString* text) const
 {
+	// Without the property the form may be gone, too.
+	if (fProperty.Property() == nullptr)
+		return false;
 	WindowGuard guard(fFormWindow);
 	const TProperty* property = fProperty.Property();
 	if (property == nullptr)
@@ -47,6 +50,8 @@ TPendingEdit::Read(BString* text) const
 void
 TPendingEdit::Confirm(const BString& text)
 {
+	if (fProperty.Property() == nullptr)
+		return;
 	{
 		WindowGuard guard(fFormWindow);
 		if (fProperty.Property() == nullptr)

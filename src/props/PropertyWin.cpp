@@ -340,6 +340,8 @@ PropertyWin::ShowEditor(const TPropertyWatch& property, TPropertyEditor* editor,
 {
 	TPropertyWatch watch;
 	watch.SetTo(property);
+	if (watch.Property() == nullptr)
+		return false; // and its form may be gone, too
 	const uint32 count = fShownCount;
 	std::unique_ptr<TEditorState> state;
 	{
@@ -395,7 +397,10 @@ PropertyWin::SetCurrentValue(const char* value, bool lockNeeded)
 		}
 	}
 
-	// The property's component was shown before the one on the design view, or needs no design view.
+	// The property's component was shown before the one on the design view, or needs no design view. Its form may be
+	// gone with it.
+	if (property.Property() == nullptr)
+		return true;
 	WindowGuard guard(propertyLock);
 	if (property.Property() != nullptr)
 		editor->SetValue(value, true);

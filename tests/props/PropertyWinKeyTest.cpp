@@ -217,8 +217,8 @@ TEST_F(PropertyWinKeyTest, TheFocusLeavesAPaneThatIsHidden)
 	const auto other = NewComponent("Other");
 	other->ClearProperties(true);
 	TProperty* flags = new TProperty(other.get(), "OwnFlags", "", nullptr, true);
-	flags->SetEditor(new TViewFlagsProperty(other.get(), flags));
-	other->AddProperty(flags);
+	other->AddPropAndEditor(
+		flags, new TViewFlagsProperty(other.get(), flags), nullptr, nullptr, true);
 
 	GoTo("Label");
 	Press("enter");

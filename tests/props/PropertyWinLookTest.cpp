@@ -67,6 +67,15 @@ protected:
 		return property;
 	}
 
+	template <class Editor>
+	TProperty* AddEdited(const char* name, const char* value)
+	{
+		TProperty* property = new TProperty(control.get(), name, value, nullptr, true);
+		control->AddPropAndEditor(
+			property, new Editor(control.get(), property), nullptr, nullptr, true);
+		return property;
+	}
+
 	std::string PickLabel()
 	{
 		robot.Settle();
@@ -229,8 +238,7 @@ TEST_F(PropertyWinLookTest, ManyPropertiesScroll)
 {
 	while (control->CountProperties() < 60) {
 		const std::string name = "Own" + std::to_string(control->CountProperties());
-		TProperty* property = AddProperty(name.c_str(), name.c_str());
-		property->SetEditor(new TStringProperty(control.get(), property));
+		AddEdited<TStringProperty>(name.c_str(), name.c_str());
 	}
 	ShowControl();
 	{
@@ -316,8 +324,7 @@ TEST_F(PropertyWinLookTest, APropertyWithoutAnEditorShowsItsTextAndCannotBeEdite
 
 TEST_F(PropertyWinLookTest, AListOfStringsHasItsPane)
 {
-	TProperty* property = AddProperty("Items", "");
-	property->SetEditor(new TStringListProperty(control.get(), property));
+	AddEdited<TStringListProperty>("Items", "");
 	ShowControl();
 	Invoke("Items");
 	EXPECT_TRUE(IsShown("efListEdit"));
@@ -380,8 +387,8 @@ TEST_F(PropertyWinLookTest, AFullValueIsShownAndKept)
 
 TEST_F(PropertyWinLookTest, LongNamesLeaveTheValuesAlone)
 {
-	TProperty* property = AddProperty("APropertyWithThirtyOneCharacters", "value");
-	property->SetEditor(new TStringProperty(control.get(), property));
+	const TProperty* property =
+		AddEdited<TStringProperty>("APropertyWithThirtyOneCharacters", "value");
 	ShowControl();
 	Select("Name");
 	PlaceOf("lvProperties", control->CountProperties() - 1);

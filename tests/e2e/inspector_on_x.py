@@ -1,0 +1,170 @@
+#!/usr/bin/env python3
+# SPDX-License-Identifier: MIT
+"""Edits a form in the property window of the designer on a real X display: a text, a choice, flags, a colour, an event.
+
+usage: tests/e2e/inspector_on_x.py PROGRAM EXAMPLE PICTURES
+
+EXAMPLE is the folder of the hello example; a copy of it is opened. Pictures of the screen go to the folder PICTURES.
+The exit code is 1 when something is not as it should be, and 77 where a tool is missing.
+"""
+
+import shutil
+import signal
+import sys
+import tempfile
+import traceback
+from pathlib import Path
+
+from plimworks_on_x import SKIPPED, Session, check, interrupted, step
+from xdesktop import Desktop, missing_tools, wait_for
+
+WHOLE_LIMIT = 150
+
+# In the property window.
+FIRST_ROW = (20, 32)
+PROPERTIES_TAB = (20, 8)
+EVENTS_TAB = (110, 10)
+# The form's rows.
+VIEW_COLOR, TITLE, WINDOW_LOOK, WINDOW_FLAGS = 7, 12, 13, 15
+# Codes of the messages that the property window prints.
+INVOKED, EVENT_INVOKED = "0x9", "0xb"
+# In the dialogs: a box, a place on the colours' second ramp, and how far OK is from the right and bottom edges.
+NOT_CLOSABLE = (20, 91)
+MUCH_RED = (260, 46)
+OK_FROM_CORNER = (45, 23)
+
+
+class Inspector:
+    """The property window of a session."""
+
+    def __init__(self, session):
+        self.session = session
+        self.desktop = session.desktop
+
+    def activate(self):
+        self.session.click_in("Properties", PROPERTIES_TAB)
+        self.session.wait_for_active("Properties")
+
+    def count(self, code):
+        return self.session.output().count(f"BMessage({code})")
+
+    def press_and_wait(self, code, keys):
+        before = self.count(code)
+        for key in keys:
+            self.desktop.key(key)
+        wait_for(f"message {code}", lambda: self.count(code) > before)
+
+    def invoke(self, row):
+        """Goes to a row by keys and presses Return there."""
+        self.activate()
+        self.session.click_in("Properties", FIRST_ROW)
+        self.press_and_wait(INVOKED, ["Home", *["Down"] * row, "Return"])
+
+    def wait_for_value(self, name, value):
+        wait_for(f"{name} is set", lambda: f"::SetPropertyValue('{name}', '{value}" in self.session.output())
+
+    def confirm(self, title):
+        left, top, width, height = self.desktop.geometry(self.session.wait_for_window(title))
+        self.desktop.click(left + width - OK_FROM_CORNER[0], top + height - OK_FROM_CORNER[1])
+        self.desktop.wait_for_no_window(title)
+
+
+def edit_form(desktop, program, example, pictures):
+    shutil.copytree(example, desktop.folder / "hello")
+    session = Session(desktop, program, pictures, "hello/hello.plim")
+    inspector = Inspector(session)
+    session.click_in("Hello", (5, 5))
+    session.wait_for_active("Hello")
+    session.save_picture("form")
+    step("the form is shown")
+
+    inspector.invoke(TITLE)
+    desktop.key("ctrl+a")
+    desktop.type("Renamed")
+    desktop.key("Return")
+    session.wait_for_window("Renamed")
+    desktop.wait_for_no_window("Hello")
+    session.save_picture("text")
+    step("a text was typed")
+
+    inspector.invoke(WINDOW_LOOK)
+    desktop.key("space")
+    session.save_picture("menu")
+    for key in ("Down", "Down", "Return"):
+        desktop.key(key)
+    inspector.wait_for_value("WindowLook", "B_DOCUMENT_WINDOW_LOOK")
+    session.save_picture("choice")
+    step("a choice was picked")
+
+    inspector.invoke(WINDOW_FLAGS)
+    session.wait_for_active("Window Flags")
+    session.click_in("Window Flags", NOT_CLOSABLE)
+    session.save_picture("flags")
+    inspector.confirm("Window Flags")
+    inspector.wait_for_value("WindowFlags", "B_NOT_CLOSABLE")
+    step("a flag was ticked")
+
+    left, top, width, height = desktop.geometry(session.wait_for_window("Renamed"))
+    corner = (left + width - 5, top + height - 5)
+    before = desktop.picture().pixel(*corner)
+    inspector.invoke(VIEW_COLOR)
+    session.wait_for_active("Color")
+    session.click_in("Color", MUCH_RED)
+    session.save_picture("colour")
+    inspector.confirm("Color")
+    wait_for("the form has its colour", lambda: desktop.picture().pixel(*corner) != before)
+    red, green, blue = desktop.picture().pixel(*corner)
+    check(red > green and red > blue, f"the form's ground is {red}, {green}, {blue}, which is not red")
+    session.save_picture("coloured")
+    step("a colour was chosen")
+
+    inspector.activate()
+    session.click_in("Properties", EVENTS_TAB)
+    inspector.press_and_wait(EVENT_INVOKED, ["Tab", "Home", "Return"])
+    session.save_picture("event")
+    session.command("ctrl+s")
+    session.command("ctrl+g")
+    session.wait_for_active("Generate Source files")
+    desktop.key("Return")
+    desktop.wait_for_no_window("Generate Source files")
+    source = (desktop.folder / "MainForm.fcp").read_text() + (desktop.folder / "MainForm.h").read_text()
+    for text in ("Renamed", "B_DOCUMENT_WINDOW_LOOK", "B_NOT_CLOSABLE", "OnAllAttached"):
+        check(text in source, f"{text} is not in the generated source")
+    step("an event was ticked, and all of it is in the generated source")
+
+    session.activate_main()
+    desktop.key("alt+F4")
+    session.wait_until_ended()
+
+
+def main():
+    if len(sys.argv) != 4:
+        print(__doc__, file=sys.stderr)
+        return 2
+    missing = missing_tools()
+    if missing:
+        print(f"skipped: not installed here: {', '.join(missing)} (scripts/setup test installs it)")
+        return SKIPPED
+
+    for number in (signal.SIGALRM, signal.SIGTERM, signal.SIGINT, signal.SIGHUP):
+        signal.signal(number, interrupted)
+    signal.alarm(WHOLE_LIMIT)
+    program, example, pictures = (Path(word).resolve() for word in sys.argv[1:])
+    pictures.mkdir(parents=True, exist_ok=True)
+    for old in pictures.glob("*.png"):
+        old.unlink()
+    with tempfile.TemporaryDirectory(prefix="inspector_on_x.") as folder, Desktop(folder) as desktop:
+        try:
+            edit_form(desktop, program, example, pictures)
+        except Exception:
+            traceback.print_exc()
+            desktop.picture().save(pictures / "screen.png")
+            print(f"the screen then: {pictures / 'screen.png'}", file=sys.stderr)
+            for file in sorted(Path(folder).glob("*.output")):
+                print(f"{file.name}: {file.read_text(errors='replace')[-3000:]}", file=sys.stderr)
+            return 1
+    return 0
+
+
+if __name__ == "__main__":
+    sys.exit(main())
