@@ -45,7 +45,10 @@ FlagsOf(const HostWindowStyle& style)
 	if (style.isMenu)
 		return Qt::ToolTip | Qt::FramelessWindowHint | Qt::WindowDoesNotAcceptFocus;
 
-	Qt::WindowFlags flags = Qt::Window;
+	StackedWindow stacked;
+	stacked.style = style;
+	// Only dialogs tell the window manager whose they are, and so stay above it.
+	Qt::WindowFlags flags = stacked.IsModal() ? Qt::Dialog : Qt::Window;
 	switch (style.look) {
 		case B_BORDERED_WINDOW_LOOK:
 		case B_NO_BORDER_WINDOW_LOOK:
@@ -70,8 +73,6 @@ FlagsOf(const HostWindowStyle& style)
 	if ((style.flags & B_AVOID_FOCUS) != 0)
 		flags |= Qt::WindowDoesNotAcceptFocus;
 
-	StackedWindow stacked;
-	stacked.style = style;
 	if (stacked.IsFloating() || style.feel == B_MODAL_ALL_WINDOW_FEEL)
 		flags |= Qt::WindowStaysOnTopHint;
 	return flags;
