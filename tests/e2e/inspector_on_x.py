@@ -32,6 +32,8 @@ INVOKED, EVENT_INVOKED = "0x9", "0xb"
 NOT_CLOSABLE = (20, 91)
 MUCH_RED = (260, 46)
 OK_FROM_CORNER = (45, 23)
+# From the form's left edge: neither the property window nor the palette lies over it there.
+UNCOVERED = 200
 
 
 class Inspector:
@@ -101,19 +103,19 @@ def edit_form(desktop, program, example, pictures):
     session.click_in("Window Flags", NOT_CLOSABLE)
     session.save_picture("flags")
     inspector.confirm("Window Flags")
-    inspector.wait_for_value("WindowFlags", "B_NOT_CLOSABLE")
+    inspector.wait_for_value("WindowFlags", "B_NOT_RESIZABLE|B_NOT_CLOSABLE|B_NOT_ZOOMABLE")
     step("a flag was ticked")
 
-    left, top, width, height = desktop.geometry(session.wait_for_window("Renamed"))
-    corner = (left + width - 5, top + height - 5)
-    before = desktop.picture().pixel(*corner)
+    left, top, _, height = desktop.geometry(session.wait_for_window("Renamed"))
+    ground = (left + UNCOVERED, top + height - 5)
+    before = desktop.picture().pixel(*ground)
     inspector.invoke(VIEW_COLOR)
     session.wait_for_active("Color")
     session.click_in("Color", MUCH_RED)
     session.save_picture("colour")
     inspector.confirm("Color")
-    wait_for("the form has its colour", lambda: desktop.picture().pixel(*corner) != before)
-    red, green, blue = desktop.picture().pixel(*corner)
+    wait_for("the form has its colour", lambda: desktop.picture().pixel(*ground) != before)
+    red, green, blue = desktop.picture().pixel(*ground)
     check(red > green and red > blue, f"the form's ground is {red}, {green}, {blue}, which is not red")
     session.save_picture("coloured")
     step("a colour was chosen")
@@ -128,7 +130,7 @@ def edit_form(desktop, program, example, pictures):
     desktop.key("Return")
     desktop.wait_for_no_window("Generate Source files")
     source = (desktop.folder / "MainForm.fcp").read_text() + (desktop.folder / "MainForm.h").read_text()
-    for text in ("Renamed", "B_DOCUMENT_WINDOW_LOOK", "B_NOT_CLOSABLE", "OnAllAttached"):
+    for text in ("Renamed", "B_DOCUMENT_WINDOW_LOOK", "B_NOT_CLOSABLE", "virtual void AllAttached(void)"):
         check(text in source, f"{text} is not in the generated source")
     step("an event was ticked, and all of it is in the generated source")
 
