@@ -51,6 +51,17 @@ class Program:
         found = self.expect(line)
         check(found == line, f"{self.name} prints \"{found}\", not \"{line}\"")
 
+    def expect_all(self, *wanted):
+        """The same of several whole lines, in whatever order they come."""
+        def found():
+            new = self.lines()[self.seen:]
+            if all(line in new for line in wanted):
+                self.seen += 1 + max(new.index(line) for line in wanted)
+                return True
+            check(self.process.poll() is None, f"{self.name} ended with {self.process.poll()}: {new}")
+            return False
+        wait_for(f"{self.name} prints all of {wanted}", found)
+
     def forget(self):
         self.seen = len(self.lines())
 

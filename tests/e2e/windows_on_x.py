@@ -103,8 +103,9 @@ class Session:
         free = self.open("Free", 500, 300)
         self.desktop.xdotool("windowsize", free, 300, 250)
         self.one.expect_exactly("Free resized 299,249")
-        self.one.ask("limits Free 199 219", "limited Free")
-        self.one.expect_exactly("Free resized 219,219")
+        # The command is answered by one thread, the window's new size comes in another.
+        self.one.tell("limits Free 199 219")
+        self.one.expect_all("limited Free", "Free resized 219,219")
         self.desktop.xdotool("windowsize", free, 100, 210)
         self.one.expect_exactly("Free resized 199,209")
 
