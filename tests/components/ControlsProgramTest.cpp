@@ -25,7 +25,6 @@
 #include "palette/LibraryLoader.h"
 #include "palette/PaletteCatalog.h"
 #include "palette/PaletteEntry.h"
-#include "project/Project.h"
 #include "support/CapturedOutput.h"
 #include "support/Command.h"
 #include "support/Printers.h"
@@ -104,11 +103,11 @@ protected:
 	{
 		CapturedOutput output;
 		TLibraryLoader(&PaletteCatalog()).LoadFolder(PLIM_BUILD_DIR "/bin/Components");
-		fProject = std::make_unique<TProject>(FORM_SHOWN);
-		fProject->App()->SetPropertyValue("Name", "Controls");
-		fProject->App()->SetPropertyValue("GenerationPath", fFolder.Path().c_str());
-		fForm = fProject->NewForm();
+		fApp.SetPropertyValue("Name", "Controls");
+		fApp.SetPropertyValue("GenerationPath", fFolder.Path().c_str());
+		fForm = new TDesignForm("Form1", FORM_SHOWN);
 		Locked([&] {
+			fApp.AddComponent(fForm);
 			const std::pair<const char*, const char*> kValues[] = {
 				{"Left", "100"}, {"Top", "100"}, {"Right", "739"}, {"Bottom", "519"}};
 			for (const auto& [name, value] : kValues) {
@@ -124,7 +123,8 @@ protected:
 	~ControlsProgramTest()
 	{
 		CapturedOutput output;
-		fProject.reset();
+		if (fForm->Lock())
+			fForm->Quit();
 	}
 
 	void Place(const placement& place)
@@ -170,7 +170,7 @@ protected:
 		{
 			CapturedOutput output;
 			TCodeGenerator generator;
-			generator.SetAppComponent(fProject->App());
+			generator.SetAppComponent(&fApp);
 			generator.GenerateApp();
 		}
 		const std::string source = fFolder / "Form1.cpp";
@@ -197,7 +197,7 @@ protected:
 
 	BApplication fApplication{"application/x-vnd.plimworks-components-test"};
 	TemporaryFolder fFolder;
-	std::unique_ptr<TProject> fProject;
+	TAppComponent fApp;
 	TDesignForm* fForm = nullptr;
 	std::map<std::string, TComponent*> fComponents;
 	Robot fRobot;
