@@ -31,8 +31,10 @@ endif()
 # than there is fails as it does without them. The kernel kit keeps ended threads until they are waited for.
 set(sanitizer_environment)
 if("address" IN_LIST PLIM_SANITIZE)
+  set(plim_address_options
+    "allocator_may_return_null=1:detect_stack_use_after_return=1:strict_string_checks=1")
   list(APPEND sanitizer_environment
-    "ASAN_OPTIONS=allocator_may_return_null=1:detect_stack_use_after_return=1:strict_string_checks=1"
+    "ASAN_OPTIONS=${plim_address_options}"
     "LSAN_OPTIONS=suppressions=${PROJECT_SOURCE_DIR}/tests/lsan.supp:print_suppressions=0")
 endif()
 if("undefined" IN_LIST PLIM_SANITIZE)
