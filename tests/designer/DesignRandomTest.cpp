@@ -22,7 +22,7 @@ constexpr const char* kClasses[] = {
 constexpr const char* kEdges[] = {"Left", "Top", "Right", "Bottom"};
 
 /// The usual test run has time for few; PLIM_RANDOM_ACTIONS says how many, PLIM_RANDOM_SEED which.
-constexpr int kUsualActions = 120;
+constexpr int kUsualActions = 40;
 constexpr int kActionsBetweenSaves = 20;
 
 
