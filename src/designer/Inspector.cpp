@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The property window as design forms use it.
+// The property window as design forms and the project use it.
 
 #include "designer/Inspector.h"
 
@@ -34,11 +34,18 @@ WithWindow(Use use)
 
 
 void
-ShowIn(PropertyWin* window, TComponent* component, BView* designView)
+LoadInto(PropertyWin* window, TComponent* component, BView* designView)
 {
 	// First, since the values of the component are read with its window locked.
 	window->SetDesignView(designView);
 	window->SetComponent(component);
+}
+
+
+void
+ShowIn(PropertyWin* window, TComponent* component, BView* designView)
+{
+	LoadInto(window, component, designView);
 	if (window->IsHidden())
 		window->Show();
 }
@@ -74,6 +81,16 @@ ShowUnlessShown(TComponent* component, BView* designView)
 
 
 void
+Load(TComponent* component, BView* designView)
+{
+	WithWindow([=](PropertyWin* window) {
+		if (window->Component() != component)
+			LoadInto(window, component, designView);
+	});
+}
+
+
+void
 Leave(const TComponent* component)
 {
 	WithWindow([=](PropertyWin* window) {
@@ -93,6 +110,19 @@ LeaveForm(const TComponent* form, const std::vector<const TComponent*>& componen
 			return;
 		window->SetComponent(nullptr);
 		if (isForm)
+			window->SetDesignView(nullptr);
+	});
+}
+
+
+void
+Forget(const std::vector<const TComponent*>& components, const BView* designView)
+{
+	WithWindow([&](PropertyWin* window) {
+		if (std::find(components.begin(), components.end(), window->Component())
+			!= components.end())
+			window->SetComponent(nullptr);
+		if (window->DesignView() == designView)
 			window->SetDesignView(nullptr);
 	});
 }

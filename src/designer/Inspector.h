@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The property window as design forms use it.
+// The property window as design forms and the project use it.
 
 #pragma once
 
@@ -8,7 +8,7 @@
 class BView;
 class TComponent;
 
-/// What a design form shows in the property window. In programs without one the operations do nothing.
+/// What is shown in the property window. In programs without one the operations do nothing.
 ///
 /// Each gives up the lock that the thread holds while it locks the property window: look up again what
 /// that lock protects. A component that is destroyed, or goes to another form, must not be shown any longer.
@@ -23,11 +23,18 @@ void Show(TComponent* component, BView* designView);
 /// The same, but nothing happens when \a component is shown already.
 void ShowUnlessShown(TComponent* component, BView* designView);
 
+/// The same, but a window that is hidden stays hidden.
+void Load(TComponent* component, BView* designView);
+
 /// Shows nothing if \a component, which may be gone, is shown.
 void Leave(const TComponent* component);
 
 /// Shows nothing if \a form or one of its \a components is shown; in the first case forgets the design view, too.
 void LeaveForm(const TComponent* form, const std::vector<const TComponent*>& components);
+
+/// Lets go of a form that is about to be destroyed, or has been: shows nothing if one of \a components is shown, and
+/// forgets \a designView if that is the design view. Either may be gone: addresses are only compared.
+void Forget(const std::vector<const TComponent*>& components, const BView* designView);
 
 /// Brings the shown values up to date, soon. Takes no lock.
 void Refresh();

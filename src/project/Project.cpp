@@ -9,7 +9,7 @@
 
 #include "app/WindowGuard.h"
 #include "designer/DesignFormView.h"
-#include "project/InspectorLink.h"
+#include "designer/Inspector.h"
 #include "project/ProjectObserver.h"
 #include "project/ProjectOperation.h"
 
@@ -20,6 +20,15 @@ constexpr size_t kFilenameSize = 256;
 // To no window: answered when the messages before it have been handled.
 constexpr uint32 kMsgAreYouDone = '_don';
 
+/// \a form, which is locked, and what is on it.
+std::vector<const TComponent*>
+ComponentsOf(const TDesignForm* form)
+{
+	std::vector<const TComponent*> components = {form};
+	for (int32 i = 0; i < form->CountComponents(); i++)
+		components.push_back(form->ComponentAt(i));
+	return components;
+}
 
 } // namespace
 
@@ -452,14 +461,24 @@ void
 TProject::Quit(const std::vector<TDesignForm*>& forms)
 {
 	for (TDesignForm* form : forms) {
-		const inspected_form inspected = WhatIsInspected(form);
-		ForgetInInspector(inspected);
+		std::vector<const TComponent*> components;
+		const BView* view = nullptr;
+		{
+			WindowGuard guard(form);
+			if (guard.IsLocked()) {
+				components = ComponentsOf(form);
+				view = form->View();
+			}
+		}
+		if (view != nullptr)
+			Inspector::Forget(components, view);
 		{
 			WindowGuard guard(form, B_INFINITE_TIMEOUT);
 			if (guard.IsLocked())
 				form->Quit();
 		}
 		// The user may have chosen something of it with the last clicks that it handled.
-		ForgetInInspector(inspected);
+		if (view != nullptr)
+			Inspector::Forget(components, view);
 	}
 }

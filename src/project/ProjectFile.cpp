@@ -12,11 +12,11 @@
 #include "app/WindowGuard.h"
 #include "designer/DesignFormView.h"
 #include "designer/FormFile.h"
+#include "designer/Inspector.h"
 #include "designer/LoadReport.h"
 #include "model/Diagnostics.h"
 #include "model/Event.h"
 #include "model/Property.h"
-#include "project/InspectorLink.h"
 #include "project/Project.h"
 #include "project/ProjectOperation.h"
 
@@ -176,7 +176,7 @@ TProject::LoadApp(const BMessage& document)
 			fApp->SetEventSelection(name, selected);
 	}
 	ObjectNameChanged(fApp.get());
-	RefreshInspector();
+	Inspector::Refresh();
 }
 
 

@@ -18,8 +18,8 @@
 #include "app/WindowFrame.h"
 #include "app/WindowGuard.h"
 #include "designer/DesignFormView.h"
+#include "designer/Inspector.h"
 #include "designer/RefFilters.h"
-#include "project/InspectorLink.h"
 #include "project/Project.h"
 #include "project/ProjectOperation.h"
 #include "project/ProjectView.h"
@@ -230,7 +230,7 @@ ProjectWin::ProjectStarted(TAppComponent* app)
 		fView->ClearRows();
 		fView->AddRow(app, nullptr, app->ComponentName());
 	}
-	ShowInInspector(app, fView);
+	Inspector::Load(app, fView);
 }
 
 
@@ -383,7 +383,7 @@ ProjectWin::ShowSelection()
 	if (fSelectionWaits || row == nullptr)
 		return;
 	TDesignForm* form = row->Form();
-	ShowInInspector(row->Component(), form != nullptr ? form->View() : static_cast<BView*>(fView));
+	Inspector::Load(row->Component(), form != nullptr ? form->View() : static_cast<BView*>(fView));
 }
 
 
