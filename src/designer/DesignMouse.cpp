@@ -18,6 +18,7 @@
 #include "model/Diagnostics.h"
 #include "model/Property.h"
 #include "model/RectTracking.h"
+#include "model/ViewTree.h"
 #include "palette/PaletteCatalog.h"
 #include "palette/PaletteEntry.h"
 #include "props/PropertyEditor.h"
@@ -28,15 +29,6 @@ constexpr int32 kNameSize = 80;
 
 /// The least width and height of a component that is placed with the mouse.
 constexpr float kMinimumSize = 8;
-
-bool
-IsInside(const BView* view, const BView* ancestor)
-{
-	while (view != nullptr && view != ancestor)
-		view = view->Parent();
-	return view != nullptr;
-}
-
 
 void
 WriteValue(TComponent* component, const char* name, const char* text, bool notify)

@@ -16,6 +16,7 @@
 #include "model/Event.h"
 #include "model/Property.h"
 #include "model/ViewLock.h"
+#include "model/ViewTree.h"
 #include "palette/PaletteCatalog.h"
 #include "palette/PaletteEntry.h"
 
@@ -233,7 +234,7 @@ TFormReader::Nest(TComponent* child, TComponent* owner, const placement& place)
 	TComponentOwner* container = dynamic_cast<TComponentOwner*>(owner);
 	if (container == nullptr || owner->DTView() == nullptr || child->DTView() == nullptr)
 		return;
-	if (IsInside(owner, child)) {
+	if (IsInside(owner->DTView(), child->DTView())) {
 		BString text;
 		text << "component '" << child->ComponentName() << "' stays on the form: '"
 			 << owner->ComponentName() << "' cannot hold it, being the same or inside it";
@@ -252,18 +253,6 @@ TFormReader::Nest(TComponent* child, TComponent* owner, const placement& place)
 	container->AddComponent(child);
 	view->MoveTo(place.frame.LeftTop());
 	view->ResizeTo(place.frame.right - place.frame.left, place.frame.bottom - place.frame.top);
-}
-
-
-/// Whether \a owner is \a child or lies inside it, so that it cannot hold \a child.
-bool
-TFormReader::IsInside(const TComponent* owner, const TComponent* child) const
-{
-	for (const BView* view = owner->DTView(); view != nullptr; view = view->Parent()) {
-		if (view == child->DTView())
-			return true;
-	}
-	return false;
 }
 
 

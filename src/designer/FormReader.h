@@ -40,7 +40,6 @@ private:
 	void ReadEvents(TComponent* component, const BMessage& events);
 	void NestComponents();
 	void Nest(TComponent* child, TComponent* owner, const placement& place);
-	bool IsInside(const TComponent* owner, const TComponent* child) const;
 	void DropComponent(const char* savedName, const char* reason);
 
 	TDesignFormView* fForm;

@@ -14,15 +14,7 @@
 #include "model/Diagnostics.h"
 #include "model/FormDesigner.h"
 #include "model/ViewLock.h"
-
-
-static bool
-IsInside(const BView* view, const BView* ancestor)
-{
-	while (view != nullptr && view != ancestor)
-		view = view->Parent();
-	return view != nullptr;
-}
+#include "model/ViewTree.h"
 
 
 /// Posts a copy of a design message to the view beneath \a view, which may be none.

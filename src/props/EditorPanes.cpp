@@ -17,6 +17,7 @@
 
 #include "model/Property.h"
 #include "props/PropertyWin.h"
+#include "props/ShownValue.h"
 #include "props/StringList.h"
 
 namespace {
@@ -26,13 +27,6 @@ constexpr float kButtonWidth = 25;
 constexpr float kLabelGap = 6;
 constexpr float kLabelPart = 0.6f; // at most, of a field's width
 constexpr const char* kPaneNames[] = {"String", "Modal", "List", "PickList", "None"};
-
-/// At most what a property's text holds: one filled to its last byte has no terminator of its own.
-BString
-ShownText(const char* text)
-{
-	return text != nullptr ? BString(text, TPropertyText::kSize) : BString();
-}
 
 
 /// Labels a text or menu field and leaves the rest of its width to what is edited.
@@ -61,13 +55,13 @@ SetLimitedText(BTextControl* field, const TEditorState& state)
 TEditorState::TEditorState(TProperty* property, TPropertyEditor* editor, TPropEditType type)
 	: property(property),
 	  name(property->Name()),
-	  value(ShownText(property->Value())),
+	  value(ShownValue(property->Value())),
 	  limit(TPropertyText::kSize),
 	  hasEditor(editor != nullptr)
 {
 	if (editor == nullptr)
 		return;
-	displayValue = ShownText(editor->GetDisplayValue());
+	displayValue = ShownValue(editor->GetDisplayValue());
 	limit = static_cast<int32>(editor->EditLimit());
 	if (type != PET_PICKLIST)
 		return;
@@ -218,7 +212,7 @@ TEditorPanes::StringText() const
 void
 TEditorPanes::SetModalText(const char* text)
 {
-	fModalField->SetText(ShownText(text).String());
+	fModalField->SetText(ShownValue(text).String());
 }
 
 

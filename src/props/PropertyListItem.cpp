@@ -8,6 +8,7 @@
 #include "model/Property.h"
 #include "props/ListRow.h"
 #include "props/PropertyEditor.h"
+#include "props/ShownValue.h"
 
 namespace {
 
@@ -16,13 +17,6 @@ constexpr float kValueLeft = 110;
 constexpr float kRightMargin = 4;
 constexpr float kBaseline = 2; // above the bottom
 
-/// At most what a property's text holds: one filled to its last byte has no terminator of its own.
-BString
-ShownText(const char* text)
-{
-	return text != nullptr ? BString(text, TPropertyText::kSize) : BString();
-}
-
 } // namespace
 
 TPropertyListItem::TPropertyListItem(TProperty* property)
@@ -30,7 +24,7 @@ TPropertyListItem::TPropertyListItem(TProperty* property)
 	  fEditor(property->Editor()),
 	  fName(property->Name())
 {
-	fValue = ShownText(fEditor != nullptr ? fEditor->GetDisplayValue() : property->Value());
+	fValue = ShownValue(fEditor != nullptr ? fEditor->GetDisplayValue() : property->Value());
 }
 
 
