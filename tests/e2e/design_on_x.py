@@ -8,14 +8,11 @@ Pictures of the screen go to the folder PICTURES. The exit code is 1 when someth
 where a tool is missing.
 """
 
-import signal
 import sys
-import tempfile
-import traceback
-from pathlib import Path
 
-from plimworks_on_x import SKIPPED, Session, check, interrupted, step
-from xdesktop import AWAY, Desktop, missing_tools, wait_for
+from plimworks_on_x import Session
+from xdesktop import AWAY, wait_for
+from xtest import check, run, step
 
 WHOLE_LIMIT = 220
 
@@ -155,32 +152,5 @@ def design(desktop, program, pictures):
             check(complaint not in session.output(), f"the kits complained: {session.output()[-3000:]}")
 
 
-def main():
-    if len(sys.argv) != 3:
-        print(__doc__, file=sys.stderr)
-        return 2
-    missing = missing_tools()
-    if missing:
-        print(f"skipped: not installed here: {', '.join(missing)} (scripts/setup test installs it)")
-        return SKIPPED
-
-    for number in (signal.SIGALRM, signal.SIGTERM, signal.SIGINT, signal.SIGHUP):
-        signal.signal(number, interrupted)
-    signal.alarm(WHOLE_LIMIT)
-    program, pictures = (Path(word).resolve() for word in sys.argv[1:])
-    pictures.mkdir(parents=True, exist_ok=True)
-    with tempfile.TemporaryDirectory(prefix="design_on_x.") as folder, Desktop(folder) as desktop:
-        try:
-            design(desktop, program, pictures)
-        except Exception:
-            traceback.print_exc()
-            desktop.picture().save(pictures / "screen.png")
-            print(f"the screen then: {pictures / 'screen.png'}", file=sys.stderr)
-            for file in sorted(Path(folder).glob("*.output")):
-                print(f"{file.name}: {file.read_text(errors='replace')[-3000:]}", file=sys.stderr)
-            return 1
-    return 0
-
-
 if __name__ == "__main__":
-    sys.exit(main())
+    sys.exit(run(design, 2, WHOLE_LIMIT, __doc__))

@@ -1,16 +1,12 @@
 # SPDX-License-Identifier: MIT
 """What the tests of programs that exchange data share: the programs, and the run of a test."""
 
-import signal
 import subprocess
 import sys
-import tempfile
-import traceback
-from pathlib import Path
 
-from xdesktop import Desktop, Failure, missing_tools, wait_for
+from xdesktop import wait_for
+from xtest import check, run
 
-SKIPPED = 77
 WHOLE_LIMIT = 220
 
 
@@ -75,40 +71,8 @@ class Program:
         check(self.process.returncode == 0, f"{self.name} ended with {self.process.returncode}: {self.lines()}")
 
 
-def check(condition, message):
-    if not condition:
-        raise Failure(message)
-
-
-def interrupted(number, _):
-    signal.signal(number, signal.SIG_IGN)
-    raise Failure("the whole took too long" if number == signal.SIGALRM else f"signal {number} came")
-
-
 def main(use):
-    """Calls \\a use with a desktop, the two programs and a folder; the exit code."""
-    if len(sys.argv) != 4:
-        print(f"usage: {sys.argv[0]} EXCHANGE_PROGRAM XDND_CLIENT FOLDER", file=sys.stderr)
-        return 2
-    missing = missing_tools()
-    if missing:
-        print(f"skipped: not installed here: {', '.join(missing)} (scripts/setup test installs it)")
-        return SKIPPED
-
-    for number in (signal.SIGALRM, signal.SIGTERM, signal.SIGINT, signal.SIGHUP):
-        signal.signal(number, interrupted)
-    signal.alarm(WHOLE_LIMIT)
-    program, client, pictures = (Path(word).resolve() for word in sys.argv[1:])
-    with tempfile.TemporaryDirectory(prefix="exchange.") as folder, Desktop(folder) as desktop:
-        try:
-            use(desktop, program, client)
-        except Exception:
-            traceback.print_exc()
-            picture = pictures / (Path(sys.argv[0]).stem + ".png")
-            desktop.picture().save(picture)
-            print(f"the screen then: {picture}", file=sys.stderr)
-            for file in sorted(Path(folder).glob("*.output")):
-                text = file.read_text(encoding="utf-8", errors="replace")
-                print(f"{file.name}: {text[-3000:]}", file=sys.stderr)
-            return 1
-    return 0
+    """Calls use(desktop, program, client); returns the exit code."""
+    usage = f"usage: {sys.argv[0]} EXCHANGE_PROGRAM XDND_CLIENT FOLDER"
+    return run(lambda desktop, program, client, _: use(desktop, program, client), 3, WHOLE_LIMIT, usage,
+               owns_folder=False)

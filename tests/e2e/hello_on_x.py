@@ -10,18 +10,14 @@ is 1 then, and 77 where a tool is missing.
 """
 
 import os
-import signal
 import sys
-import tempfile
 import time
-import traceback
 from pathlib import Path
 
 import picture
-from xdesktop import Desktop, Failure, missing_tools, wait_for
+from xdesktop import wait_for
+from xtest import check, run, step
 
-SKIPPED = 77
-# Before the limit of CTest, which would leave nobody to say what was waited for.
 WHOLE_LIMIT = 110
 IDLE_LIMIT = 0.25  # seconds of processor time in one second
 
@@ -38,15 +34,6 @@ NAME_FIELD = (230, 50)
 SHOUT_BOX = (32, 80)
 # Of the note's: all but this depends on which control has the focus.
 NOTE_PROMPT = (12, 12, 248, 32)
-
-
-def check(condition, message):
-    if not condition:
-        raise Failure(message)
-
-
-def step(text):
-    print(f"{time.monotonic() - START:6.2f} s  {text}", flush=True)
 
 
 def run_robot(desktop, program, pictures):
@@ -198,41 +185,5 @@ def use_hello(desktop, program, pictures):
     session.quit()
 
 
-def interrupted(number, _):
-    # Once is enough: what is left is to end the programs that were started.
-    signal.signal(number, signal.SIG_IGN)
-    raise Failure("the whole took too long" if number == signal.SIGALRM else f"signal {number} came")
-
-
-def main():
-    if len(sys.argv) != 3:
-        print(__doc__, file=sys.stderr)
-        return 2
-    missing = missing_tools()
-    if missing:
-        print(f"skipped: not installed here: {', '.join(missing)} (scripts/setup test installs it)")
-        return SKIPPED
-
-    for number in (signal.SIGALRM, signal.SIGTERM, signal.SIGINT, signal.SIGHUP):
-        signal.signal(number, interrupted)
-    signal.alarm(WHOLE_LIMIT)
-    program, pictures = Path(sys.argv[1]).resolve(), Path(sys.argv[2]).resolve()
-    pictures.mkdir(parents=True, exist_ok=True)
-    for old in pictures.glob("*.png"):
-        old.unlink()
-    with tempfile.TemporaryDirectory(prefix="hello_on_x.") as folder, Desktop(folder) as desktop:
-        try:
-            use_hello(desktop, program, pictures)
-        except Exception:
-            traceback.print_exc()
-            desktop.picture().save(pictures / "screen.png")
-            print(f"the screen then: {pictures / 'screen.png'}", file=sys.stderr)
-            for file in sorted(Path(folder).glob("*.output")):
-                print(f"{file.name}: {file.read_text(errors='replace')}", file=sys.stderr)
-            return 1
-    return 0
-
-
-START = time.monotonic()
 if __name__ == "__main__":
-    sys.exit(main())
+    sys.exit(run(use_hello, 2, WHOLE_LIMIT, __doc__))

@@ -9,14 +9,11 @@ The exit code is 1 when something is not as it should be, and 77 where a tool is
 """
 
 import shutil
-import signal
 import sys
-import tempfile
-import traceback
-from pathlib import Path
 
-from plimworks_on_x import SKIPPED, Session, check, interrupted, step
-from xdesktop import Desktop, missing_tools, wait_for
+from plimworks_on_x import Session
+from xdesktop import wait_for
+from xtest import check, run, step
 
 WHOLE_LIMIT = 150
 
@@ -139,34 +136,5 @@ def edit_form(desktop, program, example, pictures):
     session.wait_until_ended()
 
 
-def main():
-    if len(sys.argv) != 4:
-        print(__doc__, file=sys.stderr)
-        return 2
-    missing = missing_tools()
-    if missing:
-        print(f"skipped: not installed here: {', '.join(missing)} (scripts/setup test installs it)")
-        return SKIPPED
-
-    for number in (signal.SIGALRM, signal.SIGTERM, signal.SIGINT, signal.SIGHUP):
-        signal.signal(number, interrupted)
-    signal.alarm(WHOLE_LIMIT)
-    program, example, pictures = (Path(word).resolve() for word in sys.argv[1:])
-    pictures.mkdir(parents=True, exist_ok=True)
-    for old in pictures.glob("*.png"):
-        old.unlink()
-    with tempfile.TemporaryDirectory(prefix="inspector_on_x.") as folder, Desktop(folder) as desktop:
-        try:
-            edit_form(desktop, program, example, pictures)
-        except Exception:
-            traceback.print_exc()
-            desktop.picture().save(pictures / "screen.png")
-            print(f"the screen then: {pictures / 'screen.png'}", file=sys.stderr)
-            for file in sorted(Path(folder).glob("*.output")):
-                print(f"{file.name}: {file.read_text(errors='replace')[-3000:]}", file=sys.stderr)
-            return 1
-    return 0
-
-
 if __name__ == "__main__":
-    sys.exit(main())
+    sys.exit(run(edit_form, 3, WHOLE_LIMIT, __doc__))

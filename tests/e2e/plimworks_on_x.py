@@ -9,17 +9,11 @@ The exit code is 1 when something is not as it should be, and 77 where a tool is
 """
 
 import shutil
-import signal
 import sys
-import tempfile
-import time
-import traceback
-from pathlib import Path
 
-from xdesktop import Desktop, Failure, missing_tools, wait_for
+from xdesktop import wait_for
+from xtest import check, run, step
 
-SKIPPED = 77
-# Before the limit of CTest, which would leave nobody to say what was waited for.
 WHOLE_LIMIT = 220
 
 MAIN = (20, 40, 301, 41)  # left and top on the screen, width and height
@@ -41,15 +35,6 @@ NO_FROM_RIGHT = 143
 BUTTONS_FROM_BOTTOM = 30
 GENERATED = ("Hello.h", "Hello.cpp", "MainForm.h", "MainForm.cpp", "MainForm.fcp", "NoteForm.h", "NoteForm.cpp",
              "NoteForm.fcp")
-
-
-def check(condition, message):
-    if not condition:
-        raise Failure(message)
-
-
-def step(text):
-    print(f"{time.monotonic() - START:6.2f} s  {text}", flush=True)
 
 
 class Session:
@@ -253,41 +238,5 @@ def use_designer(desktop, program, example, pictures):
     tell_of_a_bad_project(desktop, program, pictures)
 
 
-def interrupted(number, _):
-    # Once is enough: what is left is to end the programs that were started.
-    signal.signal(number, signal.SIG_IGN)
-    raise Failure("the whole took too long" if number == signal.SIGALRM else f"signal {number} came")
-
-
-def main():
-    if len(sys.argv) != 4:
-        print(__doc__, file=sys.stderr)
-        return 2
-    missing = missing_tools()
-    if missing:
-        print(f"skipped: not installed here: {', '.join(missing)} (scripts/setup test installs it)")
-        return SKIPPED
-
-    for number in (signal.SIGALRM, signal.SIGTERM, signal.SIGINT, signal.SIGHUP):
-        signal.signal(number, interrupted)
-    signal.alarm(WHOLE_LIMIT)
-    program, example, pictures = (Path(word).resolve() for word in sys.argv[1:])
-    pictures.mkdir(parents=True, exist_ok=True)
-    for old in pictures.glob("*.png"):
-        old.unlink()
-    with tempfile.TemporaryDirectory(prefix="plimworks_on_x.") as folder, Desktop(folder) as desktop:
-        try:
-            use_designer(desktop, program, example, pictures)
-        except Exception:
-            traceback.print_exc()
-            desktop.picture().save(pictures / "screen.png")
-            print(f"the screen then: {pictures / 'screen.png'}", file=sys.stderr)
-            for file in sorted(Path(folder).glob("*.output")):
-                print(f"{file.name}: {file.read_text(errors='replace')[-3000:]}", file=sys.stderr)
-            return 1
-    return 0
-
-
-START = time.monotonic()
 if __name__ == "__main__":
-    sys.exit(main())
+    sys.exit(run(use_designer, 3, WHOLE_LIMIT, __doc__))
