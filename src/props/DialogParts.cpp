@@ -8,36 +8,15 @@
 #include <Button.h>
 #include <InterfaceDefs.h>
 #include <Message.h>
-#include <MessageFilter.h>
 #include <View.h>
 #include <Window.h>
+
+#include "props/EscapeFilter.h"
 
 namespace {
 
 constexpr float kButtonWidth = 70;
 constexpr float kButtonHeight = 25;
-
-/// Turns Escape into a press of a button.
-class TEscapeFilter : public BMessageFilter {
-public:
-	explicit TEscapeFilter(BButton* button)
-		: BMessageFilter(B_ANY_DELIVERY, B_ANY_SOURCE, B_KEY_DOWN),
-		  fButton(button)
-	{
-	}
-
-	filter_result Filter(BMessage* message, BHandler**) override
-	{
-		int8 byte;
-		if (message->FindInt8("byte", &byte) != B_OK || byte != B_ESCAPE)
-			return B_DISPATCH_MESSAGE;
-		fButton->Invoke();
-		return B_SKIP_MESSAGE;
-	}
-
-private:
-	BButton* fButton;
-};
 
 } // namespace
 
@@ -58,7 +37,10 @@ AddDialogButtons(
 	parent->AddChild(cancel);
 	parent->AddChild(ok);
 	ok->MakeDefault(true);
-	window->AddCommonFilter(new TEscapeFilter(cancel));
+	window->AddCommonFilter(new TEscapeFilter([cancel] {
+		cancel->Invoke();
+		return true;
+	}));
 }
 
 

@@ -202,6 +202,17 @@ TEditorPanes::FlipPick()
 }
 
 
+BTextControl*
+TEditorPanes::FocusedField() const
+{
+	for (BTextControl* field : {fStringField, fListField}) {
+		if (field->TextView()->IsFocus())
+			return field;
+	}
+	return nullptr;
+}
+
+
 const char*
 TEditorPanes::StringText() const
 {

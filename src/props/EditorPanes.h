@@ -57,6 +57,9 @@ public:
 	/// Of a choice between two, takes the other one.
 	void FlipPick();
 
+	/// The field that is shown and has the keyboard focus; null when none has.
+	BTextControl* FocusedField() const;
+
 	/// What is typed in the pane for strings.
 	const char* StringText() const;
 	void SetModalText(const char* text);

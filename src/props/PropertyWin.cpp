@@ -10,6 +10,7 @@
 #include <MessageRunner.h>
 #include <OS.h>
 #include <Screen.h>
+#include <TextControl.h>
 
 #include "app/WindowFrame.h"
 #include "app/WindowGuard.h"
@@ -18,6 +19,7 @@
 #include "model/Property.h"
 #include "props/ComponentRows.h"
 #include "props/EditorPanes.h"
+#include "props/EscapeFilter.h"
 #include "props/EventListItem.h"
 #include "props/EventView.h"
 #include "props/PickListProperty.h"
@@ -260,6 +262,7 @@ PropertyWin::InitControls()
 	for (int32 type = PET_STRING; type <= PET_NONE; type++)
 		InitEditorFor(static_cast<TPropEditType>(type));
 	AddChild(fTabView);
+	AddCommonFilter(new TEscapeFilter([this] { return TakeBackText(); }));
 }
 
 
@@ -404,6 +407,26 @@ PropertyWin::SetCurrentValue(const char* value, bool lockNeeded)
 	WindowGuard guard(propertyLock);
 	if (property.Property() != nullptr)
 		editor->SetValue(value, true);
+	return true;
+}
+
+
+/// Shows the property's value in place of what was typed. Where nothing was, the list gets the keyboard focus back.
+///
+/// False when no text is being typed. It is done before the next key arrives, which belongs to the text shown then.
+bool
+PropertyWin::TakeBackText()
+{
+	const BTextControl* field = fPanes->FocusedField();
+	if (field == nullptr)
+		return false;
+	const BString typed(field->Text());
+	TPropertyEditor* editor = CurrentEditor();
+	if (editor != nullptr)
+		ShowEditor(fProperty, editor, editor->Type(), fPropertyLock, false);
+	// Another property may be shown by now, and its editor have no field.
+	if (fPanes->FocusedField() == field && typed == field->Text())
+		fPropView->List()->MakeFocus(true);
 	return true;
 }
 

@@ -93,6 +93,7 @@ private:
 		BLooper* lock, bool focus);
 	void InvokeShownEditor(TPropertyEditor* editor, TPropEditType type);
 	bool SetCurrentValue(const char* value, bool lockNeeded);
+	bool TakeBackText();
 	void EditModally();
 	void FlipEvent();
 	void RefreshInThisFrame();

@@ -4,6 +4,7 @@
 #include "PropertyWinTest.h"
 #include "model/Event.h"
 #include "props/FlagsProperty.h"
+#include "props/StringProperty.h"
 #include "props/TabView.h"
 
 namespace {
@@ -111,6 +112,122 @@ TEST_F(PropertyWinKeyTest, ATextIsTypedAndCommitted)
 	EXPECT_EQ(Value("Top"), "31");
 	EXPECT_EQ(ShownValue("Top"), "31");
 	EXPECT_EQ(FocusName(), "efStringEdit");
+}
+
+
+TEST_F(PropertyWinKeyTest, EscapeTakesBackWhatWasTyped)
+{
+	{
+		WindowGuard guard(surface);
+		control->FindProperty("Label")->Editor()->SetValue("stored", true);
+	}
+	GoTo("Label");
+	Press("enter");
+	robot.Type("typed");
+	EXPECT_EQ(robot.Text("efStringEdit"), "typed");
+	Press("escape");
+	EXPECT_EQ(robot.Text("efStringEdit"), "stored");
+	EXPECT_EQ(FocusName(), "efStringEdit");
+	EXPECT_EQ(SelectedName(), "Label");
+
+	// Leaving the field now sets nothing, and the next text takes the old one's place.
+	control->notes.clear();
+	Press("tab");
+	EXPECT_TRUE(control->notes.empty());
+	Press("shift+tab");
+	robot.Type("second");
+	Press("enter");
+	EXPECT_EQ(Value("Label"), "second");
+}
+
+
+TEST_F(PropertyWinKeyTest, KeysPressedRightAfterEscapeCountAfterIt)
+{
+	GoTo("Top");
+	Press("enter");
+	robot.Type("5\x1b"
+			   "31");
+	Press("enter");
+	EXPECT_EQ(Value("Top"), "31");
+}
+
+
+TEST_F(PropertyWinKeyTest, EscapeWithNothingTypedReturnsToTheList)
+{
+	control->notes.clear();
+	GoTo("Top");
+	Press("enter");
+	Press("escape");
+	EXPECT_EQ(FocusName(), "lvProperties");
+	EXPECT_EQ(SelectedName(), "Top");
+	// There it does nothing.
+	Press("escape");
+	EXPECT_EQ(FocusName(), "lvProperties");
+	Press("down");
+	EXPECT_EQ(SelectedName(), control->PropertyAt(RowOf("Top") + 1)->Name());
+	EXPECT_TRUE(control->notes.empty());
+}
+
+
+TEST_F(PropertyWinKeyTest, EscapeShowsTheValueAgainThatARefusalKept)
+{
+	GoTo("Top");
+	Press("enter");
+	control->refuses = true;
+	robot.Type("12");
+	Press("enter");
+	EXPECT_EQ(robot.Text("efStringEdit"), "12");
+	Press("escape");
+	EXPECT_EQ(robot.Text("efStringEdit"), "0");
+	EXPECT_EQ(Value("Top"), "0");
+}
+
+
+TEST_F(PropertyWinKeyTest, EscapeInTheFieldOfAComponentThatIsGoneDoesNothing)
+{
+	GoTo("Label");
+	Press("enter");
+	robot.Type("typed");
+	Show(nullptr, nullptr);
+	{
+		WindowGuard guard(surface);
+		control.reset();
+	}
+	Press("escape");
+	EXPECT_EQ(FocusName(), "lvProperties");
+}
+
+
+TEST_F(PropertyWinKeyTest, TheSelectedRowIsAlwaysInSight)
+{
+	while (control->CountProperties() < 60) {
+		const std::string name = "Own" + std::to_string(control->CountProperties());
+		TProperty* property = new TProperty(control.get(), name.c_str(), "", nullptr, true);
+		control->AddPropAndEditor(
+			property, new TStringProperty(control.get(), property), nullptr, nullptr, true);
+	}
+	Show(nullptr, nullptr);
+	ShowControl();
+	const auto expectInSight = [&](const char* key) {
+		Press(key);
+		WindowGuard guard(window);
+		BListView* list = List("lvProperties");
+		const BRect row = list->ItemFrame(list->CurrentSelection());
+		EXPECT_LE(list->Bounds().top, row.top) << key;
+		EXPECT_GE(list->Bounds().bottom, row.bottom) << key;
+	};
+	for (int32 i = 0; i < 59; i++)
+		expectInSight("down");
+	EXPECT_EQ(SelectedName(), "Own59");
+	for (int32 i = 0; i < 59; i++)
+		expectInSight("up");
+	EXPECT_EQ(SelectedName(), "Name");
+	expectInSight("end");
+	expectInSight("home");
+	// A page is scrolled without the selection.
+	Press("page-down", 2);
+	expectInSight("down");
+	EXPECT_EQ(SelectedName(), control->PropertyAt(1)->Name());
 }
 
 
