@@ -3,52 +3,55 @@
 #ifndef KITS_INTERFACE_TEXT_UNDO_H
 #define KITS_INTERFACE_TEXT_UNDO_H
 
+#include <deque>
+#include <memory>
 #include <string>
 
 #include "TextStyles.h"
 
 namespace BPrivate {
 
-/// The last change of a text: typing without a break counts as one. Taking it back is a change, too.
+/// At \a offset \a removed, which had \a styles, gave way to \a inserted.
+struct TextChange {
+	int32 offset;
+	std::string removed;
+	RunArray styles;
+	std::string inserted;
+};
+
+
+/// The changes of a text, to go back and forth among. Typing without a break counts as one, and so do deletions side
+/// by side.
+///
+/// Taking back is a change, too: between StartUndo() or StartRedo() and End() what is noted goes to the other side. Any
+/// other change ends what could be done again. There is no limit to the number of changes, but to their size.
 class TextUndo {
 public:
-	/// \a removed, with its styles, gave way to \a inserted at \a offset.
-	void Note(
-		int32 offset, const std::string& removed, RunArray styles, const std::string& inserted)
-	{
-		const bool typedOn = fValid && !fSealed && removed.empty() && !inserted.empty()
-			&& offset == fOffset + static_cast<int32>(fInserted.size());
-		if (typedOn) {
-			fInserted += inserted;
-			return;
-		}
-		fOffset = offset;
-		fRemoved = removed;
-		fStyles = std::move(styles);
-		fInserted = inserted;
-		fValid = true;
-		fSealed = false;
-	}
-
+	void Note(TextChange change);
 	/// The next change begins anew.
 	void Seal() { fSealed = true; }
+	void Forget();
 
-	void Forget() { fValid = false; }
-
-	bool IsEmpty() const { return !fValid; }
-	int32 Offset() const { return fOffset; }
-	const std::string& Removed() const { return fRemoved; }
-	/// Null when nothing was removed. The caller's; the next change is noted before another undo.
-	RunArray TakeStyles() { return std::move(fStyles); }
-	const std::string& Inserted() const { return fInserted; }
+	/// What is to be taken back of \a text as it is; null for nothing. When it is not there, as the text was changed
+	/// unnoticed, all is forgotten.
+	std::unique_ptr<TextChange> StartUndo(const std::string& text);
+	std::unique_ptr<TextChange> StartRedo(const std::string& text);
+	void End();
 
 private:
-	bool fValid = false;
-	bool fSealed = false;
-	int32 fOffset = 0;
-	std::string fRemoved;
-	RunArray fStyles;
-	std::string fInserted;
+	enum Direction { kNew, kBack, kForth };
+	typedef std::deque<std::unique_ptr<TextChange>> Changes;
+
+	static size_t SizeOf(const TextChange& change);
+	bool Join(const TextChange& change);
+	std::unique_ptr<TextChange> Take(Changes* changes, const std::string& text);
+
+	Changes fDone;
+	Changes fUndone;
+	Direction fDirection = kNew;
+	bool fSealed = true;
+	// Bytes of both sides.
+	size_t fSize = 0;
 };
 
 } // namespace BPrivate

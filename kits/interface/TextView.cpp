@@ -32,6 +32,14 @@ StartStyles(const BFont* font, const rgb_color* color)
 			color != NULL ? *color : ui_color(B_DOCUMENT_TEXT_COLOR)});
 }
 
+
+void
+AddEditingShortcut(BWindow* window, uint32 key, uint32 modifiers, uint32 what)
+{
+	if (!window->HasShortcut(key, modifiers))
+		window->AddShortcut(key, modifiers, new BMessage(what), NULL);
+}
+
 } // namespace
 
 BTextView::BTextView(BRect frame, const char* name, BRect textRect, uint32 resizeMask, uint32 flags)
@@ -240,9 +248,11 @@ BTextView::MakeFocus(bool focus)
 	SealUndo();
 	if (IsFocus() == had)
 		return;
-	// Windows know the other editing shortcuts; a program's own one takes this one's place.
-	if (focus && fEditable && !Window()->HasShortcut('z', B_COMMAND_KEY))
-		Window()->AddShortcut('z', B_COMMAND_KEY, new BMessage(B_UNDO), NULL);
+	// Windows know the other editing shortcuts; a program's own one takes their place.
+	if (focus && fEditable) {
+		AddEditingShortcut(Window(), 'z', B_COMMAND_KEY, B_UNDO);
+		AddEditingShortcut(Window(), 'z', B_COMMAND_KEY | B_SHIFT_KEY, B_REDO);
+	}
 	FocusChanged();
 }
 
@@ -574,6 +584,9 @@ BTextView::SetMaxBytes(int32 max)
 	const int32 anchor = fAnchor;
 	const int32 caret = fCaret;
 	Delete(end, TextLength());
+	// Taking it back would go beyond again.
+	if (fUndo != NULL)
+		fUndo->Forget();
 	fAnchor = std::min(anchor, end);
 	fCaret = std::min(caret, end);
 }

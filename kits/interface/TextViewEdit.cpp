@@ -80,7 +80,7 @@ BTextView::InsertAt(int32 offset, const char* text, int32 length, const text_run
 		fAnchor += grown;
 	SealUndo();
 	if (fUndo != NULL && grown > 0)
-		fUndo->Note(offset, "", NULL, fText.substr(offset, grown));
+		fUndo->Note({offset, "", NULL, fText.substr(offset, grown)});
 	SealUndo();
 	TextChanged();
 }
@@ -159,7 +159,7 @@ BTextView::Replace(int32 from, int32 to, const char* text, int32 length, const t
 	// A subclass may have inserted another text.
 	const int32 grown = std::max<int32>(TextLength() - before, 0);
 	if (fUndo != NULL)
-		fUndo->Note(from, removed, std::move(removedRuns), fText.substr(from, grown));
+		fUndo->Note({from, removed, std::move(removedRuns), fText.substr(from, grown)});
 	fCaret = from + grown;
 	fAnchor = fCaret;
 	TextChanged();
@@ -237,7 +237,7 @@ BTextView::Cut(BClipboard* clipboard)
 	if (!fEditable || IsTypingHidden())
 		return;
 	Copy(clipboard);
-	Delete();
+	Clear();
 }
 
 
@@ -296,7 +296,9 @@ void
 BTextView::Clear()
 {
 	Delete();
+	SealUndo();
 }
+	SealUndo();
 
 
 bool
@@ -337,16 +339,30 @@ BTextView::DoesUndo() const
 void
 BTextView::Undo(BClipboard*)
 {
-	if (!fEditable || fUndo == NULL || fUndo->IsEmpty())
+	if (fEditable && fUndo != NULL)
+		GoBack(fUndo->StartUndo(fText).get());
+}
+
+
+void
+BTextView::Redo()
+{
+	if (fEditable && fUndo != NULL)
+		GoBack(fUndo->StartRedo(fText).get());
+}
+
+
+/// Takes back a change that the history has begun to take back; null for none.
+void
+BTextView::GoBack(const BPrivate::TextChange* change)
+{
+	if (change == NULL)
 		return;
-	const int32 offset = fUndo->Offset();
-	const std::string text = fUndo->Removed();
-	const int32 inserted = static_cast<int32>(fUndo->Inserted().size());
-	const BPrivate::RunArray styles = fUndo->TakeStyles();
-	fUndo->Seal();
-	Replace(offset, std::min(offset + inserted, TextLength()), text.data(),
-		static_cast<int32>(text.size()), styles.get());
-	fUndo->Seal();
+	Replace(change->offset, change->offset + static_cast<int32>(change->inserted.size()),
+		change->removed.data(), static_cast<int32>(change->removed.size()), change->styles.get());
+	// What a subclass did with it may have set the history aside.
+	if (fUndo != NULL)
+		fUndo->End();
 	ScrollToSelection();
 }
 
@@ -394,6 +410,10 @@ BTextView::MessageReceived(BMessage* message)
 			break;
 
 		default:
+		case B_REDO:
+			Redo();
+			break;
+
 			BView::MessageReceived(message);
 			break;
 	}

@@ -30,6 +30,7 @@ struct text_run_array {
 namespace BPrivate {
 class TextInput;
 class TextLayout;
+struct TextChange;
 class TextStyles;
 class TextUndo;
 } // namespace BPrivate
@@ -173,7 +174,8 @@ public:
 	bool DoesAutoindent() const;
 	void SetDoesUndo(bool undo);
 	bool DoesUndo() const;
-	/// Takes back the last change, or the last taking back.
+	/// Takes back the last change that was not taken back yet. The messages B_UNDO and B_REDO (Command-Z and
+	/// Command-Shift-Z) go back and forth among the changes.
 	virtual void Undo(BClipboard* clipboard);
 
 protected:
@@ -196,6 +198,8 @@ private:
 	void TextChanged();
 	void SealUndo();
 	void ApplyRuns(int32 from, int32 to, const text_run_array* runs);
+	void Redo();
+	void GoBack(const BPrivate::TextChange* change);
 	void StylesChanged(int32 from, int32 to);
 
 	// Keys

@@ -240,10 +240,29 @@ TEST_F(TextViewStylesTest, UndoBringsTheStylesBack)
 	Do([this] { fView->Undo(NULL); });
 	EXPECT_EQ(TextOf(fView), "red green plain");
 	EXPECT_EQ(AskColours(), "rrr.ggggg......");
-	Do([this] { fView->Undo(NULL); });
+	fRobot->Key("command+shift+z");
 	EXPECT_EQ(AskColours(), "r...");
 	Do([this] { fView->Undo(NULL); });
 	EXPECT_EQ(AskColours(), "rrr.ggggg......");
+}
+
+
+TEST_F(TextViewStylesTest, RedoBringsTheStylesOfAPastedTextBack)
+{
+	Show();
+	Do([this] {
+		fView->MakeFocus();
+		fView->Select(0, 9);
+		fView->Copy(be_clipboard);
+		fView->Select(15, 15);
+		fView->Paste(be_clipboard);
+	});
+	const std::string pasted = AskColours();
+	Do([this] { fView->Undo(NULL); });
+	EXPECT_EQ(TextOf(fView), "red green plain");
+	fRobot->Key("command+shift+z");
+	EXPECT_EQ(TextOf(fView), "red green plainred green");
+	EXPECT_EQ(AskColours(), pasted);
 }
 
 

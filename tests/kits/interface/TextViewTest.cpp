@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Tests of BTextView: text, selection, lines, keys, mouse, clipboard and undo.
+// Tests of BTextView: text, selection, lines, keys, mouse, clipboard.
 #include <TextView.h>
 
 #include <cmath>
@@ -405,32 +405,6 @@ TEST_F(TextViewTest, DisallowedCharactersAreRefused)
 	Do([this] { fView->AllowChar('x'); });
 	fRobot->Type("x");
 	EXPECT_EQ(Text(), "ax");
-}
-
-
-TEST_F(TextViewTest, UndoTakesBackTypingAndItself)
-{
-	Edit("one", 3, 3);
-	fRobot->Type(" two");
-	fRobot->Key("command+z");
-	EXPECT_EQ(Text(), "one");
-	fRobot->Key("command+z");
-	EXPECT_EQ(Text(), "one two");
-}
-
-
-TEST_F(TextViewTest, UndoBringsBackWhatWasDeleted)
-{
-	Edit("one two", 0, 4);
-	fRobot->Key("delete");
-	EXPECT_EQ(Text(), "two");
-	fRobot->Key("command+z");
-	EXPECT_EQ(Text(), "one two");
-	Do([this] { fView->SetDoesUndo(false); });
-	fRobot->Key("backspace");
-	const std::string left = Text();
-	fRobot->Key("command+z");
-	EXPECT_EQ(Text(), left);
 }
 
 
