@@ -11,7 +11,7 @@
 #include <Cursor.h>
 #include <File.h>
 #include <Message.h>
-#include <ScrollBar.h>
+#include <MessageRunner.h>
 #include <ScrollView.h>
 #include <Window.h>
 
@@ -208,7 +208,7 @@ BTextView::AttachedToWindow()
 void
 BTextView::DetachedFromWindow()
 {
-	fSelecting = false;
+	StopSelecting();
 	BView::DetachedFromWindow();
 }
 
@@ -709,31 +709,6 @@ BTextView::Relayout()
 	fLayout->SetTo(fWordWrap ? std::max(fTextRect.Width(), 1.0f) : 0, fTabWidth);
 	FixScrollBars();
 	InvalidateText();
-}
-
-
-// What lies around the text at the top and at the left is there at the other ends, too.
-void
-BTextView::FixScrollBars()
-{
-	const auto fit = [](BScrollBar* bar, float content, float seen, float step) {
-		seen = std::max(seen, 0.0f);
-		bar->SetRange(0, std::max(std::ceil(content) - 1 - seen, 0.0f));
-		bar->SetProportion(content > 0 ? (seen + 1) / content : 1);
-		bar->SetSteps(step, std::max(seen - step, step));
-	};
-	const BRect bounds = Bounds();
-	const float line = fLayout->LineHeight(0);
-	if (ScrollBar(B_VERTICAL) != NULL) {
-		fit(ScrollBar(B_VERTICAL), fLayout->Height() + 2 * std::max(fTextRect.top, 0.0f),
-			bounds.Height(), line);
-	}
-	if (ScrollBar(B_HORIZONTAL) != NULL) {
-		// A wrapped text is as wide as its rectangle. The caret needs a pixel behind the text.
-		const float width = fWordWrap ? fTextRect.Width() : fLayout->Width() + 1;
-		fit(ScrollBar(B_HORIZONTAL), width + 1 + 2 * std::max(fTextRect.left, 0.0f), bounds.Width(),
-			line);
-	}
 }
 
 

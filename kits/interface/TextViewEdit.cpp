@@ -13,6 +13,7 @@
 #include <Window.h>
 
 #include "TextLayout.h"
+#include "TextScroll.h"
 #include "TextStyles.h"
 #include "TextUndo.h"
 
@@ -295,10 +296,10 @@ BTextView::Paste(BClipboard* clipboard)
 void
 BTextView::Clear()
 {
+	SealUndo();
 	Delete();
 	SealUndo();
 }
-	SealUndo();
 
 
 bool
@@ -409,11 +410,15 @@ BTextView::MessageReceived(BMessage* message)
 			Undo(be_clipboard);
 			break;
 
-		default:
 		case B_REDO:
 			Redo();
 			break;
 
+		case BPrivate::kMsgScrollOn:
+			ScrollOn();
+			break;
+
+		default:
 			BView::MessageReceived(message);
 			break;
 	}
@@ -425,45 +430,4 @@ BTextView::SealUndo()
 {
 	if (fUndo != NULL)
 		fUndo->Seal();
-}
-
-
-void
-BTextView::ScrollToOffset(int32 offset)
-{
-	if (Window() == NULL)
-		return;
-	float height;
-	BPoint top = PointAt(offset, &height);
-	// With the first line, and at the left edge, the margin is shown, too.
-	if (top.x <= fTextRect.left)
-		top.x = 0;
-	if (top.y <= fTextRect.top)
-		top.y = 0;
-	const BRect bounds = Bounds();
-	BPoint where = bounds.LeftTop();
-	// Without word wrap a caret at the right edge brings some of what follows with it.
-	const float ahead = std::min(bounds.Width() / 4, 30.0f);
-	if (top.x < bounds.left)
-		where.x = std::max(top.x - ahead, 0.0f);
-	else if (top.x > bounds.right - 1)
-		where.x = top.x - bounds.Width() + ahead;
-	if (top.y < bounds.top)
-		where.y = std::max(top.y, 0.0f);
-	else if (top.y + height > bounds.bottom + 1 && height <= bounds.Height())
-		where.y = top.y + height - bounds.Height();
-	// A single line leaves no empty space behind its end that its beginning could have.
-	if (CountLines() == 1) {
-		const float end = PointAt(TextLength()).x + std::max(fTextRect.left, 0.0f) + 1;
-		where.x = std::clamp(where.x, 0.0f, std::max(std::ceil(end - bounds.Width()), 0.0f));
-	}
-	if (where != bounds.LeftTop())
-		ScrollTo(where);
-}
-
-
-void
-BTextView::ScrollToSelection()
-{
-	ScrollToOffset(fCaret);
 }

@@ -137,48 +137,6 @@ BTextView::MoveByKey(char key, bool extend, bool byWord)
 }
 
 
-/// Text that is only read moves instead of a caret that nobody sees; false for any other key.
-bool
-BTextView::ScrollByKey(char key)
-{
-	const BRect bounds = Bounds();
-	const float line = fLayout->LineHeight(0);
-	const float page = std::max(bounds.Height() - line, line);
-	float by;
-	switch (key) {
-		case B_UP_ARROW:
-			by = -line;
-			break;
-
-		case B_DOWN_ARROW:
-			by = line;
-			break;
-
-		case B_PAGE_UP:
-			by = -page;
-			break;
-
-		case B_PAGE_DOWN:
-			by = page;
-			break;
-
-		case B_HOME:
-			by = -bounds.top;
-			break;
-
-		case B_END:
-			by = fLayout->Height();
-			break;
-
-		default:
-			return false;
-	}
-	const float lowest = fTextRect.top + fLayout->Height() - bounds.Height();
-	ScrollTo(BPoint(bounds.left, std::clamp(bounds.top + by, 0.0f, std::max(lowest, 0.0f))));
-	return true;
-}
-
-
 void
 BTextView::MoveCaret(int32 offset, bool extend)
 {
@@ -295,7 +253,7 @@ BTextView::MouseDown(BPoint where)
 void
 BTextView::MouseUp(BPoint)
 {
-	fSelecting = false;
+	StopSelecting();
 }
 
 
@@ -303,8 +261,6 @@ void
 BTextView::MouseMoved(BPoint where, uint32 code, const BMessage* dragMessage)
 {
 	BView::MouseMoved(where, code, dragMessage);
-	if (!fSelecting)
-		return;
-	MoveCaret(OffsetAt(where), true);
-	ScrollToSelection();
+	if (fSelecting)
+		SelectTo(where);
 }

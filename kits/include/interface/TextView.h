@@ -12,6 +12,7 @@
 
 class BClipboard;
 class BFile;
+class BMessageRunner;
 class BScrollView;
 
 /// One style from an offset on.
@@ -29,8 +30,8 @@ struct text_run_array {
 
 namespace BPrivate {
 class TextInput;
-class TextLayout;
 struct TextChange;
+class TextLayout;
 class TextStyles;
 class TextUndo;
 } // namespace BPrivate
@@ -197,9 +198,9 @@ private:
 	bool IsAllowed(const char* text, int32 length, int32 replaced);
 	void TextChanged();
 	void SealUndo();
-	void ApplyRuns(int32 from, int32 to, const text_run_array* runs);
 	void Redo();
 	void GoBack(const BPrivate::TextChange* change);
+	void ApplyRuns(int32 from, int32 to, const text_run_array* runs);
 	void StylesChanged(int32 from, int32 to);
 
 	// Keys
@@ -213,11 +214,18 @@ private:
 	int32 NextOffset(int32 offset) const;
 	int32 PreviousOffset(int32 offset) const;
 
+	// Mouse
+	void SelectTo(BPoint where);
+	void ScrollOn();
+	void StopSelecting();
+
 	// Picture
 	void Relayout();
 	void InvalidateText();
 	void DrawLine(int32 line, BRect updateRect);
 	bool ShowsCaret() const;
+	BSize ContentSize() const;
+	BPoint LastPlace() const;
 	void FixScrollBars();
 	void FocusChanged();
 
@@ -227,6 +235,8 @@ private:
 	std::unique_ptr<text_run> fNextStyle;
 	std::unique_ptr<BPrivate::TextLayout> fLayout;
 	std::unique_ptr<BPrivate::TextUndo> fUndo;
+	// While the pointer is beyond the edge in selecting.
+	std::unique_ptr<BMessageRunner> fScrollOn;
 	std::set<uint32> fDisallowed;
 	BRect fTextRect;
 	BScrollView* fScrollView;
