@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <cmath>
 #include <cstring>
+#include <limits>
 #include <unordered_map>
 
 #include "TextStyles.h"
@@ -339,10 +340,20 @@ TextLayout::LinePieces(int32 line) const
 }
 
 
-// Goes from a piece to the next of its line; from one without length to the first. At the end the piece is an
-// empty one behind all, and the answer is false.
 bool
 TextLayout::NextPiece(int32 end, Piece* piece) const
+{
+	if (!FindPiece(end, piece))
+		return false;
+	piece->width = WidthWithin(*piece, piece->length);
+	return true;
+}
+
+
+// Goes from a piece to the next of its line, which is not measured yet; from one without length to the first. At the
+// end the piece is an empty one behind all, and the answer is false.
+bool
+TextLayout::FindPiece(int32 end, Piece* piece) const
 {
 	piece->x += piece->width;
 	piece->offset += piece->length;
@@ -372,7 +383,6 @@ TextLayout::NextPiece(int32 end, Piece* piece) const
 			limit = GoodCut(start, limit);
 		piece->length = limit - start;
 	}
-	piece->width = WidthWithin(*piece, piece->length);
 	return true;
 }
 
@@ -381,10 +391,10 @@ TextLayout::NextPiece(int32 end, Piece* piece) const
 int32
 TextLayout::GoodCut(int32 start, int32 limit) const
 {
-	for (int32 cut = limit; cut > start; cut--) {
-		if (fText[cut - 1] == ' ')
-			return cut;
-	}
+	const char* text = fText.data();
+	const void* blank = memrchr(text + start, ' ', static_cast<size_t>(limit - start));
+	if (blank != nullptr)
+		return static_cast<int32>(static_cast<const char*>(blank) - text) + 1;
 	for (int32 cut = limit; cut > limit - 4; cut--) {
 		if (!IsContinuation(fText[cut]))
 			return cut;
@@ -410,35 +420,41 @@ TextLayout::WidthWithin(const Piece& piece, int32 length) const
 float
 TextLayout::WidthOf(const TextStyle& style, int32 offset, int32 length) const
 {
-	double sum = 0;
-	int32 size;
-	for (int32 i = offset; i < offset + length; i += size) {
-		size = CharacterLength(fText, i);
-		const float* width = CharacterWidth(style, i, size);
-		if (width == nullptr)
-			return style.font.StringWidth(fText.data() + offset, length);
-		sum += static_cast<double>(*width);
-	}
-	return static_cast<float>(sum);
+	const Sum sum =
+		AddWidths(style, offset, offset + length, std::numeric_limits<float>::infinity());
+	return sum.isKnown ? sum.width : style.font.StringWidth(fText.data() + offset, length);
 }
 
 
-// Asking the font takes long. It sets letters side by side, so that their widths can be added. Null for a
-// character of which that is not known.
-const float*
-TextLayout::CharacterWidth(const TextStyle& style, int32 offset, int32 length) const
+// Asking the font takes long. It sets letters side by side, so that their widths can be added: up to the first
+// that goes beyond the limit, or whose width alone says nothing.
+TextLayout::Sum
+TextLayout::AddWidths(const TextStyle& style, int32 offset, int32 end, float limit) const
 {
-	const uint32 code = fHidden ? 0 : SimpleCharacter(fText, offset, length);
-	if (code == 0 && !fHidden)
-		return nullptr;
 	CharacterWidths& widths = WidthsOf(style.font);
-	float& width =
-		code < 128 ? widths.ascii[code] : widths.others.try_emplace(code, -1.0f).first->second;
-	if (width < 0) {
-		width = fHidden ? style.font.StringWidth(kDot)
-						: style.font.StringWidth(fText.data() + offset, length);
+	const char* text = fText.data();
+	double sum = 0;
+	while (offset < end) {
+		const bool isAscii = text[offset] >= 0x20 && text[offset] < 0x7f;
+		const int32 length = isAscii ? 1 : CharacterLength(fText, offset);
+		const uint32 code = fHidden ? 0
+			: isAscii               ? static_cast<uint32>(text[offset])
+									: SimpleCharacter(fText, offset, length);
+		if (code == 0 && !fHidden)
+			return {offset, static_cast<float>(sum), false};
+		float& width =
+			code < 128 ? widths.ascii[code] : widths.others.try_emplace(code, -1.0f).first->second;
+		if (width < 0) {
+			width = fHidden ? style.font.StringWidth(kDot)
+							: style.font.StringWidth(text + offset, length);
+		}
+		const double wider = sum + static_cast<double>(width);
+		if (static_cast<float>(wider) > limit)
+			break;
+		sum = wider;
+		offset += length;
 	}
-	return &width;
+	return {offset, static_cast<float>(sum), true};
 }
 
 
@@ -456,41 +472,38 @@ TextLayout::WidthsOf(const BFont& font) const
 }
 
 
-// The offset of the first character of a piece that does not end within \a width of its start.
+// The offset of the first character of a piece that does not end within \a room of its start; the piece's end, and
+// how wide it is, when all do.
 int32
-TextLayout::FittingPart(const Piece& piece, float width) const
+TextLayout::FittingPart(const Piece& piece, float room, float* _width) const
 {
-	if (piece.style == nullptr) {
-		const float more = width - WidthWithin(piece, 1);
-		const float tabs = more < 0 ? 0 : std::floor(more / fTabWidth) + 1;
-		return piece.offset + static_cast<int32>(std::min(tabs, static_cast<float>(piece.length)));
-	}
-	// Most text can be added up.
 	const int32 end = piece.offset + piece.length;
-	double sum = 0;
-	int32 place = piece.offset;
-	while (place < end) {
-		const int32 size = CharacterLength(fText, place);
-		const float* known = CharacterWidth(*piece.style, place, size);
-		if (known == nullptr)
-			break;
-		sum += static_cast<double>(*known);
-		if (static_cast<float>(sum) > width)
-			return place;
-		place += size;
+	int32 fitting = end;
+	if (piece.style == nullptr) {
+		const float more = room - WidthWithin(piece, 1);
+		const float tabs = more < 0 ? 0 : std::floor(more / fTabWidth) + 1;
+		fitting =
+			piece.offset + static_cast<int32>(std::min(tabs, static_cast<float>(piece.length)));
+	} else {
+		// Most text can be added up.
+		const Sum sum = AddWidths(*piece.style, piece.offset, end, room);
+		if (sum.isKnown) {
+			*_width = sum.width;
+			return sum.end;
+		}
+		std::vector<int32> ends;
+		for (int32 i = piece.offset; i < end;) {
+			i += CharacterLength(fText, i);
+			ends.push_back(i);
+		}
+		const auto over = std::partition_point(ends.begin(), ends.end(), [&](int32 place) {
+			return WidthOf(*piece.style, piece.offset, place - piece.offset) <= room;
+		});
+		fitting = over == ends.begin() ? piece.offset : *(over - 1);
 	}
-	if (place >= end)
-		return end;
-
-	std::vector<int32> ends;
-	for (int32 i = piece.offset; i < piece.offset + piece.length;) {
-		i += CharacterLength(fText, i);
-		ends.push_back(i);
-	}
-	const auto over = std::partition_point(ends.begin(), ends.end(), [&](int32 end) {
-		return WidthOf(*piece.style, piece.offset, end - piece.offset) <= width;
-	});
-	return over == ends.begin() ? piece.offset : *(over - 1);
+	if (fitting == end)
+		*_width = WidthWithin(piece, piece.length);
+	return fitting;
 }
 
 
@@ -532,7 +545,8 @@ TextLayout::OffsetAt(int32 line, float x) const
 
 	// The last character that begins at x or before.
 	const Piece& piece = *(next - 1);
-	const int32 low = FittingPart(piece, x - piece.x);
+	float width;
+	const int32 low = FittingPart(piece, x - piece.x, &width);
 	if (low >= last)
 		return last;
 	const int32 following = low + CharacterLength(fText, low);
@@ -546,18 +560,15 @@ TextLayout::BreakLine(int32 start, int32 end) const
 {
 	Piece piece = {start, 0, 0, 0, nullptr};
 	int32 over = start;
-	while (true) {
-		if (!NextPiece(end, &piece))
+	do {
+		if (!FindPiece(end, &piece))
 			return end;
-		if (piece.x + piece.width > fWidth + kTolerance) {
-			over = FittingPart(piece, fWidth + kTolerance - piece.x);
-			break;
-		}
-	}
+		over = FittingPart(piece, fWidth + kTolerance - piece.x, &piece.width);
+	} while (over == piece.offset + piece.length);
 
 	// Blanks at the end of a line may stick out.
-	const auto isBlank = [this](
-							 int32 place) { return fText[place] == ' ' || fText[place] == '\t'; };
+	const char* text = fText.data();
+	const auto isBlank = [text](int32 place) { return text[place] == ' ' || text[place] == '\t'; };
 	int32 next = over;
 	while (next < end && isBlank(next))
 		next++;

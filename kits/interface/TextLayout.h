@@ -92,13 +92,21 @@ private:
 		double top;
 	};
 
+	// Characters up to \a end, and how wide they are together; unless the width is known only with what follows.
+	struct Sum {
+		int32 end;
+		float width;
+		bool isKnown;
+	};
+
 	bool NextPiece(int32 end, Piece* piece) const;
+	bool FindPiece(int32 end, Piece* piece) const;
 	int32 GoodCut(int32 start, int32 limit) const;
 	float WidthWithin(const Piece& piece, int32 length) const;
 	float WidthOf(const TextStyle& style, int32 offset, int32 length) const;
-	const float* CharacterWidth(const TextStyle& style, int32 offset, int32 length) const;
+	Sum AddWidths(const TextStyle& style, int32 offset, int32 end, float limit) const;
 	CharacterWidths& WidthsOf(const BFont& font) const;
-	int32 FittingPart(const Piece& piece, float width) const;
+	int32 FittingPart(const Piece& piece, float room, float* _width) const;
 	int32 BreakLine(int32 start, int32 end) const;
 	template <typename IsKnown>
 	void AddLines(int32 start, std::vector<Line>* lines, const IsKnown& isKnown) const;
