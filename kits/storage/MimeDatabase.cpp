@@ -205,21 +205,43 @@ MimeDatabase::Guess(std::string_view content, const std::string& name)
 void
 MimeDatabase::Refresh()
 {
-	std::vector<std::string> paths;
-	std::string signature;
-	for (const std::string& directory : xdg_data_directories()) {
-		paths.push_back(directory + kPackages);
-		signature += Signature(paths.back());
+	const std::vector<std::string> directories = xdg_data_directories();
+	bool isChanged = directories.size() != fFolders.size();
+	fFolders.resize(directories.size());
+	for (size_t i = 0; i < directories.size(); i++)
+		isChanged = RefreshFolder(directories[i] + kPackages, &fFolders[i]) || isChanged;
+	if (isChanged)
+		CollectRules();
+}
+
+
+bool
+MimeDatabase::RefreshFolder(const std::string& path, folder* folder)
+{
+	std::string signature = Signature(path);
+	if (signature == folder->signature)
+		return false;
+
+	folder->signature = std::move(signature);
+	folder->types.clear();
+	for (const std::string& name : PackageFiles(path)) {
+		std::string document;
+		if (read_whole_file(path + "/" + name, kMaxPackageSize, &document) != B_OK)
+			continue;
+		std::vector<mime_description> types;
+		// What stands before the damage of a damaged package is as good as ever.
+		read_mime_package(document, &types);
+		for (mime_description& type : types)
+			Merge(std::move(type), &folder->types);
 	}
-	if (signature == fSignature)
-		return;
+	return true;
+}
 
-	fSignature = signature;
-	fFolders.clear();
+
+void
+MimeDatabase::CollectRules()
+{
 	fRules.clear();
-	for (const std::string& path : paths)
-		ReadFolder(path);
-
 	for (size_t i = 0; i < fFolders.size(); i++) {
 		for (const auto& [key, type] : fFolders[i].types) {
 			const auto isReplaced = [&key = key](const folder& other) {
@@ -236,25 +258,6 @@ MimeDatabase::Refresh()
 		return a.magic->priority != b.magic->priority ? a.magic->priority > b.magic->priority
 													  : a.folder < b.folder;
 	});
-}
-
-
-void
-MimeDatabase::ReadFolder(const std::string& path)
-{
-	folder folder;
-	folder.path = path;
-	for (const std::string& name : PackageFiles(path)) {
-		std::string document;
-		if (read_whole_file(path + "/" + name, kMaxPackageSize, &document) != B_OK)
-			continue;
-		std::vector<mime_description> types;
-		// What stands before the damage of a damaged package is as good as ever.
-		read_mime_package(document, &types);
-		for (mime_description& type : types)
-			Merge(std::move(type), &folder.types);
-	}
-	fFolders.push_back(std::move(folder));
 }
 
 

@@ -45,18 +45,20 @@ private:
 		const mime_magic* magic;
 	};
 	struct folder {
-		std::string path;
+		// Tells the state in which the packages were read, and names the folder.
+		std::string signature;
 		std::map<std::string, mime_description> types;
 	};
 
 	void Refresh();
-	void ReadFolder(const std::string& path);
+	/// Reads the folder's packages when they are not as they were; whether they were read.
+	bool RefreshFolder(const std::string& path, folder* folder);
+	void CollectRules();
 	void Merge(mime_description type, std::map<std::string, mime_description>* types);
 	std::string GuessByContent(std::string_view content, int32 lowest, int32 highest) const;
 	std::string GuessByName(const std::string& name) const;
 
 	std::mutex fLock;
-	std::string fSignature;
 	std::vector<folder> fFolders;
 	// By falling priority, then by precedence.
 	std::vector<rule> fRules;

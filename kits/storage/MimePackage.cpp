@@ -88,16 +88,16 @@ mime_match
 ReadMatch(const XmlReader& reader)
 {
 	mime_match match;
-	const std::string* kind = reader.Attribute("type");
-	const std::string* value = reader.Attribute("value");
-	const std::string* offset = reader.Attribute("offset");
-	const std::string* mask = reader.Attribute("mask");
-	if (kind == nullptr || value == nullptr || offset == nullptr)
+	const std::optional<std::string> kind = reader.Attribute("type");
+	const std::optional<std::string> value = reader.Attribute("value");
+	const std::optional<std::string> offset = reader.Attribute("offset");
+	const std::optional<std::string> mask = reader.Attribute("mask");
+	if (!kind.has_value() || !value.has_value() || !offset.has_value())
 		return match;
 
 	const bool isString = *kind == "string";
 	match.value = isString ? UnescapeBytes(*value) : NumberBytes(*kind, *value);
-	if (mask != nullptr)
+	if (mask.has_value())
 		match.mask = isString ? HexBytes(*mask) : NumberBytes(*kind, *mask);
 	if (!match.mask.empty() && match.mask.size() != match.value.size())
 		match.value.clear();
@@ -141,10 +141,10 @@ public:
 private:
 	bool ReadType()
 	{
-		const std::string element = fReader.Name();
+		const std::string_view element = fReader.Name();
 		mime_description type;
-		const std::string* name = fReader.Attribute("type");
-		if (name != nullptr)
+		const std::optional<std::string> name = fReader.Attribute("type");
+		if (name.has_value())
 			type.type = *name;
 
 		while (true) {
@@ -169,8 +169,8 @@ private:
 
 	bool ReadElement(mime_description* type)
 	{
-		const std::string& element = fReader.Name();
-		if (element == "comment" && fReader.Attribute("xml:lang") == nullptr)
+		const std::string_view element = fReader.Name();
+		if (element == "comment" && !fReader.HasAttribute("xml:lang"))
 			return ReadText(&type->comment);
 		if (element == "be:long-description")
 			return ReadText(&type->longDescription);
@@ -206,24 +206,24 @@ private:
 
 	void ReadGlob(mime_description* type)
 	{
-		const std::string* pattern = fReader.Attribute("pattern");
-		if (pattern == nullptr || pattern->empty())
+		const std::optional<std::string> pattern = fReader.Attribute("pattern");
+		if (!pattern.has_value() || pattern->empty())
 			return;
 		mime_glob glob;
 		glob.pattern = *pattern;
-		const std::string* weight = fReader.Attribute("weight");
-		if (weight != nullptr)
+		const std::optional<std::string> weight = fReader.Attribute("weight");
+		if (weight.has_value())
 			glob.weight = atoi(weight->c_str());
-		const std::string* isCaseSensitive = fReader.Attribute("case-sensitive");
-		glob.isCaseSensitive = isCaseSensitive != nullptr && *isCaseSensitive == "true";
+		const std::optional<std::string> isCaseSensitive = fReader.Attribute("case-sensitive");
+		glob.isCaseSensitive = isCaseSensitive.has_value() && *isCaseSensitive == "true";
 		type->globs.push_back(glob);
 	}
 
 	bool ReadMagic(mime_description* type)
 	{
 		mime_magic magic;
-		const std::string* priority = fReader.Attribute("priority");
-		if (priority != nullptr)
+		const std::optional<std::string> priority = fReader.Attribute("priority");
+		if (priority.has_value())
 			magic.priority = atoi(priority->c_str());
 		if (!ReadMatches(&magic.matches, "magic", 0))
 			return false;

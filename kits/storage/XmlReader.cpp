@@ -3,6 +3,8 @@
 
 #include "storage/XmlReader.h"
 
+#include <algorithm>
+
 #include <stdlib.h>
 #include <string.h>
 
@@ -60,16 +62,15 @@ std::string
 Unescape(std::string_view raw)
 {
 	std::string text;
-	for (size_t i = 0; i < raw.size(); i++) {
-		const size_t end = raw[i] == '&' ? raw.find(';', i) : std::string_view::npos;
-		if (end == std::string_view::npos) {
-			text += raw[i];
-			continue;
-		}
-		AppendReference(std::string(raw.substr(i + 1, end - i - 1)), &text);
-		i = end;
+	while (true) {
+		const size_t start = raw.find('&');
+		const size_t end = start == std::string_view::npos ? start : raw.find(';', start);
+		if (end == std::string_view::npos)
+			return text.append(raw);
+		text.append(raw.substr(0, start));
+		AppendReference(std::string(raw.substr(start + 1, end - start - 1)), &text);
+		raw.remove_prefix(end + 1);
 	}
-	return text;
 }
 
 } // namespace
@@ -77,6 +78,7 @@ Unescape(std::string_view raw)
 
 XmlReader::XmlReader(std::string_view document)
 	: fRest(document),
+	  fIsCharacterData(false),
 	  fClosesItself(false)
 {
 }
@@ -92,7 +94,8 @@ XmlReader::Next()
 	while (!fRest.empty()) {
 		if (fRest[0] != '<') {
 			const size_t length = fRest.find('<');
-			fText = Unescape(fRest.substr(0, length));
+			fText = fRest.substr(0, length);
+			fIsCharacterData = false;
 			fRest.remove_prefix(length == std::string_view::npos ? fRest.size() : length);
 			return kText;
 		}
@@ -104,6 +107,7 @@ XmlReader::Next()
 			if (end == std::string_view::npos)
 				return kDamaged;
 			fText = fRest.substr(9, end - 9);
+			fIsCharacterData = true;
 			fRest.remove_prefix(end + 3);
 			return kText;
 		} else if (fRest.starts_with("<?")) {
@@ -120,11 +124,18 @@ XmlReader::Next()
 }
 
 
-const std::string*
-XmlReader::Attribute(const char* name) const
+std::string
+XmlReader::Text() const
 {
-	const auto found = fAttributes.find(name);
-	return found == fAttributes.end() ? nullptr : &found->second;
+	return fIsCharacterData ? std::string(fText) : Unescape(fText);
+}
+
+
+std::optional<std::string>
+XmlReader::Attribute(std::string_view name) const
+{
+	const std::string_view* value = FindAttribute(name);
+	return value == nullptr ? std::nullopt : std::optional(Unescape(*value));
 }
 
 
@@ -179,11 +190,10 @@ XmlReader::SkipBlanks()
 }
 
 
-std::string
+std::string_view
 XmlReader::ReadName()
 {
-	const size_t length = fRest.find_first_of(" \t\r\n=/><\"'");
-	const std::string name(fRest.substr(0, length));
+	const std::string_view name = fRest.substr(0, fRest.find_first_of(" \t\r\n=/><\"'"));
 	fRest.remove_prefix(name.size());
 	return name;
 }
@@ -195,7 +205,7 @@ XmlReader::ReadAttributes()
 	fAttributes.clear();
 	SkipBlanks();
 	while (!fRest.empty() && fRest[0] != '>' && fRest[0] != '/') {
-		const std::string name = ReadName();
+		const std::string_view name = ReadName();
 		SkipBlanks();
 		if (name.empty() || !fRest.starts_with("="))
 			return false;
@@ -206,11 +216,21 @@ XmlReader::ReadAttributes()
 		const size_t end = fRest.find(fRest[0], 1);
 		if (end == std::string_view::npos)
 			return false;
-		fAttributes[name] = Unescape(fRest.substr(1, end - 1));
+		fAttributes.emplace_back(name, fRest.substr(1, end - 1));
 		fRest.remove_prefix(end + 1);
 		SkipBlanks();
 	}
 	return !fRest.empty();
+}
+
+
+const std::string_view*
+XmlReader::FindAttribute(std::string_view name) const
+{
+	// The last one counts.
+	const auto found = std::find_if(fAttributes.rbegin(), fAttributes.rend(),
+		[name](const auto& attribute) { return attribute.first == name; });
+	return found == fAttributes.rend() ? nullptr : &found->second;
 }
 
 

@@ -4,9 +4,11 @@
 #ifndef _XML_READER_H
 #define _XML_READER_H
 
-#include <map>
+#include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
+#include <vector>
 
 namespace BPrivate {
 
@@ -22,24 +24,28 @@ public:
 	event Next();
 
 	/// Of a start or end tag.
-	const std::string& Name() const { return fName; }
+	std::string_view Name() const { return fName; }
 	/// Of a text, references resolved.
-	const std::string& Text() const { return fText; }
-	/// Of a start tag; null when absent.
-	const std::string* Attribute(const char* name) const;
+	std::string Text() const;
+	/// Of a start tag, references resolved; none when absent.
+	std::optional<std::string> Attribute(std::string_view name) const;
+	bool HasAttribute(std::string_view name) const { return FindAttribute(name) != nullptr; }
 
 private:
 	event ReadTag();
 	bool SkipPast(const char* end);
 	bool SkipDocumentType();
 	void SkipBlanks();
-	std::string ReadName();
+	std::string_view ReadName();
 	bool ReadAttributes();
+	const std::string_view* FindAttribute(std::string_view name) const;
 
+	// Parts of the document as they stand there: most of them nobody asks for.
 	std::string_view fRest;
-	std::string fName;
-	std::string fText;
-	std::map<std::string, std::string> fAttributes;
+	std::string_view fName;
+	std::string_view fText;
+	std::vector<std::pair<std::string_view, std::string_view>> fAttributes;
+	bool fIsCharacterData;
 	bool fClosesItself;
 };
 
