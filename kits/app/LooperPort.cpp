@@ -52,6 +52,7 @@ LooperPort::LooperPort(port_id id, BLooper* looper, BWindow* window)
 	  fKind(window != nullptr ? kWindowLooper : kPlainLooper),
 	  fThread(kNobody),
 	  fRunning(false),
+	  fUserWaits(0),
 	  fClosed(false),
 	  fMovedByOthers(false),
 	  fOwner(kNobody),

@@ -45,6 +45,9 @@ public:
 	/// Whether the loop has been started.
 	bool IsRunning() const { return fRunning; }
 	void SetRunning() { fRunning = true; }
+	/// How many waits for the user the looper's thread is in.
+	int32 CountUserWaits() const { return fUserWaits; }
+	void ChangeUserWaits(int32 difference) { fUserWaits += difference; }
 
 	/// B_OK; B_BAD_VALUE when the looper is gone or goes meanwhile; B_TIMED_OUT, B_WOULD_BLOCK.
 	status_t Lock(bigtime_t timeout);
@@ -90,6 +93,7 @@ private:
 	std::atomic<looper_kind> fKind;
 	std::atomic<thread_id> fThread;
 	std::atomic<bool> fRunning;
+	std::atomic<int32> fUserWaits;
 
 	mutable std::mutex fMutex;
 	std::condition_variable fArrived;

@@ -47,6 +47,28 @@ LooperAccess::LoopersOfKind(looper_kind kind, bigtime_t timeout)
 }
 
 
+void
+LooperAccess::BeginUserWait(BLooper* looper)
+{
+	looper->fPort->ChangeUserWaits(1);
+}
+
+
+void
+LooperAccess::EndUserWait(BLooper* looper)
+{
+	looper->fPort->ChangeUserWaits(-1);
+}
+
+
+bool
+LooperAccess::IsInUserWait(const BLooper* looper)
+{
+	const std::shared_ptr<LooperPort> port = Registry::Default().PortFor(looper);
+	return port != nullptr && port->CountUserWaits() > 0;
+}
+
+
 int32
 LooperAccess::UnlockFully(BLooper* looper)
 {

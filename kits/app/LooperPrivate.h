@@ -50,6 +50,13 @@ struct LooperAccess {
 	static BHandler* HandlerFor(const BLooper* looper, int32 token);
 	/// Whether Run() or Loop() was called.
 	static bool IsRunning(const BLooper* looper);
+
+	/// The looper's thread waits for what the user does elsewhere and answers no messages, or no longer. Called by
+	/// that thread; calls nest.
+	static void BeginUserWait(BLooper* looper);
+	static void EndUserWait(BLooper* looper);
+	/// Any thread; \a looper may be gone.
+	static bool IsInUserWait(const BLooper* looper);
 };
 
 

@@ -2,6 +2,7 @@
 // The robot's hands: pointer and keys, and waiting for the windows.
 #include "display/Robot.h"
 
+#include <algorithm>
 #include <cmath>
 #include <cstring>
 #include <string>
@@ -21,11 +22,15 @@ namespace {
 
 const uint32 kMsgPing = '_rPg';
 // While a button is held the window's thread may sit in a loop that asks for the pointer now and then
-// and answers nothing: it gets the time for one more look.
+// and answers nothing: it gets the time for one more look. Those that answer are not kept waiting.
 const bigtime_t kLookTime = 60000;
 const bigtime_t kStepTime = 15000;
 // How long a window may take for what it is doing before it counts as busy.
 const bigtime_t kBusyTime = 700000;
+const bigtime_t kWaitStep = 20000;
+// What a message caused, another message or drawing, is in the queue behind it: the second round finds
+// it done, the third what that caused in turn.
+const int kRounds = 3;
 
 struct Modifier {
 	const char* name;
@@ -65,7 +70,7 @@ Robot::MoveTo(BPoint where)
 	if (fButtons == 0)
 		Settle();
 	else
-		Pause(kStepTime);
+		Look(kStepTime);
 }
 
 
@@ -74,14 +79,14 @@ Robot::Press(uint32 button)
 {
 	fButtons |= button;
 	Display::Get().InjectPointer(fWhere, fButtons);
-	Pause(kLookTime);
+	Look(kLookTime);
 }
 
 
 void
 Robot::Release()
 {
-	Pause(kLookTime);
+	Look(kLookTime);
 	fButtons = 0;
 	Display::Get().InjectPointer(fWhere, 0);
 	Settle();
@@ -96,7 +101,7 @@ Robot::Click(BPoint where, int32 count, uint32 button)
 		fButtons |= button;
 		Display::Get().InjectPointer(fWhere, fButtons);
 		// A double click must stay one, so only the last release waits for the windows.
-		Pause(kLookTime);
+		Look(kLookTime);
 		fButtons = 0;
 		Display::Get().InjectPointer(fWhere, 0);
 	}
@@ -198,49 +203,82 @@ Robot::Key(const char* key)
 
 
 bool
-Robot::Ping(const BMessenger& target, bigtime_t limit)
+Robot::Ping(const BLooper* looper, const BMessenger& target, bigtime_t limit)
 {
-	BMessage ping(kMsgPing);
-	BMessage reply;
-	status_t status = target.SendMessage(&ping, &reply, limit, limit);
-	// A window that has gone meanwhile has nothing left to do.
-	return status != B_TIMED_OUT && status != B_WOULD_BLOCK;
+	// An open menu or an alert may begin meanwhile, so the wait goes on step by step.
+	const bigtime_t end = system_time() + limit;
+	do {
+		if (LooperAccess::IsInUserWait(looper))
+			return true;
+		BMessage ping(kMsgPing);
+		BMessage reply;
+		const bigtime_t step = std::min(limit, kWaitStep);
+		status_t status = target.SendMessage(&ping, &reply, step, step);
+		// A window that has gone meanwhile has nothing left to do.
+		if (status != B_TIMED_OUT && status != B_WOULD_BLOCK)
+			return true;
+	} while (system_time() < end);
+	return false;
 }
 
 
 bool
-Robot::SettleOnce()
+Robot::SettleWindow(BWindow* window, bigtime_t limit)
+{
+	const bigtime_t end = system_time() + limit;
+	while (window->LockWithTimeout(std::min(limit, kWaitStep)) != B_OK) {
+		if (LooperAccess::IsInUserWait(window))
+			return true;
+		if (system_time() >= end)
+			return false;
+	}
+	BMessenger messenger(window);
+	bool isRunning = !window->IsHidden();
+	window->Unlock();
+	return !isRunning || Ping(window, messenger, limit);
+}
+
+
+bool
+Robot::SettleOnce(bigtime_t limit)
 {
 	// A test may do without the application's loop.
-	bool settled =
-		be_app == nullptr || !LooperAccess::IsRunning(be_app) || Ping(be_app_messenger, kBusyTime);
+	bool settled = be_app == nullptr || !LooperAccess::IsRunning(be_app)
+		|| Ping(be_app, be_app_messenger, limit);
 	for (int32 i = 0; be_app != nullptr && i < be_app->CountWindows(); i++) {
 		BWindow* window = be_app->WindowAt(i);
-		if (window == nullptr || window->LockWithTimeout(kBusyTime) != B_OK) {
-			settled = settled && window == nullptr;
-			continue;
-		}
-		BMessenger messenger(window);
-		bool isRunning = !window->IsHidden();
-		window->Unlock();
-		if (isRunning && !Ping(messenger, kBusyTime))
-			settled = false;
+		settled = (window == nullptr || SettleWindow(window, limit)) && settled;
 	}
 	// What follows an open menu counts too: it opens and closes the menus' windows.
-	for (const BMessenger& menu : LooperAccess::LoopersOfKind(kMenuWindowLooper, kBusyTime))
-		settled = Ping(menu, kBusyTime) && settled;
+	for (const BMessenger& menu : LooperAccess::LoopersOfKind(kMenuWindowLooper, limit)) {
+		BLooper* looper;
+		menu.Target(&looper);
+		settled = Ping(looper, menu, limit) && settled;
+	}
 	return settled;
+}
+
+
+void
+Robot::Look(bigtime_t time)
+{
+	const bigtime_t end = system_time() + time;
+	for (int round = 0; round < kRounds; round++) {
+		const bigtime_t left = end - system_time();
+		if (left <= 0 || !SettleOnce(left)) {
+			snooze_until(end, B_SYSTEM_TIMEBASE);
+			return;
+		}
+	}
 }
 
 
 bool
 Robot::Settle()
 {
-	// What a message caused, another message or drawing, is in the queue behind it: the second round
-	// finds it done, the third what that caused in turn.
 	bool settled = true;
-	for (int round = 0; round < 3 && settled; round++)
-		settled = SettleOnce();
+	for (int round = 0; round < kRounds && settled; round++)
+		settled = SettleOnce(kBusyTime);
 	// A step of the display's thread: what was presented before is shown.
 	Display::Get().InjectPointer(fWhere, fButtons);
 	return settled;

@@ -12,6 +12,7 @@
 
 #include "display/PixelBuffer.h"
 
+class BLooper;
 class BView;
 class BWindow;
 
@@ -82,8 +83,13 @@ public:
 	status_t SaveWindow(const BMessenger& window, const char* path);
 
 private:
-	bool SettleOnce();
-	bool Ping(const BMessenger& target, bigtime_t limit);
+	/// \a limit: for each window.
+	bool SettleOnce(bigtime_t limit);
+	bool SettleWindow(BWindow* window, bigtime_t limit);
+	/// Waits until the windows have handled what they were sent; \a time, where one does not answer.
+	void Look(bigtime_t time);
+	/// Whether \a target, the looper itself, answers or waits for the user.
+	bool Ping(const BLooper* looper, const BMessenger& target, bigtime_t limit);
 	void PressKey(int32 rawKey, const char* bytes, uint32 modifiers);
 	void Pause(bigtime_t time);
 

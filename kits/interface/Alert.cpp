@@ -16,6 +16,7 @@
 
 #include "ControlLook.h"
 #include "app/LooperPrivate.h"
+#include "interface/UserWait.h"
 
 namespace {
 
@@ -28,8 +29,6 @@ constexpr float kStripeWidth = 30;
 constexpr float kTextWidths[] = {300, 450, 600};
 constexpr float kUsualButtonWidth = 75;
 constexpr float kOffsetGap = 40;
-// While a window waits for an alert it looks after its picture this often.
-constexpr bigtime_t kRepaintInterval = 50000;
 
 /// The background of an alert: a stripe at the left and the sign of its type.
 class AlertView : public BView {
@@ -303,18 +302,7 @@ BAlert::Go()
 	Show();
 
 	// From here on the alert is its own thread's, and may be gone already.
-	BPrivate::CheckWait("an alert");
-	BWindow* caller = dynamic_cast<BWindow*>(BLooper::LooperForThread(find_thread(NULL)));
-	const uint32 flags = caller != NULL ? B_RELATIVE_TIMEOUT : 0;
-	status_t status;
-	do {
-		status = acquire_sem_etc(
-			outcome->ended, 1, flags, caller != NULL ? kRepaintInterval : B_INFINITE_TIMEOUT);
-		if (status == B_TIMED_OUT && caller->LockWithTimeout(0) == B_OK) {
-			caller->UpdateIfNeeded();
-			caller->Unlock();
-		}
-	} while (status == B_TIMED_OUT || status == B_WOULD_BLOCK || status == B_INTERRUPTED);
+	BPrivate::WaitForUser(outcome->ended, "an alert");
 	return outcome->answer;
 }
 

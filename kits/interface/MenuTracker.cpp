@@ -18,6 +18,7 @@
 #include "interface/LockedMenu.h"
 #include "interface/MenuPrivate.h"
 #include "interface/MenuWindow.h"
+#include "interface/UserWait.h"
 #include "interface/WindowPrivate.h"
 
 namespace BPrivate {
@@ -27,9 +28,6 @@ namespace {
 const uint32 kMsgBegin = '_MBg';
 const uint32 kMsgEnd = '_MEn';
 const uint32 kMsgTimePassed = '_MTm'; // "serial" (int32)
-
-// While a window waits for a menu it looks after its picture this often.
-const bigtime_t kRepaintInterval = 50000;
 
 // The running sessions; recursive, as telling the program of a choice may delete menus.
 std::recursive_mutex sSessionsLock;
@@ -138,18 +136,7 @@ MenuTracker::TrackAndWait(const MenuStart& start)
 	tracker->fOutcome = outcome;
 	Launch(tracker);
 
-	CheckWait("a menu");
-	BWindow* caller = dynamic_cast<BWindow*>(BLooper::LooperForThread(find_thread(nullptr)));
-	const uint32 flags = caller != nullptr ? B_RELATIVE_TIMEOUT : 0;
-	status_t status;
-	do {
-		status = acquire_sem_etc(
-			outcome->ended, 1, flags, caller != nullptr ? kRepaintInterval : B_INFINITE_TIMEOUT);
-		if (status == B_TIMED_OUT && caller->LockWithTimeout(0) == B_OK) {
-			caller->UpdateIfNeeded();
-			caller->Unlock();
-		}
-	} while (status == B_TIMED_OUT || status == B_WOULD_BLOCK || status == B_INTERRUPTED);
+	WaitForUser(outcome->ended, "a menu");
 	return outcome->chosen;
 }
 
