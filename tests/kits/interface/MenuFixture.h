@@ -11,6 +11,8 @@
 
 #include "ControlsFixture.h"
 
+extern "C" int32 be_count_lock_violations();
+
 /// Counts the hooks around menus.
 class MenuSinkWindow : public SinkWindow {
 public:
@@ -117,6 +119,40 @@ protected:
 	BMenu* fMore;
 	BMenu* fDeeper;
 	BMenu* fEdit;
+};
+
+
+/// Menus in use: no thread may hold two windows' locks for them.
+class MenuTrackingTest : public OpenMenuTest {
+protected:
+	void TearDown() override
+	{
+		OpenMenuTest::TearDown();
+		EXPECT_EQ(be_count_lock_violations(), 0);
+	}
+
+	/// The label of the item that is selected in an open menu or the bar, "" for none.
+	std::string Selected(BMenu* menu)
+	{
+		fRobot->Settle();
+		if (!menu->LockLooper())
+			return "closed";
+		std::string label;
+		for (int32 i = 0; i < menu->CountItems(); i++) {
+			if (IsSelected(menu->ItemAt(i)))
+				label = menu->ItemAt(i)->Label();
+		}
+		menu->UnlockLooper();
+		return label;
+	}
+
+	static bool IsSelected(BMenuItem* item)
+	{
+		struct Opened : BMenuItem {
+			using BMenuItem::IsSelected;
+		};
+		return (item->*&Opened::IsSelected)();
+	}
 };
 
 #endif // TESTS_MENU_FIXTURE_H
