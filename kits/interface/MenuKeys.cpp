@@ -77,7 +77,8 @@ MenuTracker::SelectByKey(bool forward, bool fromEnd)
 	if (menu == nullptr)
 		return;
 	BMenuItem* from = fromEnd ? nullptr : MenuModel::Of(menu).selected;
-	BMenuItem* item = MenuModel::Next(menu, from, forward);
+	BMenuItem* item = from == nullptr && !fromEnd ? MenuModel::StartForKeys(menu, forward)
+												  : MenuModel::Next(menu, from, forward);
 	MenuModel::Select(menu, item);
 	auto window = dynamic_cast<MenuWindow*>(menu->Window());
 	if (window != nullptr && item != nullptr)

@@ -56,6 +56,19 @@ MenuModel::Next(BMenu* menu, const BMenuItem* from, bool forward)
 
 
 BMenuItem*
+MenuModel::StartForKeys(BMenu* menu, bool forward)
+{
+	const BMenu* above = menu->Supermenu();
+	if (menu->IsRadioMode() || (above != nullptr && Of(above).isFieldBar)) {
+		BMenuItem* marked = menu->FindMarked();
+		if (marked != nullptr && CanBeChosen(marked))
+			return marked;
+	}
+	return Next(menu, nullptr, forward);
+}
+
+
+BMenuItem*
 MenuModel::ItemForTrigger(BMenu* menu, char letter)
 {
 	LayOut(menu);

@@ -115,6 +115,8 @@ public:
 	static BMenuItem* ItemAt(BMenu* menu, BPoint where);
 
 	// Choosing
+	/// Where the keys begin: the present choice of a menu that has one, else the first or last item.
+	static BMenuItem* StartForKeys(BMenu* menu, bool forward);
 	/// The next item from \a from (null: from the end) that can be chosen, around the end; null for none.
 	static BMenuItem* Next(BMenu* menu, const BMenuItem* from, bool forward);
 	static bool CanBeChosen(const BMenuItem* item);

@@ -357,8 +357,12 @@ MenuTracker::OpenSubmenu(size_t level, BMenuItem* item, bool selectFirst)
 	// One window gets all the input: that of the first menu, which stays until the end or the next one.
 	if (fLevels.size() == (fIsBar ? 2 : 1))
 		window->GrabInput();
-	if (selectFirst)
-		MenuModel::Select(opened, MenuModel::Next(opened, nullptr, true));
+	if (!selectFirst)
+		return;
+	BMenuItem* first = MenuModel::StartForKeys(opened, true);
+	MenuModel::Select(opened, first);
+	if (first != nullptr)
+		window->Reveal(first);
 }
 
 

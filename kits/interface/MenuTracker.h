@@ -21,7 +21,7 @@ struct MenuStart {
 	/// An item of the bar \a menu that is selected, -1 for none; and whether its menu opens.
 	int32 index = -1;
 	bool opensItem = false;
-	/// The first item of that menu is selected, for those who go on by keyboard.
+	/// The first item of that menu, or its present choice, is selected, for those who go on by keyboard.
 	bool selectsFirst = false;
 	/// Releasing the button that opened the menu keeps it open; in the rect, if that is valid, in any case.
 	bool staysOpen = false;

@@ -67,3 +67,73 @@ TEST_F(MenuFieldTest, FieldIsUsedByKeyboard)
 	fRobot->ClickView("_mc_mb_");
 	EXPECT_FALSE(IsOpen(menu));
 }
+
+
+TEST_F(MenuFieldTest, KeysBeginAtTheChoice)
+{
+	BPopUpMenu* menu = new BPopUpMenu("choices");
+	for (const char* label : {"red", "green", "blue"})
+		menu->AddItem(new BMenuItem(label, new BMessage('colr')));
+	menu->ItemAt(1)->SetMarked(true);
+	BMenuField* field = Add(new BMenuField(BRect(20, 100, 219, 119), "field", "Colour:", menu));
+	Show();
+	Do([field] { field->MakeFocus(); });
+	fRobot->Key("space");
+	ASSERT_TRUE(Opens(menu));
+	EXPECT_EQ(Selected(menu), "green");
+	fRobot->Key("down");
+	EXPECT_EQ(Selected(menu), "blue");
+	fRobot->Key("enter");
+	EXPECT_TRUE(Closes(menu));
+	fRobot->Key("down");
+	ASSERT_TRUE(Opens(menu));
+	EXPECT_EQ(Selected(menu), "blue");
+	fRobot->Key("home");
+	EXPECT_EQ(Selected(menu), "red");
+	fRobot->Key("escape");
+	EXPECT_TRUE(Closes(menu));
+	// What cannot be chosen is passed over.
+	Do([menu] { menu->ItemAt(2)->SetEnabled(false); });
+	fRobot->Key("space");
+	ASSERT_TRUE(Opens(menu));
+	EXPECT_EQ(Selected(menu), "red");
+	fRobot->Key("escape");
+	EXPECT_TRUE(Closes(menu));
+}
+
+
+TEST_F(MenuFieldTest, ChoiceInALongMenuIsInSight)
+{
+	BPopUpMenu* menu = new BPopUpMenu("choices");
+	for (int32 i = 0; i < 200; i++) {
+		BString label("Line ");
+		label << i;
+		menu->AddItem(new BMenuItem(label.String(), new BMessage('line')));
+	}
+	menu->ItemAt(150)->SetMarked(true);
+	BMenuField* field = Add(new BMenuField(BRect(20, 100, 219, 119), "field", "Lines:", menu));
+	Show();
+	Do([field] { field->MakeFocus(); });
+	fRobot->Key("space");
+	ASSERT_TRUE(Opens(menu));
+	EXPECT_EQ(Selected(menu), "Line 150");
+	ASSERT_TRUE(menu->LockLooper());
+	EXPECT_TRUE(menu->Bounds().Contains(menu->ItemAt(150)->Frame()));
+	menu->UnlockLooper();
+	fRobot->Key("escape");
+	EXPECT_TRUE(Closes(menu));
+}
+
+
+TEST_F(MenuFieldTest, KeysBeginAtTheStartOfMenusWithoutAChoice)
+{
+	fEdit->ItemAt(1)->SetMarked(true);
+	Show();
+	fRobot->Key("command+escape");
+	fRobot->Key("right");
+	fRobot->Key("down");
+	ASSERT_TRUE(Opens(fEdit));
+	EXPECT_EQ(Selected(fEdit), "Copy");
+	fRobot->Key("escape");
+	EXPECT_TRUE(AllClosed());
+}

@@ -325,3 +325,23 @@ TEST_F(PopUpMenuTest, PopUpStaysOnTheScreen)
 	fRobot->Key("escape");
 	EXPECT_TRUE(Closes(&fView->menu));
 }
+
+
+TEST_F(PopUpMenuTest, KeysBeginAtTheChoice)
+{
+	fView->menu.SetRadioMode(true);
+	fView->menu.ItemAt(1)->SetMarked(true);
+	fView->keepsOpen = true;
+	Show();
+	for (const char* key : {"down", "up"}) {
+		BMessenger(fView).SendMessage('GoGo');
+		ASSERT_TRUE(Opens(&fView->menu));
+		fRobot->Key(key);
+		EXPECT_EQ(Selected(&fView->menu), "Two") << key;
+		fRobot->Key("up");
+		EXPECT_EQ(Selected(&fView->menu), "One");
+		fRobot->Key("escape");
+		EXPECT_TRUE(Closes(&fView->menu));
+	}
+	EXPECT_TRUE(Returned(2));
+}
