@@ -4,3 +4,4 @@
 #include "app/Preferences.h"
 
 TPreferences AppSettings("Plim_Settings");
+std::mutex AppSettingsLock;

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include <mutex>
+
 #include <Path.h>
 
 #include "app/TypedMessage.h"
@@ -34,5 +36,8 @@ private:
 /// The designer's settings. They exist from before main() until after it.
 ///
 /// Window frames, in screen coordinates: "MainWindowFrame", "PaletteFrame", "PropertyWinFrame",
-/// "ProjectWinFrame" (rectangles).
+/// "ProjectWinFrame" (rectangles). The dialect of generated sources: "Dialect" (a text, see codegen/Dialect.h).
 extern TPreferences AppSettings;
+
+/// Windows read and store their settings in their own threads: held for each use of AppSettings, and no longer.
+extern std::mutex AppSettingsLock;

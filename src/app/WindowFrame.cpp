@@ -4,7 +4,6 @@
 
 #include <algorithm>
 #include <cmath>
-#include <mutex>
 
 #include <Screen.h>
 #include <Window.h>
@@ -12,9 +11,6 @@
 #include "app/Preferences.h"
 
 namespace {
-
-// Windows store their frames in their own threads, all at about the same time.
-std::mutex sSettingsLock;
 
 // Where the platform takes any number for a screen.
 constexpr int32 kMostScreens = 16;
@@ -31,7 +27,7 @@ IsFrame(BRect frame)
 bool
 FindFrame(const char* key, BRect* frame)
 {
-	std::lock_guard<std::mutex> lock(sSettingsLock);
+	std::lock_guard<std::mutex> lock(AppSettingsLock);
 	return AppSettings.FindRect(key, frame) == B_OK;
 }
 
@@ -71,7 +67,7 @@ void
 StoreWindowFrame(const BWindow* window, const char* key)
 {
 	const BRect frame = window->Frame();
-	std::lock_guard<std::mutex> lock(sSettingsLock);
+	std::lock_guard<std::mutex> lock(AppSettingsLock);
 	AppSettings.SetRect(key, frame);
 }
 

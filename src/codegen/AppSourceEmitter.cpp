@@ -59,13 +59,7 @@ TAppSourceEmitter::EmitAppConstructor(BString& text)
 	content << "T$APPNAME::T$APPNAME(void)\n"
 			<< ": BApplication(APP_SIG)\n"
 			<< "{\n";
-	TDesignForm* mainForm = FindMainForm(App());
-	WindowGuard guard(mainForm);
-	if (guard.IsLocked()) {
-		content << "$TABm_MainForm = new T" << mainForm->ComponentName() << "();\n"
-				<< "$TABm_MainForm->MakeMainForm(true);\n"
-				<< "$TABm_MainForm->Show();\n";
-	}
+	AppendMainForm(content);
 	content << "}\n";
 	EmitMachineSection("APP_CONSTRUCT", content, text);
 }
@@ -175,4 +169,17 @@ TAppSourceEmitter::EmitMessageProcEnd(BString& text)
 		 << "$TAB}\n"
 		 << "}\n"
 		 << "\n";
+}
+
+
+void
+TAppSourceEmitter::AppendMainForm(BString& text)
+{
+	TDesignForm* mainForm = FindMainForm(App());
+	WindowGuard guard(mainForm);
+	if (!guard.IsLocked())
+		return;
+	text << "$TABm_MainForm = new T" << mainForm->ComponentName() << "();\n"
+		 << "$TABm_MainForm->MakeMainForm(true);\n"
+		 << "$TABm_MainForm->Show();\n";
 }

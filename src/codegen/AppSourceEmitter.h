@@ -29,4 +29,8 @@ public:
 	virtual void EmitMessageProc(BString& text);
 	virtual void EmitMessageProcStart(BString& text);
 	virtual void EmitMessageProcEnd(BString& text);
+
+protected:
+	/// Appends the statements that make and show the main form; none when there is no form.
+	void AppendMainForm(BString& text);
 };

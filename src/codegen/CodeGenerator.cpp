@@ -10,6 +10,7 @@
 #include "codegen/AppHeaderEmitter.h"
 #include "codegen/AppSourceEmitter.h"
 #include "codegen/ConfirmGenerateWin.h"
+#include "codegen/DialectGenerator.h"
 #include "codegen/FormHeaderEmitter.h"
 #include "codegen/FormParts.h"
 #include "codegen/FormSourceEmitter.h"
@@ -367,6 +368,6 @@ TCodeGenerator::RemarkSkippedSections(const BString& path, const BStringList& se
 TCodeGenerator*
 Generator()
 {
-	static TCodeGenerator sGenerator;
+	static TPreferredGenerator sGenerator;
 	return &sGenerator;
 }

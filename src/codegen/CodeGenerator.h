@@ -86,5 +86,5 @@ private:
 	BMessenger fDialog;
 };
 
-/// The generator of this program.
+/// The generator of this program; it generates in the dialect that the user prefers.
 TCodeGenerator* Generator();

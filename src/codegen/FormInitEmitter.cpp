@@ -16,17 +16,6 @@
 
 namespace {
 
-/// The frame of a form or component as source text.
-BString
-FrameText(const TComponent* component)
-{
-	BString frame("BRect(");
-	frame << PropertyText(component, "Left") << "," << PropertyText(component, "Top") << ","
-		  << PropertyText(component, "Right") << "," << PropertyText(component, "Bottom") << ")";
-	return frame;
-}
-
-
 /// The set statement of a property with its later lines indented; empty when there is no such property.
 BString
 IndentedSetStatement(const TComponent* component, const char* name)
@@ -72,7 +61,7 @@ TFormSourceEmitter::EmitFormConstructStart(BString& text)
 
 	text << "T$FORMNAME::T$FORMNAME(void)\n"
 		 << ": TForm(\n"
-		 << "    " << FrameText(Form()) << "\n"
+		 << "    " << FrameExpression(Form()) << "\n"
 		 << "  , \"" << PropertyText(Form(), "Title") << "\"\n"
 		 << "  , " << PropertyText(Form(), "WindowLook") << "\n"
 		 << "  , " << PropertyText(Form(), "WindowFeel") << "\n"
@@ -193,7 +182,7 @@ TFormSourceEmitter::EmitComponentConstructor(TComponent* component, BString& tex
 		statement << ",$PARAMS";
 	statement << ")\n  );\n";
 
-	const BString frame = FrameText(component);
+	const BString frame = FrameExpression(component);
 	ReplacePlaceholders(statement,
 		{{"$FORMNAME", Form()->ComponentName()}, {"$PARENT", ParentExpression(Form(), component)},
 			{"$COMPONENT", component->ComponentName()}, {"$CLSNAME", component->ClassName()},

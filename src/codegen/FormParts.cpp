@@ -44,6 +44,16 @@ PropertyText(const TComponent* component, const char* name)
 }
 
 
+BString
+FrameExpression(const TComponent* component)
+{
+	BString frame("BRect(");
+	frame << PropertyText(component, "Left") << "," << PropertyText(component, "Top") << ","
+		  << PropertyText(component, "Right") << "," << PropertyText(component, "Bottom") << ")";
+	return frame;
+}
+
+
 TDesignForm*
 FormAt(const TAppComponent* app, int32 index)
 {

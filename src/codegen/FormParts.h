@@ -22,6 +22,9 @@ const char* ParentExpression(TDesignForm* form, const TComponent* component);
 /// The value of the property \a name, at most 1024 bytes; empty when there is no such property.
 BString PropertyText(const TComponent* component, const char* name);
 
+/// The frame of a form or component as source text.
+BString FrameExpression(const TComponent* component);
+
 /// The design form at \a index of the application's form list, or null when another thing stands there.
 TDesignForm* FormAt(const TAppComponent* app, int32 index);
 

@@ -10,7 +10,7 @@
 #include <Path.h>
 
 #include "app/Dialogs.h"
-#include "codegen/CodeGenerator.h"
+#include "codegen/DialectGenerator.h"
 #include "codegen/ProjectCheck.h"
 #include "codegen/SourceFiles.h"
 #include "codegen/UnifiedDiff.h"
@@ -137,7 +137,7 @@ TGenerationRun::LoadProject()
 	if (judged != GENERATION_DONE)
 		return judged;
 
-	TProjectCheck check(fProject->App(), path);
+	TProjectCheck check(fProject->App(), path, fOptions.dialect);
 	for (const project_problem& problem : check.Run())
 		Warn(problem.file.c_str(), problem.text.c_str());
 	return Generate();
@@ -195,7 +195,7 @@ TGenerationRun::Check(const TLoadReport& report)
 {
 	for (const load_problem& problem : report.Problems())
 		TellProblem(problem.file.String(), WithAdvice(problem).c_str());
-	TProjectCheck check(fProject->App(), fOptions.project.String());
+	TProjectCheck check(fProject->App(), fOptions.project.String(), fOptions.dialect);
 	for (const project_problem& problem : check.Run())
 		TellProblem(problem.file.c_str(), problem.text.c_str());
 
@@ -212,7 +212,7 @@ TGenerationRun::Check(const TLoadReport& report)
 generation_result
 TGenerationRun::Generate()
 {
-	TCodeGenerator generator;
+	TDialectGenerator generator(fOptions.dialect);
 	generator.Writer().SetDryRun(fOptions.dryRun);
 	generator.SetAppComponent(fProject->App());
 	const generation_result result = SetFolder(&generator);

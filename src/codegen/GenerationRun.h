@@ -10,6 +10,8 @@
 
 #include <String.h>
 
+#include "codegen/Dialect.h"
+
 class TCodeGenerator;
 class TLoadReport;
 class TProject;
@@ -18,15 +20,16 @@ struct project_problem;
 
 /// What a run is to do.
 struct generation_options {
-	BString project;                       // the project's file
-	BString output;                        // empty: the project's own folder
-	std::vector<BString> componentFolders; // empty: the folder beside the program
-	BString mainForm;                      // empty: the project's own choice
-	bool check = false;                    // only report problems
-	bool allowMissing = false;             // go on without components that have no library
-	bool dryRun = false;                   // only list what would be written
-	bool diff = false;                     // with the differences
-	bool verbose = false;                  // list files that stay as they are, too
+	BString project;                          // the project's file
+	BString output;                           // empty: the project's own folder
+	std::vector<BString> componentFolders;    // empty: the folder beside the program
+	BString mainForm;                         // empty: the project's own choice
+	source_dialect dialect = DIALECT_CLASSIC; // of the sources
+	bool check = false;                       // only report problems
+	bool allowMissing = false;                // go on without components that have no library
+	bool dryRun = false;                      // only list what would be written
+	bool diff = false;                        // with the differences
+	bool verbose = false;                     // list files that stay as they are, too
 };
 
 /// What a run ends with, as the program's exit code.

@@ -9,6 +9,7 @@
 
 #include "codegen/FormParts.h"
 #include "codegen/HandlerNames.h"
+#include "codegen/StandardText.h"
 #include "designer/DesignForm.h"
 #include "model/AppComponent.h"
 #include "model/Event.h"
@@ -134,9 +135,11 @@ FormFileText(TDesignForm* form)
 } // namespace
 
 
-TProjectCheck::TProjectCheck(const TAppComponent* app, const char* projectFile)
+TProjectCheck::TProjectCheck(
+	const TAppComponent* app, const char* projectFile, source_dialect dialect)
 	: fApp(app),
-	  fProjectFile(projectFile)
+	  fProjectFile(projectFile),
+	  fDialect(dialect)
 {
 }
 
@@ -299,16 +302,21 @@ TProjectCheck::CheckHandler(
 	if (!IsIdentifier(name))
 		Report(handler() + " is no C++ identifier; rename the component or switch the event off");
 
-	const char* parameters = event.parameters != nullptr ? event.parameters : "";
-	if (!IsAscii(parameters))
+	BString parameters(event.parameters);
+	BString returnType(event.returnType);
+	if (fDialect == DIALECT_STANDARD) {
+		parameters = PlainSource(parameters.String());
+		returnType = PlainSource(returnType.String());
+	}
+	if (!IsAscii(parameters.String()))
 		Report(handler()
 			+ " would not compile: its parameters hold characters that are no plain ASCII"
 			+ " (such as non-breaking spaces); switch the event off");
-	else if (!IsBalanced(parameters))
+	else if (!IsBalanced(parameters.String()))
 		Report(handler() + " would not compile: the brackets of its parameters do not match;"
 			+ " switch the event off");
 	if (event.returnType != nullptr
-		&& (!IsAscii(event.returnType) || !IsReturnable(event.returnType)))
+		&& (!IsAscii(returnType.String()) || !IsReturnable(returnType.String())))
 		Report(handler() + " would not compile: it cannot return " + Quoted(event.returnType)
 			+ "; switch the event off");
 

@@ -9,6 +9,8 @@
 #include <unordered_set>
 #include <vector>
 
+#include "codegen/Dialect.h"
+
 class TAppComponent;
 class TComponent;
 class TDesignForm;
@@ -28,7 +30,9 @@ struct project_problem {
 class TProjectCheck {
 public:
 	/// \a projectFile: the name under which problems of the application are reported.
-	TProjectCheck(const TAppComponent* app, const char* projectFile);
+	/// \a dialect: that which the sources are to be written in.
+	TProjectCheck(const TAppComponent* app, const char* projectFile,
+		source_dialect dialect = DIALECT_CLASSIC);
 
 	/// Looks at everything, and returns the problems in the order of the project's forms.
 	const std::vector<project_problem>& Run();
@@ -51,6 +55,7 @@ private:
 
 	const TAppComponent* fApp;
 	std::string fProjectFile;
+	source_dialect fDialect;
 	std::string fFile; // the document being looked at
 	name_owners fFiles;
 	name_owners fClasses;

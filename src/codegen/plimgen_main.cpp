@@ -51,6 +51,19 @@ DescribeOptions(CLI::App& parser, command_line* line)
 	parser.add_option("--main", line->mainForm, "make this form the main form")
 		->type_name("FORM")
 		->check(notEmpty);
+	parser
+		.add_option_function<std::string>(
+			"--dialect",
+			[&options](const std::string& name) { FindDialect(name.c_str(), &options.dialect); },
+			"write classic sources, which need GCC and -fpermissive, or standard C++"
+			" (default: classic)")
+		->type_name("classic|standard")
+		->check([](const std::string& name) {
+			source_dialect dialect;
+			return FindDialect(name.c_str(), &dialect)
+				? std::string()
+				: "there is no dialect '" + name + "'; give classic or standard";
+		});
 	parser.add_flag("--check", options.check, "report the project's problems, write nothing");
 	parser.add_flag(
 		"--allow-missing", options.allowMissing, "generate although components lack their library");

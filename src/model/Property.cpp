@@ -134,6 +134,13 @@ TProperty::SetStatement() const
 }
 
 
+bool
+TProperty::HasSetStatement() const
+{
+	return HasText(fSetStatement);
+}
+
+
 void
 TProperty::SetGetStatement(const char* statement)
 {

@@ -53,6 +53,9 @@ public:
 	/// At most 1103 bytes.
 	virtual BString SetStatement() const;
 
+	/// Whether a template was set, so that SetStatement() does not give the standard form.
+	bool HasSetStatement() const;
+
 	/// Sets the template of the expression that reads the property; null is ignored.
 	virtual void SetGetStatement(const char* statement);
 

@@ -1,0 +1,30 @@
+// SPDX-License-Identifier: MIT
+// The generator for either dialect of the sources.
+
+#pragma once
+
+#include "codegen/CodeGenerator.h"
+#include "codegen/Dialect.h"
+
+/// Writes the sources in the dialect that it is told: it makes the emitters of that one.
+class TDialectGenerator : public TCodeGenerator {
+public:
+	explicit TDialectGenerator(source_dialect dialect = DIALECT_CLASSIC);
+
+	source_dialect Dialect() const { return fDialect; }
+	void SetDialect(source_dialect dialect) { fDialect = dialect; }
+
+	TFormHeaderEmitter* FormHeaderEmitter(TDesignForm* form) override;
+	TFormSourceEmitter* FormSourceEmitter(TDesignForm* form) override;
+	TAppHeaderEmitter* AppHeaderEmitter(TAppComponent* app) override;
+	TAppSourceEmitter* AppSourceEmitter(TAppComponent* app) override;
+
+private:
+	source_dialect fDialect;
+};
+
+/// The designer's generator: each time that it generates it takes the dialect that the user prefers.
+class TPreferredGenerator : public TDialectGenerator {
+public:
+	bool GenerateApp() override;
+};
