@@ -2,10 +2,13 @@
 
 #include "codegen/ConfirmGenerateWin.h"
 
+#include <math.h>
+
 #include <algorithm>
 
 #include <Box.h>
 #include <Button.h>
+#include <CheckBox.h>
 #include <ListView.h>
 #include <Message.h>
 #include <ScrollView.h>
@@ -18,6 +21,7 @@
 #include "app/MainWindow.h"
 #include "app/WindowGuard.h"
 #include "codegen/CodeGenerator.h"
+#include "codegen/Dialect.h"
 #include "codegen/FormParts.h"
 #include "designer/DesignForm.h"
 #include "model/AppComponent.h"
@@ -29,6 +33,7 @@ namespace {
 
 constexpr uint32 kMsgGenerate = 1;
 constexpr uint32 kMsgCancel = 2;
+constexpr uint32 kMsgDialect = 3;
 
 const BRect kFirstFrame(100, 100, 440, 393);
 const BRect kGenerateFrame(5, 263, 75, 288);
@@ -95,7 +100,8 @@ ConfirmGenerateWin::ConfirmGenerateWin(TCodeGenerator* generator, TAppComponent*
 	  fGenerator(generator),
 	  fApp(app),
 	  fGenerateButton(nullptr),
-	  fCancelButton(nullptr)
+	  fCancelButton(nullptr),
+	  fStandardBox(nullptr)
 {
 	SetFeel(B_MODAL_APP_WINDOW_FEEL);
 	if (fApp == nullptr) {
@@ -130,6 +136,11 @@ ConfirmGenerateWin::MessageReceived(BMessage* message)
 			PostMessage(B_QUIT_REQUESTED);
 			break;
 
+		case kMsgDialect:
+			SetPreferredDialect(
+				fStandardBox->Value() == B_CONTROL_ON ? DIALECT_STANDARD : DIALECT_CLASSIC);
+			break;
+
 		default:
 			BWindow::MessageReceived(message);
 			break;
@@ -151,6 +162,7 @@ ConfirmGenerateWin::InitControls()
 	fCancelButton = new BButton(cancelFrame, "btnCancel", "Cancel", new BMessage(kMsgCancel));
 	background->AddChild(fGenerateButton);
 	background->AddChild(fCancelButton);
+	AddDialect(background, cancelFrame);
 	fGenerateButton->MakeFocus();
 }
 
@@ -199,6 +211,22 @@ ConfirmGenerateWin::AddForms(BView* parent)
 			list->AddItem(new BStringItem(line.String()));
 	}
 	box->AddChild(new BScrollView("svFormList", list, B_FOLLOW_LEFT_TOP, 0, false, true));
+}
+
+
+/// Puts the choice of the dialect into the row of buttons, which leaves room behind \a cancelFrame.
+void
+ConfirmGenerateWin::AddDialect(BView* parent, BRect cancelFrame)
+{
+	BRect frame = cancelFrame;
+	frame.left = cancelFrame.right + 2 * kButtonGap;
+	frame.right = parent->Bounds().right - kMargin;
+	fStandardBox = new BCheckBox(frame, "cbStandard", "Standard C++", new BMessage(kMsgDialect));
+	parent->AddChild(fStandardBox);
+	fStandardBox->SetValue(PreferredDialect() == DIALECT_STANDARD ? B_CONTROL_ON : B_CONTROL_OFF);
+	// It took the height of its font; its label stands level with those of the buttons.
+	const float free = cancelFrame.Height() - fStandardBox->Frame().Height();
+	fStandardBox->MoveTo(frame.left, cancelFrame.top + std::max(0.0f, floorf(free / 2)));
 }
 
 

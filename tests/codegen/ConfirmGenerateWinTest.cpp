@@ -15,7 +15,8 @@
 #include <TextView.h>
 
 #include "app/Dialogs.h"
-#include "codegen/CodeGenerator.h"
+#include "app/Preferences.h"
+#include "codegen/DialectGenerator.h"
 #include "model/AppComponent.h"
 #include "model/Property.h"
 #include "project/Project.h"
@@ -197,4 +198,31 @@ TEST_F(ConfirmGenerateWinTest, WithoutAnApplicationABoxTellsAndNothingIsShown)
 	EXPECT_EQ(sBox, "Error|Error: No App component specified!|OK");
 	EXPECT_FALSE(fGenerator.IsConfirming());
 	EXPECT_EQ(be_app->CountWindows(), 1);
+}
+
+
+TEST_F(ConfirmGenerateWinTest, TheDialectIsChosenInTheDialogAndKept)
+{
+	TPreferredGenerator generator;
+	generator.SetAppComponent(fProject.App());
+	ASSERT_EQ(PreferredDialect(), DIALECT_CLASSIC);
+	EXPECT_TRUE(generator.ConfirmSettings());
+	ASSERT_TRUE(fRobot.WaitForWindow(kTitle));
+	EXPECT_EQ(fRobot.Value("cbStandard"), 0);
+	EXPECT_TRUE(fRobot.ClickView("Standard C++"));
+	EXPECT_TRUE(fRobot.ClickView("Generate"));
+	EXPECT_TRUE(fRobot.WaitForNoWindow(kTitle));
+	const std::string path = "generated/Application.cpp";
+	EXPECT_NE(fFolder.Read(path).find(", m_MainForm(nullptr)\n"), std::string::npos);
+
+	EXPECT_TRUE(generator.ConfirmSettings());
+	ASSERT_TRUE(fRobot.WaitForWindow(kTitle));
+	EXPECT_EQ(fRobot.Value("cbStandard"), 1);
+	EXPECT_TRUE(fRobot.ClickView("cbStandard"));
+	EXPECT_TRUE(fRobot.ClickView("Cancel"));
+	EXPECT_TRUE(fRobot.WaitForNoWindow(kTitle));
+	EXPECT_EQ(PreferredDialect(), DIALECT_CLASSIC);
+	generator.GenerateApp();
+	EXPECT_EQ(fFolder.Read(path).find("nullptr"), std::string::npos);
+	AppSettings.RemoveName("Dialect");
 }
