@@ -7,8 +7,12 @@
 #include <sys/wait.h>
 
 #include <functional>
+#include <regex>
+#include <set>
+#include <sstream>
 #include <vector>
 
+#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <Message.h>
@@ -157,6 +161,28 @@ Plimgen(const std::vector<std::string>& arguments, const std::string& folder = "
 	wait4(child, &status, 0, &usage);
 	return {WIFEXITED(status) ? WEXITSTATUS(status) : -WTERMSIG(status), ReadText(out),
 		ReadText(err), usage.ru_maxrss};
+}
+
+
+/// The options named in those lines of \a text that begin with \a start, in what stands before their explanation.
+std::set<std::string>
+OptionsIn(const std::string& text, const std::string& start)
+{
+	std::set<std::string> options;
+	std::istringstream lines(text);
+	for (std::string line; std::getline(lines, line);) {
+		if (line.compare(0, start.length(), start) != 0)
+			continue;
+		const std::string end = start[0] == '|' ? " | " : "  ";
+		line = line.substr(2, line.find(end, 2) - 2);
+		line = line.substr(0, line.find(" Needs: "));
+		const std::regex option("(^|[ ,`])(--?[a-z][a-z-]*)");
+		for (std::sregex_iterator each(line.begin(), line.end(), option), none; each != none;
+			 ++each) {
+			options.insert((*each)[2]);
+		}
+	}
+	return options;
 }
 
 
@@ -518,6 +544,42 @@ TEST(PlimgenTest, VersionAndHelpAreDone)
 }
 
 
+TEST(PlimgenTest, HelpAndDocumentationNameTheSameOptions)
+{
+	const std::set<std::string> helped = OptionsIn(Plimgen({"--help"}).out, "  -");
+	const std::set<std::string> documented =
+		OptionsIn(ReadText(PLIM_SOURCE_DIR "/docs/plimgen.md"), "| `-");
+	EXPECT_GT(helped.size(), 10u);
+	EXPECT_THAT(documented, testing::ContainerEq(helped));
+}
+
+
+TEST(PlimgenTest, TheDialectIsClassicUnlessAnotherIsGiven)
+{
+	ProjectFolder folder;
+	const std::string project = folder.SaveSimple();
+	EXPECT_EQ(Plimgen({project}).code, 0);
+	const std::string classic = folder.OutText("Form1.fcp");
+	EXPECT_TRUE(Has(classic, "Button1->OnClick = &Button1Click;"));
+	EXPECT_EQ(Plimgen({project, "--dialect", "standard"}).code, 0);
+	EXPECT_TRUE(Has(folder.OutText("Form1.fcp"), "Button1->OnClick = &TForm1::Button1Click;"));
+	EXPECT_EQ(Plimgen({project, "--dialect", "classic"}).code, 0);
+	EXPECT_EQ(folder.OutText("Form1.fcp"), classic);
+}
+
+
+TEST(PlimgenTest, TheCheckIsThatOfTheDialect)
+{
+	ProjectFolder folder;
+	folder.AddForm("Form1", {}, "OnMouseMoved");
+	const std::string project = folder.Save();
+	EXPECT_EQ(Plimgen({project, "--check"}).code, 1);
+	EXPECT_EQ(Plimgen({project, "--check", "--dialect", "standard"}).code, 0);
+	EXPECT_TRUE(Has(Plimgen({project, "--dry-run"}).err, "would not compile"));
+	EXPECT_EQ(Plimgen({project, "--dry-run", "--dialect", "standard"}).err, "");
+}
+
+
 TEST(PlimgenTest, WrongUsageIsToldAndDoesNothing)
 {
 	ProjectFolder folder;
@@ -530,6 +592,8 @@ TEST(PlimgenTest, WrongUsageIsToldAndDoesNothing)
 		{project, "--output"},
 		{project, "--output", ""},
 		{project, "--main"},
+		{project, "--dialect"},
+		{project, "--dialect", "latin"},
 		{project, "-o", folder.At(std::string(260, 'd'))},
 	};
 	for (const auto& arguments : wrong) {

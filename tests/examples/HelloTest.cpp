@@ -47,6 +47,19 @@ class HelloTest : public testing::Test {
 protected:
 	HelloTest() { std::filesystem::copy(kExample, fFolder.Path(), kOptions); }
 
+	/// Runs a hello program offscreen and uses it.
+	void ExpectReactions(const std::string& program)
+	{
+		const command_result ran = RunCommand("PICTURES=" + fFolder.Path()
+			+ " BE_ROBOT_SCRIPT=" PLIM_SOURCE_DIR "/tests/examples/hello.robot timeout 60 "
+			+ program);
+		EXPECT_EQ(ran.code, 0) << ran.output;
+		EXPECT_NE(ran.output.find("GreetingText: Hello!\n"), std::string::npos) << ran.output;
+		EXPECT_NE(ran.output.find("CountText: No clicks yet\n"), std::string::npos) << ran.output;
+		EXPECT_NE(ran.output.find("CountText: 3 clicks\n"), std::string::npos) << ran.output;
+		EXPECT_GT(std::filesystem::file_size(fFolder / "hello.png"), 1000u);
+	}
+
 	static constexpr auto kOptions = std::filesystem::copy_options::recursive
 		| std::filesystem::copy_options::overwrite_existing;
 	TemporaryFolder fFolder;
@@ -95,12 +108,14 @@ TEST_F(HelloTest, TheGeneratedProgramCompilesRunsAndReactsToClicks)
 			+ (fFolder / "build"));
 	ASSERT_EQ(built.code, 0) << built.output;
 
-	const command_result ran = RunCommand("PICTURES=" + fFolder.Path()
-		+ " BE_ROBOT_SCRIPT=" PLIM_SOURCE_DIR "/tests/examples/hello.robot timeout 60 "
-		+ (fFolder / "build/hello"));
-	EXPECT_EQ(ran.code, 0) << ran.output;
-	EXPECT_NE(ran.output.find("GreetingText: Hello!\n"), std::string::npos) << ran.output;
-	EXPECT_NE(ran.output.find("CountText: No clicks yet\n"), std::string::npos) << ran.output;
-	EXPECT_NE(ran.output.find("CountText: 3 clicks\n"), std::string::npos) << ran.output;
-	EXPECT_GT(std::filesystem::file_size(fFolder / "hello.png"), 1000u);
+	ExpectReactions(fFolder / "build/hello");
+}
+
+
+TEST_F(HelloTest, TheProgramOfTheStandardDialectReactsToTheSameClicks)
+{
+	// The tree has generated and compiled it, which takes no warning.
+	const std::string init = ReadFile(PLIM_BUILD_DIR "/examples/hello/standard/MainForm.fcp");
+	EXPECT_NE(init.find("CountButton->OnClick = &TMainForm::CountButtonClick;"), std::string::npos);
+	ExpectReactions(PLIM_BUILD_DIR "/bin/hello_standard");
 }
