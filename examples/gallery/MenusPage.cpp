@@ -5,6 +5,7 @@
 #include <MenuField.h>
 #include <MenuItem.h>
 #include <Message.h>
+#include <OptionPopUp.h>
 #include <PopUpMenu.h>
 
 #include "GalleryMenus.h"
@@ -44,6 +45,24 @@ AddFields(BView* page)
 	}
 }
 
+void
+AddOptions(BView* page)
+{
+	AddCaption(page, 10, 168, "Options");
+	BOptionPopUp* speed =
+		new BOptionPopUp(BRect(10, 190, 250, 214), "opSpeed", "Speed:", new BMessage('opti'));
+	BOptionPopUp* fixed =
+		new BOptionPopUp(BRect(10, 222, 250, 246), "opFixed", "Fixed:", new BMessage('opti'), true);
+	for (BOptionPopUp* options : {speed, fixed}) {
+		options->AddOption("Slow", 10);
+		options->AddOption("As usual", 50);
+		options->AddOption("Fast", 100);
+		options->SelectOptionFor(50);
+		page->AddChild(options);
+	}
+	fixed->SetEnabled(false);
+}
+
 } // namespace
 
 
@@ -52,6 +71,7 @@ MakeMenusPage(BRect frame)
 {
 	BView* page = MakePage(frame, "Menus");
 	AddFields(page);
+	AddOptions(page);
 	AddCaption(page, 280, 8, "A menu bar of its own");
 	BMenuBar* bar =
 		new BMenuBar(BRect(280, 30, 500, 50), "mbSample", B_FOLLOW_LEFT_TOP, B_ITEMS_IN_ROW, false);

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // Sliders, horizontal and vertical.
 
+#include <ChannelSlider.h>
 #include <Message.h>
 #include <Slider.h>
 #include <String.h>
@@ -87,6 +88,36 @@ AddVertical(BView* page)
 		page->AddChild(slider);
 }
 
+/// Six channels at different places.
+BChannelSlider*
+MakeChannels(BRect frame, const char* name, const char* label, orientation posture)
+{
+	BChannelSlider* slider = new BChannelSlider(frame, name, label, new BMessage('slid'), posture,
+		6, B_FOLLOW_LEFT_TOP, B_WILL_DRAW | B_NAVIGABLE);
+	slider->SetLimits(0, 100);
+	for (int32 i = 0; i < slider->CountChannels(); i++)
+		slider->SetValueFor(i, 20 + 13 * i);
+	slider->SetCurrentChannel(2);
+	return slider;
+}
+
+
+void
+AddChannels(BView* page)
+{
+	BChannelSlider* upright =
+		MakeChannels(BRect(440, 8, 575, 140), "slChannels", "Channels", B_VERTICAL);
+	upright->SetLimitLabels("soft", "loud");
+	BChannelSlider* named = MakeChannels(BRect(440, 152, 575, 268), "slNamed", NULL, B_VERTICAL);
+	for (int32 i = 0; i < named->CountChannels(); i++) {
+		const char name[] = {static_cast<char>('a' + i), '\0'};
+		named->SetLimitLabelsFor(i, name, NULL);
+	}
+	named->SetEnabled(false);
+	page->AddChild(upright);
+	page->AddChild(named);
+}
+
 } // namespace
 
 
@@ -96,5 +127,6 @@ MakeSlidersPage(BRect frame)
 	BView* page = MakePage(frame, "Sliders");
 	AddHorizontal(page);
 	AddVertical(page);
+	AddChannels(page);
 	return page;
 }
