@@ -37,8 +37,11 @@ def use_display(desktop, program, _):
         time.sleep(MEASURED)
         return ticks(one.process) - before
 
-    # A busy machine may still have the window's last changes under way the first time.
-    used = min(used_while_idle() for _ in range(3))
+    # A busy machine may still have the window's last changes under way the first times.
+    for _ in range(3):
+        used = used_while_idle()
+        if used <= 1:
+            break
     check(used <= 1, f"the idle program used {used} of {os.sysconf('SC_CLK_TCK') * MEASURED} ticks")
     print(f"idle, the program used {used} ticks in {MEASURED} s", flush=True)
 
