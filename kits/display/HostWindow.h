@@ -60,8 +60,8 @@ public:
 	/// to the active window.
 	/// B_WINDOW_ACTIVATED: "active". B_WINDOW_MOVED: "where". B_WINDOW_RESIZED: "width", "height". Both have
 	/// kAskedFor when they come of SetFrame().
-	/// B_MINIMIZE: "minimize" (the host already did it). What the host's zoom button does comes as a move
-	/// and a resize.
+	/// B_MINIMIZE: "minimize" (the host already did it). B_ZOOM: the host's zoom button; the new frame has
+	/// come as a move and a resize before.
 	/// B_SCREEN_CHANGED: "frame", "mode". B_QUIT_REQUESTED: the close button.
 	virtual void Deliver(std::unique_ptr<BMessage> message) = 0;
 
@@ -123,6 +123,13 @@ public:
 	virtual void SetCursor(std::shared_ptr<const CursorShape> cursor) = 0;
 	/// All pointer input comes here, wherever the pointer is, as far as the host allows: for open menus.
 	virtual void SetPointerGrab(bool grab) = 0;
+
+	/// As if the user did it by the window's border and buttons, for tests and scripts: the client hears
+	/// of it as of the user's doing.
+	virtual void InjectFrame(BRect frame) = 0;
+	virtual void InjectMinimized(bool minimized) = 0;
+	/// The zoom button; a second time brings the frame back. Nothing where there is none.
+	virtual void InjectZoom() = 0;
 };
 
 } // namespace BPrivate

@@ -6,6 +6,7 @@
 #include <cmath>
 #include <cstring>
 
+#include <Application.h>
 #include <OS.h>
 #include <View.h>
 #include <Window.h>
@@ -133,9 +134,18 @@ void
 InputHub::SetMinimized(StackedWindow* window, bool minimized)
 {
 	std::lock_guard<std::mutex> lock(fMutex);
+	if (window->isMinimized == minimized)
+		return;
+
 	window->isMinimized = minimized;
-	if (minimized && fActive == window && fManagesFocus)
+	if (!fManagesFocus)
+		return;
+	if (minimized && fActive == window)
 		ActivateNext();
+	else if (!minimized && window->isVisible) {
+		fStack.Raise(window);
+		ActivateLocked(window);
+	}
 }
 
 
@@ -271,6 +281,11 @@ InputHub::SetActiveLocked(StackedWindow* window)
 		message->AddInt64("when", system_time());
 		message->AddBool("active", one == fActive);
 		one->client->Deliver(std::move(message));
+	}
+	if (fManagesFocus && be_app != nullptr && (changed[0] == nullptr || changed[1] == nullptr)) {
+		BMessage activated(B_APP_ACTIVATED);
+		activated.AddBool("active", fActive != nullptr);
+		be_app->PostMessage(&activated);
 	}
 }
 

@@ -28,19 +28,26 @@ NoneWindow::~NoneWindow()
 void
 NoneWindow::SetFrame(BRect frame)
 {
+	ReportFrame(frame, true);
+}
+
+
+void
+NoneWindow::ReportFrame(BRect frame, bool askedFor)
+{
 	BRect old = fHub.Frame(&fStacked);
 	fHub.SetFrame(&fStacked, frame);
 	if (frame.LeftTop() != old.LeftTop()) {
 		auto message = std::make_unique<BMessage>(B_WINDOW_MOVED);
 		message->AddPoint("where", frame.LeftTop());
-		message->AddBool(kAskedFor, true);
+		message->AddBool(kAskedFor, askedFor);
 		fHub.Deliver(&fStacked, std::move(message));
 	}
 	if (frame.Width() != old.Width() || frame.Height() != old.Height()) {
 		auto message = std::make_unique<BMessage>(B_WINDOW_RESIZED);
 		message->AddInt32("width", frame.IntegerWidth());
 		message->AddInt32("height", frame.IntegerHeight());
-		message->AddBool(kAskedFor, true);
+		message->AddBool(kAskedFor, askedFor);
 		fHub.Deliver(&fStacked, std::move(message));
 	}
 }
@@ -173,6 +180,30 @@ void
 NoneWindow::SetPointerGrab(bool grab)
 {
 	fHub.SetGrab(&fStacked, grab);
+}
+
+
+void
+NoneWindow::InjectFrame(BRect frame)
+{
+	ReportFrame(frame, false);
+}
+
+
+void
+NoneWindow::InjectMinimized(bool minimized)
+{
+	fHub.SetMinimized(&fStacked, minimized);
+	auto message = std::make_unique<BMessage>(B_MINIMIZE);
+	message->AddBool("minimize", minimized);
+	fHub.Deliver(&fStacked, std::move(message));
+}
+
+
+void
+NoneWindow::InjectZoom()
+{
+	// It has no buttons.
 }
 
 } // namespace BPrivate

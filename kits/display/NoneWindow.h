@@ -32,8 +32,13 @@ public:
 	Picture ReadPicture() const override;
 	void SetCursor(std::shared_ptr<const CursorShape> cursor) override;
 	void SetPointerGrab(bool grab) override;
+	void InjectFrame(BRect frame) override;
+	void InjectMinimized(bool minimized) override;
+	void InjectZoom() override;
 
 private:
+	void ReportFrame(BRect frame, bool askedFor);
+
 	InputHub& fHub;
 	StackedWindow fStacked;
 };

@@ -18,6 +18,8 @@ class BWindow;
 
 namespace BPrivate {
 
+class HostWindow;
+
 /// Input goes through the display's injection, so it takes the way of real input from there on. After
 /// each step the robot waits, within its limit, until the windows have handled what they were sent and
 /// their pictures are up to date; a window that is busy (an alert, a tracking loop) is not waited for.
@@ -43,6 +45,14 @@ public:
 	/// The same with a view; waits for it to appear. B_NAME_NOT_FOUND without it.
 	status_t WithView(
 		const BMessenger& window, const char* view, const std::function<void(BView*)>& task);
+
+	// The window's border: what the user does with it. B_BAD_VALUE when the window is gone,
+	// B_TIMED_OUT when the host does not do it.
+	/// \a frame: of the content, on the screen.
+	status_t PlaceWindow(const BMessenger& window, BRect frame);
+	status_t MinimizeWindow(const BMessenger& window, bool minimize);
+	/// Presses the zoom button.
+	status_t ZoomWindow(const BMessenger& window);
 
 	// Places, in screen coordinates
 	status_t GetWindowFrame(const BMessenger& window, BRect* frame);
@@ -83,6 +93,8 @@ public:
 	status_t SaveWindow(const BMessenger& window, const char* path);
 
 private:
+	status_t WithHost(const BMessenger& window, const std::function<void(HostWindow&)>& task);
+	status_t WaitForHost(const BMessenger& window, const std::function<bool(BWindow*)>& isDone);
 	/// \a limit: for each window.
 	bool SettleOnce(bigtime_t limit);
 	bool SettleWindow(BWindow* window, bigtime_t limit);

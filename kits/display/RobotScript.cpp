@@ -157,6 +157,12 @@ private:
 	status_t Pause(const Arguments& arguments);
 	status_t Limit(const Arguments& arguments);
 	status_t CloseWindow(const Arguments& arguments);
+	status_t MoveWindow(const Arguments& arguments);
+	status_t ResizeWindow(const Arguments& arguments);
+	status_t MinimizeWindow(const Arguments& arguments);
+	status_t RestoreWindow(const Arguments& arguments);
+	status_t ZoomWindow(const Arguments& arguments);
+	status_t Print(const Arguments& arguments);
 	status_t Quit(const Arguments& arguments);
 
 	const std::string fPath;
@@ -196,6 +202,12 @@ const ScriptRunner::Command ScriptRunner::kCommands[] = {
 	{"pause", 1, 1, &ScriptRunner::Pause},
 	{"limit", 1, 1, &ScriptRunner::Limit},
 	{"close-window", 0, 0, &ScriptRunner::CloseWindow},
+	{"move-window", 2, 2, &ScriptRunner::MoveWindow},
+	{"resize-window", 2, 2, &ScriptRunner::ResizeWindow},
+	{"minimize-window", 0, 0, &ScriptRunner::MinimizeWindow},
+	{"restore-window", 0, 0, &ScriptRunner::RestoreWindow},
+	{"zoom-window", 0, 0, &ScriptRunner::ZoomWindow},
+	{"print", 1, 1, &ScriptRunner::Print},
 	{"quit", 0, 0, &ScriptRunner::Quit},
 };
 
@@ -624,6 +636,60 @@ ScriptRunner::CloseWindow(const Arguments&)
 	status_t status = fWindow.SendMessage(B_QUIT_REQUESTED);
 	fRobot.Settle();
 	return status;
+}
+
+
+status_t
+ScriptRunner::MoveWindow(const Arguments& arguments)
+{
+	BRect frame;
+	status_t status = fRobot.GetWindowFrame(fWindow, &frame);
+	if (status != B_OK)
+		return status;
+	frame.OffsetTo(strtof(arguments[0].c_str(), nullptr), strtof(arguments[1].c_str(), nullptr));
+	return fRobot.PlaceWindow(fWindow, frame);
+}
+
+
+status_t
+ScriptRunner::ResizeWindow(const Arguments& arguments)
+{
+	BRect frame;
+	status_t status = fRobot.GetWindowFrame(fWindow, &frame);
+	if (status != B_OK)
+		return status;
+	frame.right = frame.left + strtof(arguments[0].c_str(), nullptr);
+	frame.bottom = frame.top + strtof(arguments[1].c_str(), nullptr);
+	return fRobot.PlaceWindow(fWindow, frame);
+}
+
+
+status_t
+ScriptRunner::MinimizeWindow(const Arguments&)
+{
+	return fRobot.MinimizeWindow(fWindow, true);
+}
+
+
+status_t
+ScriptRunner::RestoreWindow(const Arguments&)
+{
+	return fRobot.MinimizeWindow(fWindow, false);
+}
+
+
+status_t
+ScriptRunner::ZoomWindow(const Arguments&)
+{
+	return fRobot.ZoomWindow(fWindow);
+}
+
+
+status_t
+ScriptRunner::Print(const Arguments& arguments)
+{
+	printf("%s\n", arguments[0].c_str());
+	return B_OK;
 }
 
 

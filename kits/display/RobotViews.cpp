@@ -26,6 +26,7 @@ namespace {
 
 const bigtime_t kRetryTime = 10000;
 const bigtime_t kLockTime = 200000;
+const bigtime_t kZoomTime = 150000;
 
 
 bool
@@ -276,6 +277,79 @@ Robot::WithView(const BMessenger& window, const char* name, const std::function<
 		Pause(kRetryTime);
 	} while (system_time() < end);
 	return B_NAME_NOT_FOUND;
+}
+
+
+status_t
+Robot::WithHost(const BMessenger& window, const std::function<void(HostWindow&)>& task)
+{
+	bool hasHost = false;
+	status_t status = WithWindow(window, [&](BWindow* target) {
+		HostWindow* host = WindowData::Of(target).host.get();
+		hasHost = host != nullptr;
+		if (hasHost)
+			task(*host);
+	});
+	return status == B_OK && !hasHost ? B_BAD_VALUE : status;
+}
+
+
+/// The host's answer comes in its own time: waits until \a isDone holds for the window.
+status_t
+Robot::WaitForHost(const BMessenger& window, const std::function<bool(BWindow*)>& isDone)
+{
+	bool done = false;
+	const bigtime_t end = system_time() + fLimit;
+	while (!done) {
+		status_t status = WithWindow(window, [&](BWindow* target) { done = isDone(target); });
+		if (status != B_OK)
+			return status;
+		if (!done && system_time() > end)
+			return B_TIMED_OUT;
+		if (!done)
+			Pause(kRetryTime);
+	}
+	Settle();
+	return B_OK;
+}
+
+
+status_t
+Robot::PlaceWindow(const BMessenger& window, BRect frame)
+{
+	status_t status = WithHost(window, [frame](HostWindow& host) { host.InjectFrame(frame); });
+	if (status != B_OK)
+		return status;
+	return WaitForHost(window, [frame](BWindow* target) { return target->Frame() == frame; });
+}
+
+
+status_t
+Robot::MinimizeWindow(const BMessenger& window, bool minimize)
+{
+	status_t status =
+		WithHost(window, [minimize](HostWindow& host) { host.InjectMinimized(minimize); });
+	if (status != B_OK)
+		return status;
+	return WaitForHost(
+		window, [minimize](BWindow* target) { return target->IsMinimized() == minimize; });
+}
+
+
+status_t
+Robot::ZoomWindow(const BMessenger& window)
+{
+	BRect before;
+	status_t status = GetWindowFrame(window, &before);
+	if (status == B_OK)
+		status = WithHost(window, [](HostWindow& host) { host.InjectZoom(); });
+	if (status != B_OK)
+		return status;
+	status = WaitForHost(window, [before](BWindow* target) { return target->Frame() != before; });
+	// The window hears of the button after the frame.
+	Pause(kZoomTime);
+	Settle();
+	return status;
 }
 
 

@@ -153,8 +153,10 @@ WindowData::DispatchWindowMessage(BMessage* message, BHandler* handler)
 			return true;
 
 		case B_ZOOM:
-			// The new frame of the host's own button comes by messages.
-			if (!message->GetBool(kFromHost, false))
+			// The host's own button did it already: the window has the frame, and the hook only hears of it.
+			if (message->GetBool(kFromHost, false))
+				window->Zoom(frame.LeftTop(), frame.Width(), frame.Height());
+			else
 				window->Zoom();
 			return true;
 

@@ -261,4 +261,28 @@ QtHostWindow::SetPointerGrab(bool grab)
 	WithWindow([&](QtWindow& window) { window.setMouseGrabEnabled(grab); });
 }
 
+
+void
+QtHostWindow::InjectFrame(BRect frame)
+{
+	WithWindow([&](QtWindow& window) {
+		window.setGeometry(static_cast<int>(frame.left), static_cast<int>(frame.top),
+			frame.IntegerWidth() + 1, frame.IntegerHeight() + 1);
+	});
+}
+
+
+void
+QtHostWindow::InjectMinimized(bool minimized)
+{
+	WithWindow([&](QtWindow& window) { window.MinimizeByUser(minimized); });
+}
+
+
+void
+QtHostWindow::InjectZoom()
+{
+	WithWindow([](QtWindow& window) { window.ZoomByUser(); });
+}
+
 } // namespace BPrivate

@@ -48,6 +48,9 @@ public:
 	Picture ReadPicture() const override;
 	void SetCursor(std::shared_ptr<const CursorShape> cursor) override;
 	void SetPointerGrab(bool grab) override;
+	void InjectFrame(BRect frame) override;
+	void InjectMinimized(bool minimized) override;
+	void InjectZoom() override;
 
 private:
 	/// Runs in the display thread while the host's window is there, and waits.

@@ -10,6 +10,7 @@
 #include <QMouseEvent>
 #include <QPainter>
 #include <QScreen>
+#include <QTimer>
 #include <QWheelEvent>
 
 #include <AppDefs.h>
@@ -30,6 +31,8 @@ namespace {
 const QColor kUndrawnColor(216, 216, 216);
 const int kWheelStep = 120;
 const int kLargestSize = 32767;
+// Milliseconds.
+const int kZoomDelay = 100;
 
 
 BPoint
@@ -123,6 +126,8 @@ QtWindow::QtWindow(QtDisplay& display, std::shared_ptr<Surface> surface, Stacked
 	  fSurface(std::move(surface)),
 	  fStacked(stacked),
 	  fIsMinimized(false),
+	  fIsZoomed(false),
+	  fMustTellZoom(false),
 	  fIsAway(false)
 {
 	setSurfaceType(QSurface::RasterSurface);
@@ -288,6 +293,26 @@ QtWindow::Minimize(bool minimized)
 }
 
 
+void
+QtWindow::MinimizeByUser(bool minimized)
+{
+	Qt::WindowStates states = windowStates();
+	states.setFlag(Qt::WindowMinimized, minimized);
+	setWindowStates(states);
+}
+
+
+void
+QtWindow::ZoomByUser()
+{
+	if ((fStyle.flags & B_NOT_ZOOMABLE) != 0)
+		return;
+	Qt::WindowStates states = windowStates();
+	states.setFlag(Qt::WindowMaximized, (states & Qt::WindowMaximized) == 0);
+	setWindowStates(states);
+}
+
+
 BRect
 QtWindow::FrameWithBorder() const
 {
@@ -394,6 +419,7 @@ QtWindow::GeometryChanged()
 		fRequested.clear();
 	if (isVisible())
 		fDisplay.ReportFrame(fStacked, RectOf(now), false);
+	TellZoom();
 }
 
 
@@ -525,6 +551,14 @@ QtWindow::HandleWheel(QWheelEvent* event)
 void
 QtWindow::HandleState()
 {
+	bool zoomed = (windowStates() & Qt::WindowMaximized) != 0;
+	if (zoomed != fIsZoomed) {
+		fIsZoomed = zoomed;
+		fMustTellZoom = true;
+		// The host tells of the new frame before or after the state, in two steps or one.
+		QTimer::singleShot(kZoomDelay, this, [this] { TellZoom(); });
+	}
+
 	bool minimized = (windowStates() & Qt::WindowMinimized) != 0;
 	if (minimized == fIsMinimized)
 		return;
@@ -533,6 +567,16 @@ QtWindow::HandleState()
 	auto message = std::make_unique<BMessage>(B_MINIMIZE);
 	message->AddBool("minimize", minimized);
 	fDisplay.Hub().Deliver(fStacked, std::move(message));
+}
+
+
+void
+QtWindow::TellZoom()
+{
+	if (!fMustTellZoom)
+		return;
+	fMustTellZoom = false;
+	fDisplay.Hub().Deliver(fStacked, std::make_unique<BMessage>(B_ZOOM));
 }
 
 } // namespace BPrivate

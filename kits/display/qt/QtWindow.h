@@ -37,6 +37,9 @@ public:
 	void HideWhileInactive();
 	void ShowAgain();
 	void Minimize(bool minimized);
+	/// The same as the user's doing, which the host reports.
+	void MinimizeByUser(bool minimized);
+	void ZoomByUser();
 	/// Shows what has changed in the surface.
 	void ShowDamage();
 	/// Paints \a region of the picture, and what follows the pointer on top.
@@ -64,6 +67,7 @@ private:
 	void HandleMouse(QMouseEvent* event);
 	void HandleWheel(QWheelEvent* event);
 	void HandleState();
+	void TellZoom();
 	void HandleDragOver(QDragMoveEvent* event);
 	void HandleDrop(QDropEvent* event);
 
@@ -74,6 +78,8 @@ private:
 	HostWindowStyle fStyle;
 	HostSizeLimits fLimits;
 	bool fIsMinimized;
+	bool fIsZoomed;
+	bool fMustTellZoom;
 	bool fIsAway;
 	/// What was asked of the host and not yet seen to happen, oldest first.
 	std::vector<QRect> fRequested;

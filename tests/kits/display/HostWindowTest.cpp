@@ -10,6 +10,7 @@
 
 #include <gtest/gtest.h>
 
+#include <OS.h>
 #include <Region.h>
 #include <Window.h>
 
@@ -120,6 +121,37 @@ TEST_F(HostWindowTest, MovesAndSizesAreReportedOnce)
 	fWindow->Sync();
 	EXPECT_EQ(fClient.Codes(), "moved resized");
 	EXPECT_EQ(fClient.Last().GetInt32("width", 0), 119);
+}
+
+
+TEST_F(HostWindowTest, WhatTheUserDoesByTheBorderIsNews)
+{
+	// The host answers in its own time.
+	const auto WaitFor = [this](const std::string& wanted) {
+		std::string codes;
+		for (int i = 0; i < 1000 && codes != wanted; i++) {
+			snooze(5000);
+			const std::string more = fClient.Codes();
+			codes += (codes.empty() || more.empty() ? "" : " ") + more;
+		}
+		EXPECT_EQ(codes, wanted);
+	};
+	fWindow->Show();
+	WaitFor("active");
+	fWindow->InjectFrame(BRect(70, 60, 169, 119));
+	WaitFor("moved");
+	EXPECT_FALSE(fClient.Last().GetBool(BPrivate::kAskedFor, true));
+	fWindow->InjectFrame(BRect(70, 60, 179, 129));
+	WaitFor("resized");
+	EXPECT_FALSE(fClient.Last().GetBool(BPrivate::kAskedFor, true));
+	fWindow->InjectZoom();
+	WaitFor("moved resized zoomed");
+	fWindow->InjectZoom();
+	WaitFor("moved resized zoomed");
+	fWindow->InjectMinimized(true);
+	WaitFor("inactive minimized");
+	fWindow->InjectMinimized(false);
+	WaitFor("active restored");
 }
 
 

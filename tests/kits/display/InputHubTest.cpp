@@ -78,6 +78,24 @@ TEST_F(InputHubTest, AShownWindowBecomesActive)
 }
 
 
+TEST_F(InputHubTest, AWindowThatIsRestoredBecomesActive)
+{
+	TestWindow first(fHub, BRect(0, 0, 99, 99));
+	TestWindow second(fHub, BRect(50, 0, 149, 99));
+	fHub.SetMinimized(&second.stacked, true);
+	Forget({&first, &second});
+	fHub.SetMinimized(&second.stacked, false);
+	EXPECT_EQ(first.client.Codes(), "inactive");
+	EXPECT_EQ(second.client.Codes(), "active");
+	EXPECT_TRUE(fHub.IsFront(&second.stacked));
+	// It is that already.
+	fHub.Activate(&first.stacked);
+	Forget({&first, &second});
+	fHub.SetMinimized(&second.stacked, false);
+	EXPECT_EQ(second.client.Codes(), "");
+}
+
+
 TEST_F(InputHubTest, APressCarriesItsFields)
 {
 	TestWindow window(fHub, BRect(100, 50, 199, 149));

@@ -83,6 +83,11 @@ private:
 				return "moved";
 			case B_WINDOW_RESIZED:
 				return "resized";
+			case B_MINIMIZE:
+				message.FindBool("minimize", &active);
+				return active ? "minimized" : "restored";
+			case B_ZOOM:
+				return "zoomed";
 			default:
 				return "other";
 		}
