@@ -2,12 +2,21 @@
 
 #include <ormi/Form.h>
 
+#include <atomic>
+
 #include <Application.h>
 
 #include <ormi/FormView.h>
 #include <ormi/Part.h>
 
 namespace {
+
+// Of the program.
+std::atomic<int32> sForms = 0;
+std::atomic<bool> sMainFormIsGone = false;
+
+/// How often handlers may move the focus on while they are told of it. The rest waits for the next message.
+const int32 kFocusRounds = 8;
 
 /// Calls the handlers of \a view and the views in it, in the order in which the platform attaches.
 void
@@ -23,15 +32,32 @@ TellAttached(BView* view)
 }
 
 
-/// Tells \a view and the views in it where the focus of their form is.
-void
-TellFocusChanged(BView* view, const BView* focus)
+/// The part that \a view is, or the nearest one around it; null when there is none.
+TFormPart*
+PartAround(BView* view)
+{
+	for (; view != nullptr; view = view->Parent()) {
+		TFormPart* part = dynamic_cast<TFormPart*>(view);
+		if (part != nullptr)
+			return part;
+	}
+	return nullptr;
+}
+
+
+/// The part of \a view or the views in it whose address is \a wanted, which may be gone.
+TFormPart*
+FindPart(BView* view, const TFormPart* wanted)
 {
 	TFormPart* part = dynamic_cast<TFormPart*>(view);
-	if (part != nullptr)
-		part->FormFocusChanged(focus);
-	for (BView* child = view->ChildAt(0); child != nullptr; child = child->NextSibling())
-		TellFocusChanged(child, focus);
+	if (part != nullptr && part == wanted)
+		return part;
+	for (BView* child = view->ChildAt(0); child != nullptr; child = child->NextSibling()) {
+		part = FindPart(child, wanted);
+		if (part != nullptr)
+			return part;
+	}
+	return nullptr;
 }
 
 
@@ -41,9 +67,9 @@ TellDispatched(const BMessage* message, BView* view)
 {
 	if (view == nullptr || dynamic_cast<TFormPart*>(view) != nullptr)
 		return;
-	TFormPart* part = dynamic_cast<TFormPart*>(view->Parent());
+	TFormPart* part = PartAround(view);
 	if (part != nullptr)
-		part->FormChildDispatched(view, message);
+		part->FormInnerDispatched(view, message);
 }
 
 } // namespace
@@ -51,10 +77,11 @@ TellDispatched(const BMessage* message, BView* view)
 TForm::TForm(BRect frame, const char* title, window_look look, window_feel feel, uint32 flags)
 	: BWindow(frame, title, look, feel, flags | B_ASYNCHRONOUS_CONTROLS),
 	  fFormView(nullptr),
-	  fLastFocus(nullptr),
+	  fFocusedPart(nullptr),
 	  fIsMainForm(false),
 	  fIsOpen(false)
 {
+	sForms++;
 }
 
 
@@ -66,7 +93,11 @@ TForm::~TForm()
 		fFormView->RemoveSelf();
 		delete fFormView;
 	}
-	if (fIsMainForm && be_app != nullptr)
+	// A form that refused to go with the main form ends the program when it is the last.
+	const bool isLast = --sForms == 0;
+	if (fIsMainForm)
+		sMainFormIsGone = true;
+	if ((fIsMainForm || (isLast && sMainFormIsGone)) && be_app != nullptr)
 		be_app->PostMessage(B_QUIT_REQUESTED);
 }
 
@@ -133,6 +164,8 @@ void
 TForm::MakeMainForm(bool isMainForm)
 {
 	fIsMainForm = isMainForm;
+	if (isMainForm)
+		sMainFormIsGone = false;
 }
 
 
@@ -230,14 +263,22 @@ TForm::Open()
 
 
 // The focus of a text field is that of the view in it, whose hooks are out of reach: so the form looks
-// where the focus went, after each message. The part that lost it is told first.
+// where the focus went, after each message. The part that lost it is told first; its handler may move the
+// focus again, or take parts away.
 void
 TForm::TellFocus()
 {
-	const BView* focus = CurrentFocus();
-	if (!fIsOpen || fFormView == nullptr || focus == fLastFocus)
-		return;
-	fLastFocus = focus;
-	TellFocusChanged(fFormView, nullptr);
-	TellFocusChanged(fFormView, focus);
+	for (int32 round = 0; round < kFocusRounds; round++) {
+		if (!fIsOpen || fFormView == nullptr)
+			return;
+		TFormPart* focused = PartAround(CurrentFocus());
+		if (focused == fFocusedPart)
+			return;
+		TFormPart* before = FindPart(fFormView, fFocusedPart);
+		fFocusedPart = focused;
+		if (before != nullptr)
+			before->FormFocusChanged(false);
+		if (focused != nullptr && PartAround(CurrentFocus()) == focused)
+			focused->FormFocusChanged(true);
+	}
 }

@@ -30,9 +30,8 @@ TFormView::FormAllAttached()
 
 
 void
-TFormView::FormFocusChanged(const BView* focus)
+TFormView::FormFocusChanged(bool hasFocus)
 {
-	const bool hasFocus = focus == this;
 	if (hasFocus == fHasFocus)
 		return;
 	fHasFocus = hasFocus;
@@ -44,8 +43,9 @@ TFormView::FormFocusChanged(const BView* focus)
 
 
 void
-TFormView::FormChildDispatched(const BView*, const BMessage*)
+TFormView::FormInnerDispatched(const BView*, const BMessage*)
 {
+	// What a program put on the form by itself is no part of the form.
 }
 
 

@@ -326,3 +326,47 @@ TEST_F(ComponentsTest, AComponentWithoutHandlersKeepsQuiet)
 	EXPECT_EQ(TakeEvents(), Lines());
 	Locked([&] { EXPECT_EQ(button->ParentForm(), fForm); });
 }
+
+
+TEST_F(ComponentsTest, AFrameThatIsChangedAndGivenBackIsNoNews)
+{
+	Locked([&] {
+		fForm->Button1->ResizeTo(300, 10);
+		fForm->Button1->MoveTo(0, 0);
+		fForm->Button1->MoveTo(10, 10);
+		fForm->Button1->ResizeTo(79, 24);
+		fForm->CheckBox1->ResizeTo(50, 10);
+		fForm->CheckBox1->ResizeTo(60, 10);
+	});
+	EXPECT_EQ(TakeEvents(), Lines{"CheckBox1FrameResized 60,10"});
+}
+
+
+TEST_F(ComponentsTest, WhatAComponentIsMadeOfCountsAsTheComponent)
+{
+	TScrollView<TEventForm>* scroll = nullptr;
+	Locked([&] {
+		scroll = new TScrollView<TEventForm>(
+			fForm, BRect(160, 110, 259, 189), "scroll", true, true, B_PLAIN_BORDER);
+		scroll->OnMouseDown = &TEventForm::Box1MouseDown;
+		scroll->OnMouseMoved = &TEventForm::Box1MouseMoved;
+		scroll->OnKeyDown = &TEventForm::Box1KeyDown;
+		scroll->OnGotFocus = &TEventForm::Box1GotFocus;
+		scroll->OnLostFocus = &TEventForm::Box1LostFocus;
+		fForm->FormView()->AddChild(scroll);
+		scroll->Page()->SetFlags(scroll->Page()->Flags() | B_NAVIGABLE);
+	});
+	Forget();
+	Pointer(B_MOUSE_MOVED, BPoint(200, 140));
+	Click(BPoint(200, 140));
+	EXPECT_EQ(TakeEvents(), (Lines{"Box1MouseMoved 40,30,0", "Box1MouseDown 40,30"}));
+	Locked([&] { scroll->Page()->MakeFocus(); });
+	EXPECT_EQ(TakeEvents(), (Lines{"LostFocus", "Box1GotFocus"}));
+	Key('x');
+	EXPECT_EQ(TakeEvents(), Lines{"Box1KeyDown"});
+	// From one of its views to another.
+	Locked([&] { scroll->MakeFocus(); });
+	EXPECT_EQ(TakeEvents(), Lines());
+	Locked([&] { fForm->Button1->MakeFocus(); });
+	EXPECT_EQ(TakeEvents(), (Lines{"Box1LostFocus", "Button1GotFocus"}));
+}

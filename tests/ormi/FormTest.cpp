@@ -330,3 +330,45 @@ TEST_F(FormTest, TheFirstViewStays)
 	EXPECT_EQ(other->Window(), nullptr);
 	delete other;
 }
+
+
+TEST_F(FormTest, AHandlerMayMoveTheFocusBack)
+{
+	class TStubbornForm : public TEventForm {
+	public:
+		void TextControl1LostFocus() override
+		{
+			TEventForm::TextControl1LostFocus();
+			TextControl1->MakeFocus();
+		}
+	};
+	Close();
+	fForm = new TStubbornForm;
+	Open();
+	Locked([&] { fForm->TextControl1->MakeFocus(); });
+	TakeEvents();
+	Locked([&] { fForm->Button1->MakeFocus(); });
+	EXPECT_EQ(TakeEvents(), (Lines{"TextControl1LostFocus", "TextControl1GotFocus"}));
+	EXPECT_TRUE(fForm->TextControl1->TextView()->IsFocus());
+}
+
+
+TEST_F(FormTest, AHandlerMayDeleteTheComponentThatLostTheFocus)
+{
+	class TTidyForm : public TEventForm {
+	public:
+		void Button1LostFocus() override
+		{
+			TEventForm::Button1LostFocus();
+			Button1->RemoveSelf();
+			delete Button1;
+		}
+	};
+	Close();
+	fForm = new TTidyForm;
+	Open();
+	Locked([&] { fForm->Button1->MakeFocus(); });
+	TakeEvents();
+	Locked([&] { fForm->CheckBox1->MakeFocus(); });
+	EXPECT_EQ(Beginning(TakeEvents(), "CheckBox1"), Lines{"CheckBox1GotFocus"});
+}

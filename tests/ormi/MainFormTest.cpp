@@ -6,6 +6,7 @@
 #include <gtest/gtest.h>
 
 #include <Application.h>
+#include <Autolock.h>
 
 #include "EventForm.h"
 
@@ -67,6 +68,44 @@ TEST(MainFormTest, TheEndOfTheMainFormQuitsTheProgram)
 	EXPECT_EQ(app.askedAfterOtherForm, 0);
 	EXPECT_EQ(app.asked, 1);
 	EXPECT_EQ(app.CountWindows(), 0);
+}
+
+
+TEST(MainFormTest, TheLastFormEndsTheProgramWhenItRefusedToGoWithTheMainForm)
+{
+	class TPatientApp : public BApplication {
+	public:
+		TPatientApp()
+			: BApplication("application/x-vnd.plimworks-ormi-test"),
+			  stubborn(new TEventForm),
+			  other(new TEventForm)
+		{
+			TForm* form = new TEventForm;
+			form->MakeMainForm(true);
+			for (TForm* one : {form, static_cast<TForm*>(stubborn), static_cast<TForm*>(other)})
+				one->Show();
+			stubborn->mayQuit = false;
+			form->PostMessage(B_QUIT_REQUESTED);
+		}
+
+		bool QuitRequested() override
+		{
+			asked++;
+			if (BApplication::QuitRequested())
+				return true;
+			other->PostMessage(B_QUIT_REQUESTED);
+			if (BAutolock lock(stubborn); lock.IsLocked())
+				stubborn->mayQuit = true;
+			stubborn->PostMessage(B_QUIT_REQUESTED);
+			return false;
+		}
+
+		TEventForm* stubborn;
+		TEventForm* other;
+		int asked = 0;
+	} app;
+	app.Run();
+	EXPECT_EQ(app.asked, 2);
 }
 
 

@@ -5,6 +5,7 @@
 
 #include <Window.h>
 
+class TFormPart;
 class TFormView;
 
 /// A form: a window with one view that fills it and carries the form's components.
@@ -39,7 +40,8 @@ public:
 	void SetFormView(TFormView* view);
 	TFormView* FormView() const { return fFormView; }
 
-	/// When the main form is gone, the application is asked to quit.
+	/// When the main form is gone, the application is asked to quit, and once more when the last form is
+	/// gone that refused then.
 	void MakeMainForm(bool isMainForm);
 	bool IsMainForm() const { return fIsMainForm; }
 
@@ -68,7 +70,7 @@ private:
 	void TellFocus();
 
 	TFormView* fFormView;
-	const BView* fLastFocus; // only compared: the view may be gone
+	const TFormPart* fFocusedPart; // only compared: it may be gone
 	bool fIsMainForm;
 	bool fIsOpen;
 };

@@ -21,8 +21,8 @@ public:
 
 	void FormAttached() override;
 	void FormAllAttached() override;
-	void FormFocusChanged(const BView* focus) override;
-	void FormChildDispatched(const BView* child, const BMessage* message) override;
+	void FormFocusChanged(bool hasFocus) override;
+	void FormInnerDispatched(const BView* inner, const BMessage* message) override;
 
 	void AllAttached() override;
 	void AttachedToWindow() override;

@@ -5,6 +5,7 @@
 
 #include <utility>
 
+#include <Message.h>
 #include <View.h>
 
 #include <ormi/views/FrameKeeper.h>
@@ -16,11 +17,12 @@ public:
 	virtual void FormAttached() = 0;
 	virtual void FormAllAttached() = 0;
 
-	/// The form's focus is \a focus now, null when it is nowhere.
-	virtual void FormFocusChanged(const BView* focus) = 0;
+	/// The part, or a view in it that is of no other part, has the form's focus or lost it. Tells nothing new
+	/// when that is so already.
+	virtual void FormFocusChanged(bool hasFocus) = 0;
 
-	/// \a child, a view in the part that is no part itself, got \a message.
-	virtual void FormChildDispatched(const BView* child, const BMessage* message) = 0;
+	/// \a inner, a view in the part that is of no other part, got \a message.
+	virtual void FormInnerDispatched(const BView* inner, const BMessage* message) = 0;
 
 protected:
 	~TFormPart() = default;
@@ -30,7 +32,7 @@ protected:
 ///
 /// An event is a pointer to such a member, null when the form has no handler for it. Handlers run in the
 /// window's thread with the window locked, after what the view itself does, and only while the form is
-/// open.
+/// open. Keys, mouse and focus of the views that the view is made of are its own.
 template <class Form, class View>
 class TPart : public View, public TFormPart {
 public:
@@ -84,19 +86,59 @@ public:
 		View::SetFont(font, mask);
 	}
 
-	void FormAttached() override { Call(OnAttachedToWindow); }
+	void FormAttached() override
+	{
+		fToldFrame = this->Frame();
+		Call(OnAttachedToWindow);
+	}
+
 	void FormAllAttached() override { Call(OnAllAttached); }
 
-	void FormFocusChanged(const BView* focus) override
+	void FormFocusChanged(bool hasFocus) override
 	{
-		const bool hasFocus = focus == FocusView();
 		if (hasFocus == fHasFocus)
 			return;
 		fHasFocus = hasFocus;
 		Call(hasFocus ? OnGotFocus : OnLostFocus);
 	}
 
-	void FormChildDispatched(const BView*, const BMessage*) override {}
+	void FormInnerDispatched(const BView* inner, const BMessage* message) override
+	{
+		BPoint point;
+		message->FindPoint("be:view_where", &point);
+		point = this->ConvertFromScreen(inner->ConvertToScreen(point));
+		switch (message->what) {
+			case B_KEY_DOWN:
+				Call(OnKeyDown);
+				break;
+
+			case B_KEY_UP:
+				Call(OnKeyUp);
+				break;
+
+			case B_MOUSE_DOWN:
+				Call(OnMouseDown, point);
+				break;
+
+			case B_MOUSE_UP:
+				Call(OnMouseUp, point);
+				break;
+
+			case B_MOUSE_MOVED:
+			{
+				int32 transit = B_INSIDE_VIEW;
+				message->FindInt32("be:transit", &transit);
+				BMessage dragged;
+				const bool isDrag = message->FindMessage("be:drag_message", &dragged) == B_OK;
+				Call(OnMouseMoved, point, static_cast<uint32>(transit),
+					static_cast<const BMessage*>(isDrag ? &dragged : nullptr));
+				break;
+			}
+
+			default:
+				break;
+		}
+	}
 
 	void AllAttached() override
 	{
@@ -110,6 +152,7 @@ public:
 			Ormi::FrameKeeper keeper(this);
 			View::AttachedToWindow();
 		}
+		fToldFrame = this->Frame();
 		Call(OnAttachedToWindow);
 	}
 
@@ -128,13 +171,22 @@ public:
 	void FrameMoved(BPoint parentPoint) override
 	{
 		View::FrameMoved(parentPoint);
-		Call(OnFrameMoved, parentPoint);
+		const BPoint place = this->Frame().LeftTop();
+		if (place == fToldFrame.LeftTop())
+			return;
+		fToldFrame.OffsetTo(place);
+		Call(OnFrameMoved, place);
 	}
 
 	void FrameResized(float width, float height) override
 	{
 		View::FrameResized(width, height);
-		Call(OnFrameResized, width, height);
+		// A view that sized itself and got its frame back tells of both.
+		const BRect frame = this->Frame();
+		if (frame.Size() == fToldFrame.Size())
+			return;
+		fToldFrame = BRect(fToldFrame.LeftTop(), frame.Size());
+		Call(OnFrameResized, frame.Width(), frame.Height());
 	}
 
 	void KeyDown(const char* bytes, int32 numBytes) override
@@ -168,9 +220,6 @@ public:
 	}
 
 protected:
-	/// The view that has the focus when the part has it.
-	virtual const BView* FocusView() const { return this; }
-
 	/// Calls the handler of an event, if the form is open and has one.
 	template <class... Parameters, class... Arguments>
 	void Call(void (Form::*handler)(Parameters...), Arguments... arguments)
@@ -182,6 +231,7 @@ protected:
 private:
 	Form* fForm;
 	uint32 fNeededFlags;
+	BRect fToldFrame;
 	bool fHasFocus = false;
 };
 

@@ -5,14 +5,11 @@
 
 #include <Message.h>
 #include <TextControl.h>
-#include <TextView.h>
 
 #include <ormi/Part.h>
 
 /// A text field. OnChange: the text changed, by the user or by program. OnEnter: Enter was pressed, or
 /// the focus left, after a change.
-///
-/// Keys and mouse go to the field's text view; its events are those of the text field all the same.
 template <class Form>
 class TTextControl : public TPart<Form, BTextControl> {
 public:
@@ -40,47 +37,4 @@ public:
 		this->Call(changed ? OnChange : OnEnter);
 		return status;
 	}
-
-	void FormChildDispatched(const BView* child, const BMessage* message) override
-	{
-		if (child != this->TextView())
-			return;
-		BPoint point;
-		message->FindPoint("be:view_where", &point);
-		this->TextView()->ConvertToParent(&point);
-		switch (message->what) {
-			case B_KEY_DOWN:
-				this->Call(this->OnKeyDown);
-				break;
-
-			case B_KEY_UP:
-				this->Call(this->OnKeyUp);
-				break;
-
-			case B_MOUSE_DOWN:
-				this->Call(this->OnMouseDown, point);
-				break;
-
-			case B_MOUSE_UP:
-				this->Call(this->OnMouseUp, point);
-				break;
-
-			case B_MOUSE_MOVED:
-			{
-				int32 transit = B_INSIDE_VIEW;
-				message->FindInt32("be:transit", &transit);
-				BMessage dragged;
-				const bool isDrag = message->FindMessage("be:drag_message", &dragged) == B_OK;
-				this->Call(this->OnMouseMoved, point, static_cast<uint32>(transit),
-					static_cast<const BMessage*>(isDrag ? &dragged : nullptr));
-				break;
-			}
-
-			default:
-				break;
-		}
-	}
-
-protected:
-	const BView* FocusView() const override { return this->TextView(); }
 };
