@@ -46,11 +46,12 @@ if("thread" IN_LIST PLIM_SANITIZE)
   list(APPEND sanitizer_environment "TSAN_OPTIONS=${thread_options}")
 endif()
 
-# plim_test(NAME SOURCES file... [LIBRARIES target...])
+# plim_test(NAME SOURCES file... [LIBRARIES target...] [TOGETHER])
 #
-# One GoogleTest program; every test in it is a test of CTest, in a process of its own.
+# One GoogleTest program; every test in it is a test of CTest, in a process of its own. With TOGETHER, for tests that
+# share what takes long to set up, all are one test of CTest.
 function(plim_test name)
-  cmake_parse_arguments(PARSE_ARGV 1 arg "" "" "SOURCES;LIBRARIES;ENVIRONMENT")
+  cmake_parse_arguments(PARSE_ARGV 1 arg "TOGETHER" "" "SOURCES;LIBRARIES;ENVIRONMENT")
   add_executable(${name} ${arg_SOURCES})
   target_link_libraries(${name} PRIVATE plim_options ${arg_LIBRARIES} GTest::gmock GTest::gtest
     GTest::gtest_main)
@@ -69,6 +70,11 @@ function(plim_test name)
     "HOME=${CMAKE_BINARY_DIR}/tests/home" "XDG_CONFIG_HOME=${CMAKE_BINARY_DIR}/tests/home/.config"
     "XDG_DATA_HOME=${CMAKE_BINARY_DIR}/tests/home/.local/share" ${sanitizer_environment}
     ${arg_ENVIRONMENT})
+  if(arg_TOGETHER)
+    add_test(NAME ${name} COMMAND ${name})
+    set_tests_properties(${name} PROPERTIES TIMEOUT 120 ENVIRONMENT "${environment}")
+    return()
+  endif()
   gtest_discover_tests(${name} TEST_PREFIX ${name}. DISCOVERY_TIMEOUT 60 DISCOVERY_MODE PRE_TEST
     PROPERTIES TIMEOUT 120)
   # Only the first value of a list would get through there: the tests get it once they are known.

@@ -1,0 +1,524 @@
+// SPDX-License-Identifier: MIT
+// A generated program with every component class and every event, used like a person uses it: each event calls its
+// handler, with what it is about, in the order that the platform has.
+
+#include <algorithm>
+#include <set>
+#include <sstream>
+
+#include <gtest/gtest.h>
+
+#include "ProgramRun.h"
+#include "support/Printers.h"
+
+namespace {
+
+const BRect kForm(100, 80, 789, 479);
+// Beside the components.
+const BPoint kBare(5, 25);
+
+std::string
+At(BPoint point)
+{
+	std::ostringstream text;
+	text << point.x << " " << point.y;
+	return text.str();
+}
+
+
+std::string
+WithComma(float x, float y)
+{
+	std::ostringstream text;
+	text << x << "," << y;
+	return text.str();
+}
+
+
+/// Where to press a component: its middle, unless the mouse does more there than the test wants.
+BPoint
+Spot(const listed_event& component)
+{
+	const BRect& frame = component.frame;
+	if (component.className == "TMenuBar")
+		return BPoint(frame.right - 9, frame.top + 9);
+	return BPoint((frame.left + frame.right + 1) / 2, (frame.top + frame.bottom + 1) / 2);
+}
+
+
+/// Whether a press on it opens a menu.
+bool
+OpensMenu(const listed_event& component)
+{
+	return component.className == "TMenuField";
+}
+
+
+/// The components of the main form, each by its first event.
+std::vector<listed_event>
+Components()
+{
+	std::vector<listed_event> components;
+	for (const listed_event& event : ListedEvents()) {
+		const bool isKnown = !components.empty() && components.back().component == event.component;
+		if (event.owner == "Main" && !event.component.empty() && !isKnown)
+			components.push_back(event);
+	}
+	return components;
+}
+
+
+bool
+Has(const Lines& calls, const std::string& call)
+{
+	return std::find(calls.begin(), calls.end(), call) != calls.end();
+}
+
+
+/// Which of \a calls is \a call; a failure and -1 when none is.
+int
+Index(const Lines& calls, const std::string& call)
+{
+	const auto found = std::find(calls.begin(), calls.end(), call);
+	if (found == calls.end()) {
+		ADD_FAILURE() << call << " was not called";
+		return -1;
+	}
+	return static_cast<int>(found - calls.begin());
+}
+
+
+std::string
+Text(const Lines& calls)
+{
+	std::string text;
+	for (const std::string& call : calls)
+		text += "  " + call + "\n";
+	return text;
+}
+
+
+/// All that a user can do to the main form, in steps.
+class WholeRun : public ProgramRun {
+public:
+	WholeRun()
+	{
+		Do("wait-window Main");
+		Step("open");
+		UseForm();
+		UseMouse();
+		UseComponents();
+		UseKeys();
+		UseMenus();
+		UseBorder();
+		UseOtherForms();
+		Step("close");
+		Do("wait-window Main");
+		Do("close-window");
+		Run("", "word");
+	}
+
+private:
+	void UseForm()
+	{
+		Step("keys of the form");
+		Do("type \"x\"");
+		Step("mouse on the form");
+		Do("click " + At(kBare));
+	}
+
+	void UseMouse()
+	{
+		for (const listed_event& component : Components()) {
+			Do("move " + At(kBare));
+			Step("mouse on " + component.component);
+			Do("click " + At(Spot(component)));
+			if (!OpensMenu(component))
+				continue;
+			// The menu takes the release of the press that opened it.
+			Do("key escape");
+			Step("release on " + component.component);
+			Do("drag " + At(kBare) + " " + At(Spot(component)));
+		}
+	}
+
+	void UseComponents()
+	{
+		Step("components");
+		Do("click-view TextControl1");
+		Do("type \"x\"");
+		Do("key enter");
+		Do("double-click 440 132");
+		Do("double-click 600 132");
+		Do("click 559 134");
+		Do("click-view MenuField1");
+		Do("wait-window *");
+		Do("click-item Blue");
+		Do("wait-window Main");
+		Do("drag-view Slider1 30 0");
+		Do("click-view ColorControl1");
+		Do("click-view TextView1");
+		Do("type \"y\"");
+		Do("click 360 325");
+	}
+
+	void UseKeys()
+	{
+		Step("keys");
+		// A text takes the tab for itself: the others are reached from behind it.
+		Do("click-view ListView1");
+		Do("key shift+tab");
+		for (size_t i = 0; i < 2 * Components().size(); i++)
+			Do("key tab");
+	}
+
+	void UseMenus()
+	{
+		Step("menus");
+		for (const char* item : {"Hide and show", "Draw at once", "Elsewhere", "Post"}) {
+			Do("click-item Window");
+			Do(std::string("click-item \"") + item + "\"");
+			Do("wait-window Main");
+		}
+		for (const char* item : {"About", "Another screen", "Another workspace"}) {
+			Do("click-item System");
+			Do(std::string("click-item \"") + item + "\"");
+			Do("wait-window Main");
+		}
+	}
+
+	void UseBorder()
+	{
+		Step("border");
+		Do("move-window 120 90");
+		Do("resize-window 700 430");
+		Step("resized back");
+		Do("resize-window 689 399");
+		Step("minimized");
+		Do("minimize-window");
+		Do("restore-window");
+		Step("zoomed");
+		Do("zoom-window");
+		Do("zoom-window");
+	}
+
+	void UseOtherForms()
+	{
+		Step("another form");
+		Do("click-item Forms");
+		Do("click-item \"New note\"");
+		Do("wait-window \"Note 1\"");
+		Do("click-view Keep");
+		Do("type \"n\"");
+		Do("click-view Text");
+		Do("type \"n\"");
+		Step("kept");
+		Do("click-view Close");
+		Do("click-view Keep");
+		Step("closed");
+		Do("click-view Close");
+		Do("wait-no-window \"Note 1\"");
+		Do("wait-window Main");
+		Do("click-item Forms");
+		Do("click-item \"New note\"");
+		Do("wait-window \"Note 2\"");
+		Step("vanished");
+		Do("click-view Vanish");
+		Do("wait-no-window \"Note 2\"");
+	}
+};
+
+} // namespace
+
+class EventsTest : public testing::Test {
+protected:
+	static void SetUpTestSuite()
+	{
+		sRun = new WholeRun;
+		if (sRun->Code() != 0 || getenv("SHOW_EVENTS") != nullptr)
+			puts(sRun->Output().c_str());
+	}
+
+	static void TearDownTestSuite()
+	{
+		delete sRun;
+		sRun = nullptr;
+	}
+
+	void SetUp() override { ASSERT_EQ(sRun->Code(), 0) << "what the program told is above"; }
+
+	static WholeRun* sRun;
+};
+
+WholeRun* EventsTest::sRun = nullptr;
+
+
+TEST_F(EventsTest, EachEventOfEachClassCallsItsHandler)
+{
+	ProgramRun files;
+	files.Do("wait-window Main");
+	files.Do("close-window");
+	files.Run("BE_ARGUMENTS_ARE_FILES=1", EVENTS_LIST);
+	ASSERT_EQ(files.Code(), 0) << files.Output();
+	EXPECT_TRUE(Has(files.AllCalls(), "Events.OnRefsReceived _RRC,events.tsv"));
+
+	std::set<std::string> called;
+	for (const Lines& calls : {sRun->AllCalls(), files.AllCalls()}) {
+		for (const std::string& call : calls) {
+			std::string name = call.substr(0, call.find(' '));
+			// "Note 1.Keep.OnChange"
+			if (name == "Note")
+				name +=
+					call.substr(call.find('.'), call.find(' ', call.find('.')) - call.find('.'));
+			called.insert(name);
+		}
+	}
+	const std::vector<listed_event> events = ListedEvents();
+	EXPECT_GT(events.size(), 13u * Components().size());
+	for (const listed_event& event : events)
+		EXPECT_EQ(called.count(event.FullName()), 1u)
+			<< event.className << ": " << event.FullName();
+}
+
+
+TEST_F(EventsTest, HandlersRunWithTheirLooperLocked)
+{
+	for (const std::string& call : sRun->AllCalls())
+		EXPECT_EQ(call.find("(not locked)"), std::string::npos) << call;
+}
+
+
+TEST_F(EventsTest, AttachingGoesFromTheFormInwardsAndBack)
+{
+	Lines expected = {"Main.FormCreate", "Main.OnShow", "Main.OnAttachedToWindow"};
+	for (const listed_event& component : Components()) {
+		expected.push_back("Main." + component.component + ".OnAttachedToWindow");
+		expected.push_back("Main." + component.component + ".OnAllAttached");
+	}
+	expected.push_back("Main.OnAllAttached");
+	expected.push_back("Main.OnGotFocus");
+	Lines calls = sRun->AllCalls();
+	ASSERT_GE(calls.size(), expected.size());
+	calls.resize(expected.size());
+	EXPECT_EQ(calls, expected);
+}
+
+
+TEST_F(EventsTest, OpeningTellsOfNoFrames)
+{
+	for (const char* step : {"", "open"}) {
+		for (const std::string& call : sRun->Calls(step))
+			EXPECT_EQ(call.find(".OnFrame"), std::string::npos) << call;
+	}
+}
+
+
+TEST_F(EventsTest, ClosingAsksQuitsDetachesAndDestroys)
+{
+	Lines expected = {"Main.OnQuitRequested", "Main.OnQuit"};
+	for (const listed_event& component : Components())
+		expected.push_back("Main." + component.component + ".OnAllDetached");
+	expected.insert(expected.end(),
+		{"Main.OnAllDetached", "Main.OnHide", "Main.FormDestroy", "Events.OnQuitRequested"});
+	Lines calls;
+	for (const std::string& call : sRun->Calls("close")) {
+		// The application's own events come in another thread.
+		if (call.find("Events.OnAppActivated") != 0 && call.find("Events.OnPulse") != 0)
+			calls.push_back(call);
+	}
+	EXPECT_EQ(calls, expected);
+}
+
+
+TEST_F(EventsTest, TheApplicationsEventsComeInOrder)
+{
+	const Lines calls = sRun->AllCalls();
+	EXPECT_LT(Index(calls, "Events.OnArgvReceived 2 word"), Index(calls, "Events.OnReadyToRun"));
+	EXPECT_LT(Index(calls, "Events.OnReadyToRun"), Index(calls, "Events.OnPulse"));
+	EXPECT_TRUE(Has(calls, "Events.OnAppActivated 1"));
+	EXPECT_EQ(sRun->Calls("menus", "Events.OnAboutRequested").size(), 1u);
+}
+
+
+TEST_F(EventsTest, PointsAreInTheComponentsCoordinates)
+{
+	for (const listed_event& component : Components()) {
+		const std::string name = "Main." + component.component + ".";
+		const std::string step = "mouse on " + component.component;
+		const BPoint spot = Spot(component) - component.frame.LeftTop();
+		const std::string where = WithComma(spot.x, spot.y);
+		const Lines calls = sRun->Calls(step);
+		const Lines moves = sRun->Calls(step, name + "OnMouseMoved");
+		ASSERT_FALSE(moves.empty()) << component.className;
+		EXPECT_EQ(moves.front(), name + "OnMouseMoved " + where + " 0 none");
+		EXPECT_EQ(sRun->Calls(step, name + "OnMouseDown"), Lines{name + "OnMouseDown " + where});
+		EXPECT_EQ(sRun->Calls(OpensMenu(component) ? "release on " + component.component : step,
+					  name + "OnMouseUp"),
+			Lines{name + "OnMouseUp " + where});
+		EXPECT_LT(Index(calls, moves.front()), Index(calls, name + "OnMouseDown " + where));
+		// Nobody else hears of it.
+		for (const std::string& call : calls) {
+			const bool isClick = call.find(".OnMouseDown") != std::string::npos
+				|| call.find(".OnMouseUp") != std::string::npos;
+			EXPECT_TRUE(!isClick || call.find(name) == 0) << step << ": " << call;
+		}
+	}
+	EXPECT_EQ(sRun->Calls("mouse on the form", "Main.OnMouseDown"), Lines{"Main.OnMouseDown 5,25"});
+	EXPECT_EQ(sRun->Calls("mouse on the form", "Main.OnMouseUp"), Lines{"Main.OnMouseUp 5,25"});
+}
+
+
+TEST_F(EventsTest, AClickIsOneClickAndNothingElseOfTheComponent)
+{
+	const struct {
+		const char* component;
+		const char* event;
+	} kClicks[] = {
+		{"Button1", "OnClick"},
+		{"CheckBox1", "OnChange"},
+		{"RadioButton1", "OnChange"},
+		{"StringView1", "OnClick"},
+		{"Box1", "OnClick"},
+		{"View1", "OnClick"},
+		{"StatusBar1", "OnClick"},
+		{"PictureView1", "OnClick"},
+		{"PictureButton1", "OnClick"},
+		{"ListView1", "OnSelect"},
+	};
+	for (const auto& click : kClicks) {
+		const std::string name = std::string("Main.") + click.component + ".";
+		const std::string step = std::string("mouse on ") + click.component;
+		EXPECT_EQ(sRun->Calls(step, name + click.event), Lines{name + click.event});
+	}
+}
+
+
+TEST_F(EventsTest, TheFormsOwnKeysAreThoseThatNoComponentGets)
+{
+	EXPECT_EQ(sRun->Calls("keys of the form"), (Lines{"Main.OnKeyDown", "Main.OnKeyUp"}));
+}
+
+
+TEST_F(EventsTest, OneAtATimeHasTheFocusAndIsToldOfGainAndLoss)
+{
+	std::string focused;
+	for (const std::string& call : sRun->AllCalls()) {
+		const size_t event = call.rfind('.');
+		if (call.find("Main.") == 0 && call.substr(event) == ".OnGotFocus") {
+			EXPECT_EQ(focused, "") << call;
+			focused = call.substr(0, event);
+		} else if (call.find("Main.") == 0 && call.substr(event) == ".OnLostFocus") {
+			EXPECT_EQ(focused, call.substr(0, event));
+			focused = "";
+		}
+	}
+}
+
+
+TEST_F(EventsTest, TheBorderMovesAndSizesTheFormAndWhatFollowsIt)
+{
+	EXPECT_EQ(sRun->Calls("border", "Main.OnFrameMoved"), Lines{"Main.OnFrameMoved 120,90"});
+	EXPECT_EQ(sRun->Calls("border", "Main.OnFrameResized"), Lines{"Main.OnFrameResized 700 430"});
+	const BPoint more = BPoint(700, 430) - BPoint(kForm.Width(), kForm.Height());
+	for (const listed_event& component : Components()) {
+		const std::string name = "Main." + component.component + ".";
+		const BRect& frame = component.frame;
+		EXPECT_EQ(sRun->Calls("border", name + "OnFrameMoved"),
+			Lines{name + "OnFrameMoved " + WithComma(frame.left, frame.top + more.y)});
+		std::ostringstream size;
+		size << " " << frame.Width() + more.x << " " << frame.Height();
+		EXPECT_EQ(sRun->Calls("border", name + "OnFrameResized"),
+			Lines{name + "OnFrameResized" + size.str()});
+	}
+}
+
+
+TEST_F(EventsTest, TheButtonsOfTheBorderTellWhatTheyDid)
+{
+	EXPECT_EQ(sRun->Calls("minimized", "Main.OnMinimize"),
+		(Lines{"Main.OnMinimize 1", "Main.OnMinimize 0"}));
+	const Lines zooms = sRun->Calls("zoomed", "Main.OnZoom");
+	ASSERT_EQ(zooms.size(), 2u) << Text(sRun->Calls("zoomed"));
+	EXPECT_EQ(zooms[1], "Main.OnZoom 120,90 689 399");
+}
+
+
+TEST_F(EventsTest, ArgumentsTellWhatHappened)
+{
+	const Lines menus = sRun->Calls("menus");
+	for (const char* call : {"Main.MenuBar1.OnInvoke Hide and show", "Main.OnHide", "Main.OnShow",
+			 "Main.OnOpenViewTransaction", "Main.OnCommitViewTransaction",
+			 "Main.OnWorkspacesChanged 1 2", "Main.OnScreenChanged 0,0,1279,1023 8",
+			 "Main.OnWorkspaceActivated 3 1"})
+		EXPECT_TRUE(Has(menus, call)) << call << " of\n" << Text(menus);
+	EXPECT_LT(Index(menus, "Main.OnMenusBeginning"), Index(menus, "Main.OnMenusEnded"));
+	const Lines components = sRun->Calls("components");
+	for (const char* call : {"Main.OutlineListView1.OnExpand Fruit 0", "Main.MenuField1.OnChange",
+			 "Main.Slider1.OnModify", "Main.Slider1.OnChange"})
+		EXPECT_TRUE(Has(components, call)) << call << " of\n" << Text(components);
+}
+
+
+TEST_F(EventsTest, AFormThatRefusesToQuitStaysAndMayBeClosedLater)
+{
+	EXPECT_EQ(sRun->Calls("kept", "Note 1.OnQuitRequested").size(), 1u);
+	EXPECT_EQ(sRun->Calls("kept", "Note 1.FormDestroy"), Lines());
+	EXPECT_EQ(sRun->Calls("closed", "Note 1.FormDestroy").size(), 1u);
+	EXPECT_EQ(sRun->Calls("closed", "Events.OnQuitRequested"), Lines());
+	EXPECT_EQ(sRun->Calls("closed", "Note 2.FormDestroy"), Lines());
+}
+
+
+TEST_F(EventsTest, AFormMayQuitInAHandlerOfItsComponent)
+{
+	const Lines calls = sRun->Calls("vanished", "Note 2.");
+	ASSERT_EQ(calls.size(), 2u) << Text(calls);
+	EXPECT_EQ(calls[0], "Note 2.Vanish.OnClick");
+	EXPECT_EQ(calls[1], "Note 2.FormDestroy");
+}
+
+
+TEST(SeveralFormsTest, EachInstanceCallsItsOwnHandlers)
+{
+	ProgramRun run;
+	run.Do("wait-window Main");
+	for (const char* note : {"\"Note 1\"", "\"Note 2\""}) {
+		run.Do("wait-window Main");
+		run.Do("click 5 25");
+		run.Do("click-item Forms");
+		run.Do("click-item \"New note\"");
+		run.Do(std::string("wait-window ") + note);
+		// They lie over each other otherwise.
+		run.Do(std::string("move-window 300 ") + (note[6] == '1' ? "500" : "650"));
+	}
+	for (const char* number : {"1", "2", "1"}) {
+		run.Step(std::string("typed into ") + number);
+		run.Do(std::string("wait-window \"Note ") + number + "\"");
+		run.Do("click 195 115");
+		run.Do("click-view Text");
+		run.Do(std::string("type ") + number);
+	}
+	run.Step("main form closed");
+	run.Do("click-view Keep");
+	run.Do("wait-window Main");
+	run.Do("close-window");
+	run.Do("wait-no-window Main");
+	for (const char* number : {"2", "1"}) {
+		run.Step(std::string("closed ") + number);
+		run.Do(std::string("wait-window \"Note ") + number + "\"");
+		if (*number == '1')
+			run.Do("click-view Keep");
+		run.Do("close-window");
+	}
+	run.Run();
+	ASSERT_EQ(run.Code(), 0) << run.Output();
+	EXPECT_EQ(run.Calls("typed into 1", "Note 1.Text.OnChange"),
+		(Lines{"Note 1.Text.OnChange 1", "Note 1.Text.OnChange 11"}));
+	EXPECT_EQ(run.Calls("typed into 2", "Note 2.Text.OnChange"), Lines{"Note 2.Text.OnChange 2"});
+	EXPECT_EQ(run.Calls("typed into 1", "Note 2."), Lines());
+	EXPECT_EQ(run.Calls("typed into 2", "Note 1."), Lines());
+	// The form that refused keeps the program alive, and its end is the program's.
+	EXPECT_EQ(run.Calls("main form closed", "Note 1.OnQuitRequested").size(), 1u);
+	EXPECT_EQ(run.Calls("closed 2", "Events.OnQuitRequested"), Lines());
+	EXPECT_EQ(run.Calls("closed 1", "Events.OnQuitRequested").size(), 1u);
+}
