@@ -3,6 +3,9 @@
 
 #include "codegen/DialectGenerator.h"
 
+#include <memory>
+
+#include "codegen/BuildFilesEmitter.h"
 #include "codegen/StandardAppHeaderEmitter.h"
 #include "codegen/StandardAppSourceEmitter.h"
 #include "codegen/StandardFormHeaderEmitter.h"
@@ -10,7 +13,8 @@
 
 
 TDialectGenerator::TDialectGenerator(source_dialect dialect)
-	: fDialect(dialect)
+	: fDialect(dialect),
+	  fBuildFiles(false)
 {
 }
 
@@ -60,6 +64,29 @@ TDialectGenerator::AppSourceEmitter(TAppComponent* app)
 	TAppSourceEmitter* emitter = new TStandardAppSourceEmitter;
 	emitter->SetApp(app);
 	return emitter;
+}
+
+
+TProjectEmitter*
+TDialectGenerator::ProjectEmitter(TAppComponent* app)
+{
+	if (!fBuildFiles)
+		return TCodeGenerator::ProjectEmitter(app);
+	return new TBuildFilesEmitter(app, GenerationPath(), fDialect, &Writer());
+}
+
+
+bool
+TDialectGenerator::GenerateApp()
+{
+	const bool result = TCodeGenerator::GenerateApp();
+	if (AppComponent() == nullptr)
+		return result;
+
+	const std::unique_ptr<TProjectEmitter> emitter(ProjectEmitter(AppComponent()));
+	if (emitter != nullptr)
+		emitter->EmitProject();
+	return result;
 }
 
 

@@ -14,13 +14,20 @@ public:
 	source_dialect Dialect() const { return fDialect; }
 	void SetDialect(source_dialect dialect) { fDialect = dialect; }
 
+	/// Whether generating the application writes the files that build it, too: those that are not there.
+	void SetBuildFiles(bool buildFiles) { fBuildFiles = buildFiles; }
+
 	TFormHeaderEmitter* FormHeaderEmitter(TDesignForm* form) override;
 	TFormSourceEmitter* FormSourceEmitter(TDesignForm* form) override;
 	TAppHeaderEmitter* AppHeaderEmitter(TAppComponent* app) override;
 	TAppSourceEmitter* AppSourceEmitter(TAppComponent* app) override;
+	TProjectEmitter* ProjectEmitter(TAppComponent* app) override;
+
+	bool GenerateApp() override;
 
 private:
 	source_dialect fDialect;
+	bool fBuildFiles;
 };
 
 /// The designer's generator: each time that it generates it takes the dialect that the user prefers.

@@ -213,6 +213,7 @@ generation_result
 TGenerationRun::Generate()
 {
 	TDialectGenerator generator(fOptions.dialect);
+	generator.SetBuildFiles(fOptions.buildFiles);
 	generator.Writer().SetDryRun(fOptions.dryRun);
 	generator.SetAppComponent(fProject->App());
 	const generation_result result = SetFolder(&generator);
@@ -289,6 +290,10 @@ TGenerationRun::TellFile(const generated_file& file)
 		case GENERATED_UNCHANGED:
 			if (fOptions.verbose)
 				fprintf(fOut, "unchanged %s\n", file.path.String());
+			break;
+
+		case GENERATED_KEPT:
+			fprintf(fOut, "left alone %s\n", file.path.String());
 			break;
 
 		case GENERATED_UNREADABLE:

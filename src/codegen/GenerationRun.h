@@ -25,6 +25,7 @@ struct generation_options {
 	std::vector<BString> componentFolders;    // empty: the folder beside the program
 	BString mainForm;                         // empty: the project's own choice
 	source_dialect dialect = DIALECT_CLASSIC; // of the sources
+	bool buildFiles = false;                  // with the files that build the program
 	bool check = false;                       // only report problems
 	bool allowMissing = false;                // go on without components that have no library
 	bool dryRun = false;                      // only list what would be written

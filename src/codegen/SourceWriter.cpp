@@ -81,6 +81,23 @@ TSourceWriter::WriteText(const char* path, const BString& text)
 }
 
 
+void
+TSourceWriter::WriteOnce(const char* path, const BString& text)
+{
+	if (FileExists(path))
+		AddKept(path);
+	else
+		WriteText(path, text);
+}
+
+
+void
+TSourceWriter::AddKept(const char* path)
+{
+	fFiles.push_back({path, GENERATED_KEPT, B_OK, BString()});
+}
+
+
 bool
 TSourceWriter::KeepCopy(const char* path)
 {

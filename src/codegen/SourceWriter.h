@@ -11,6 +11,7 @@ enum generated_outcome {
 	GENERATED_CREATED,    // there was no such file
 	GENERATED_CHANGED,    // the file got a new content
 	GENERATED_UNCHANGED,  // the file had this content already and was not touched
+	GENERATED_KEPT,       // the file is its user's, and was left alone
 	GENERATED_UNREADABLE, // the file is there but cannot be read; it was left alone
 	GENERATED_UNWRITABLE  // the file cannot be written; it is as it was
 };
@@ -40,6 +41,12 @@ public:
 
 	/// Makes \a text the content of the file at \a path.
 	void WriteText(const char* path, const BString& text);
+
+	/// Makes \a text the content of a new file at \a path; a file, folder or link that is there is left alone.
+	void WriteOnce(const char* path, const BString& text);
+
+	/// Notes that the file at \a path is left alone because it is its user's.
+	void AddKept(const char* path);
 
 	/// Copies the file at \a path, as it is, to the same name with "~" behind it.
 	///

@@ -64,6 +64,8 @@ DescribeOptions(CLI::App& parser, command_line* line)
 				? std::string()
 				: "there is no dialect '" + name + "'; give classic or standard";
 		});
+	parser.add_flag("--build-files", options.buildFiles,
+		"write a CMakeLists.txt, a makefile and resources for Haiku, too, where there are none");
 	parser.add_flag("--check", options.check, "report the project's problems, write nothing");
 	parser.add_flag(
 		"--allow-missing", options.allowMissing, "generate although components lack their library");

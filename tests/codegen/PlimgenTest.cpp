@@ -580,6 +580,34 @@ TEST(PlimgenTest, TheCheckIsThatOfTheDialect)
 }
 
 
+TEST(PlimgenTest, BuildFilesAreMadeOnceAndThenLeftAlone)
+{
+	ProjectFolder folder;
+	folder.SetAppProperty("LaunchFlags", "B_EXCLUSIVE_LAUNCH");
+	const std::string project = folder.SaveSimple();
+	EXPECT_EQ(EntryNames(folder.Path()), "Form1.frm sample.plim");
+	EXPECT_FALSE(Has(Plimgen({project, "--dry-run"}).out, "CMakeLists.txt"));
+
+	const std::string out = folder.At("out/");
+	const program_result first = Plimgen({project, "--build-files"});
+	EXPECT_EQ(first.code, 0) << first.err;
+	EXPECT_TRUE(Has(first.out,
+		"created " + out + "CMakeLists.txt\ncreated " + out + "makefile\ncreated " + out
+			+ "Sample.rdef\n"))
+		<< first.out;
+	EXPECT_TRUE(Has(folder.OutText("Sample.rdef"), "resource app_flags B_EXCLUSIVE_LAUNCH;\n"));
+
+	WriteText(out + "CMakeLists.txt", "# mine\n");
+	const program_result second = Plimgen({project, "--build-files"});
+	EXPECT_EQ(second.code, 0) << second.err;
+	EXPECT_TRUE(Has(second.out,
+		"left alone " + out + "CMakeLists.txt\nleft alone " + out + "makefile\nleft alone " + out
+			+ "Sample.rdef\n"))
+		<< second.out;
+	EXPECT_EQ(folder.OutText("CMakeLists.txt"), "# mine\n");
+}
+
+
 TEST(PlimgenTest, WrongUsageIsToldAndDoesNothing)
 {
 	ProjectFolder folder;
