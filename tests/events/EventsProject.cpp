@@ -63,14 +63,16 @@ Place(TDesignForm* form, const char* className, BRect frame)
 }
 
 
-/// Ticks all events of \a component but those whose parameters the compiler cannot read.
+/// Ticks all events of \a component that can be generated.
 void
-Tick(TComponent* component, project_event about, std::vector<project_event>* events)
+Tick(TComponent* component, source_dialect dialect, project_event about,
+	std::vector<project_event>* events)
 {
 	for (int32 i = 0; i < component->CountEvents(); i++) {
 		about.event = component->EventAt(i);
 		const char* parameters = about.event->parameters;
-		about.isTicked = parameters == nullptr || strstr(parameters, "\xC2\xA0") == nullptr;
+		about.isTicked = dialect == DIALECT_STANDARD || parameters == nullptr
+			|| strstr(parameters, "\xC2\xA0") == nullptr;
 		component->SetEventSelection(about.event->name, about.isTicked);
 		events->push_back(about);
 	}
@@ -78,10 +80,12 @@ Tick(TComponent* component, project_event about, std::vector<project_event>* eve
 
 
 bool
-DesignMain(TDesignForm* form, std::vector<project_event>* events)
+DesignMain(TDesignForm* form, source_dialect dialect, std::vector<project_event>* events)
 {
-	SetFrame(form, BRect(100, 80, 789, 479));
-	Tick(form, {"Main", "", "TForm", BRect(), nullptr, true}, events);
+	const int32 rows = (PaletteCatalog().CountPalEntries() + kColumns - 1) / kColumns;
+	const BRect frame(100, 80, 789, 80 + kCell.top + static_cast<float>(rows) * kStep.y);
+	SetFrame(form, frame);
+	Tick(form, dialect, {"Main", "", "TForm", frame, nullptr, true}, events);
 	int32 cell = 0;
 	for (int32 i = 0; i < PaletteCatalog().CountPalEntries(); i++) {
 		const char* className = PaletteCatalog().PalEntryAt(i)->ClassName();
@@ -104,8 +108,8 @@ DesignMain(TDesignForm* form, std::vector<project_event>* events)
 			if (strcmp(one.className, className) == 0)
 				component->SetPropertyValue(one.property, one.value);
 		}
-		Tick(component, {"Main", component->ComponentName(), className, frame, nullptr, true},
-			events);
+		Tick(component, dialect,
+			{"Main", component->ComponentName(), className, frame, nullptr, true}, events);
 	}
 	return true;
 }
@@ -150,12 +154,12 @@ DesignNote(TDesignForm* form, std::vector<project_event>* events)
 } // namespace
 
 bool
-DesignEvents(TProject* project, std::vector<project_event>* events)
+DesignEvents(TProject* project, source_dialect dialect, std::vector<project_event>* events)
 {
 	TAppComponent* app = project->App();
 	app->SetPropertyValue("Name", "Events");
 	app->SetPropertyValue("Signature", "application/x-vnd.plimworks-events");
-	Tick(app, {"Events", "", "TApp", BRect(), nullptr, true}, events);
+	Tick(app, dialect, {"Events", "", "TApp", BRect(), nullptr, true}, events);
 
 	TDesignForm* note = project->NewForm();
 	note->SetPropertyValue("Name", "Note");
@@ -165,5 +169,5 @@ DesignEvents(TProject* project, std::vector<project_event>* events)
 	main->SetPropertyValue("Name", "Main");
 	main->SetPropertyValue("Title", "Main");
 	project->SetMainForm(main);
-	return DesignMain(main, events);
+	return DesignMain(main, dialect, events);
 }

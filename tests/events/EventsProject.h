@@ -8,6 +8,8 @@
 
 #include <Rect.h>
 
+#include "codegen/Dialect.h"
+
 class TComponent;
 class TDesignForm;
 class TEvent;
@@ -25,4 +27,6 @@ struct project_event {
 
 /// Designs the project: the main form "Main" with one component of each entry of the palette, and the form
 /// "Note". Says on standard error what could not be done; false then.
-bool DesignEvents(TProject* project, std::vector<project_event>* events);
+///
+/// In the classic dialect an event whose parameters no compiler can read is not ticked.
+bool DesignEvents(TProject* project, source_dialect dialect, std::vector<project_event>* events);

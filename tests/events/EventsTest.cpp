@@ -3,8 +3,13 @@
 // handler, with what it is about, in the order that the platform has.
 
 #include <algorithm>
+#include <cstdio>
+#include <cstdlib>
+#include <map>
+#include <memory>
 #include <set>
 #include <sstream>
+#include <thread>
 
 #include <gtest/gtest.h>
 
@@ -13,9 +18,10 @@
 
 namespace {
 
-const BRect kForm(100, 80, 789, 479);
 // Beside the components.
 const BPoint kBare(5, 25);
+// How much larger it is made.
+const BPoint kMore(11, 31);
 
 std::string
 At(BPoint point)
@@ -43,6 +49,18 @@ Spot(const listed_event& component)
 	if (component.className == "TMenuBar")
 		return BPoint(frame.right - 9, frame.top + 9);
 	return BPoint((frame.left + frame.right + 1) / 2, (frame.top + frame.bottom + 1) / 2);
+}
+
+
+/// On the screen.
+BRect
+FormFrame()
+{
+	for (const listed_event& event : ListedEvents()) {
+		if (event.owner == "Main" && event.component.empty())
+			return event.frame;
+	}
+	return BRect();
 }
 
 
@@ -101,7 +119,8 @@ Text(const Lines& calls)
 /// All that a user can do to the main form, in steps.
 class WholeRun : public ProgramRun {
 public:
-	WholeRun()
+	explicit WholeRun(const std::string& dialect)
+		: ProgramRun(dialect)
 	{
 		Do("wait-window Main");
 		Step("open");
@@ -115,7 +134,6 @@ public:
 		Step("close");
 		Do("wait-window Main");
 		Do("close-window");
-		Run("", "word");
 	}
 
 private:
@@ -191,9 +209,10 @@ private:
 	{
 		Step("border");
 		Do("move-window 120 90");
-		Do("resize-window 700 430");
+		const BPoint size(FormFrame().Width(), FormFrame().Height());
+		Do("resize-window " + At(size + kMore));
 		Step("resized back");
-		Do("resize-window 689 399");
+		Do("resize-window " + At(size));
 		Step("minimized");
 		Do("minimize-window");
 		Do("restore-window");
@@ -230,32 +249,43 @@ private:
 
 } // namespace
 
-class EventsTest : public testing::Test {
+class EventsTest : public testing::TestWithParam<const char*> {
 protected:
+	/// The programs mostly wait for the robot, so both run at once.
 	static void SetUpTestSuite()
 	{
-		sRun = new WholeRun;
-		if (sRun->Code() != 0 || getenv("SHOW_EVENTS") != nullptr)
-			puts(sRun->Output().c_str());
+		std::vector<std::thread> threads;
+		for (const char* dialect : kDialects) {
+			sRuns[dialect] = std::make_unique<WholeRun>(dialect);
+			threads.emplace_back([run = sRuns[dialect].get()] { run->Run("", "word"); });
+		}
+		for (std::thread& thread : threads)
+			thread.join();
+		for (const auto& [dialect, run] : sRuns) {
+			if (run->Code() != 0 || getenv("SHOW_EVENTS") != nullptr)
+				printf("%s:\n%s", dialect.c_str(), run->Output().c_str());
+		}
 	}
 
-	static void TearDownTestSuite()
-	{
-		delete sRun;
-		sRun = nullptr;
-	}
+	static void TearDownTestSuite() { sRuns.clear(); }
 
-	void SetUp() override { ASSERT_EQ(sRun->Code(), 0) << "what the program told is above"; }
+	void SetUp() override { ASSERT_EQ(Run().Code(), 0) << "what the program told is above"; }
 
-	static WholeRun* sRun;
+	const WholeRun& Run() const { return *sRuns[GetParam()]; }
+
+	static constexpr const char* kDialects[] = {"classic", "standard"};
+	static std::map<std::string, std::unique_ptr<WholeRun>> sRuns;
 };
 
-WholeRun* EventsTest::sRun = nullptr;
+std::map<std::string, std::unique_ptr<WholeRun>> EventsTest::sRuns;
+
+INSTANTIATE_TEST_SUITE_P(, EventsTest, testing::Values("classic", "standard"),
+	[](const testing::TestParamInfo<const char*>& info) { return std::string(info.param); });
 
 
-TEST_F(EventsTest, EachEventOfEachClassCallsItsHandler)
+TEST_P(EventsTest, EachEventOfEachClassCallsItsHandler)
 {
-	ProgramRun files;
+	ProgramRun files(GetParam());
 	files.Do("wait-window Main");
 	files.Do("close-window");
 	files.Run("BE_ARGUMENTS_ARE_FILES=1", EVENTS_LIST);
@@ -263,7 +293,7 @@ TEST_F(EventsTest, EachEventOfEachClassCallsItsHandler)
 	EXPECT_TRUE(Has(files.AllCalls(), "Events.OnRefsReceived _RRC,events.tsv"));
 
 	std::set<std::string> called;
-	for (const Lines& calls : {sRun->AllCalls(), files.AllCalls()}) {
+	for (const Lines& calls : {Run().AllCalls(), files.AllCalls()}) {
 		for (const std::string& call : calls) {
 			std::string name = call.substr(0, call.find(' '));
 			// "Note 1.Keep.OnChange"
@@ -281,14 +311,14 @@ TEST_F(EventsTest, EachEventOfEachClassCallsItsHandler)
 }
 
 
-TEST_F(EventsTest, HandlersRunWithTheirLooperLocked)
+TEST_P(EventsTest, HandlersRunWithTheirLooperLocked)
 {
-	for (const std::string& call : sRun->AllCalls())
+	for (const std::string& call : Run().AllCalls())
 		EXPECT_EQ(call.find("(not locked)"), std::string::npos) << call;
 }
 
 
-TEST_F(EventsTest, AttachingGoesFromTheFormInwardsAndBack)
+TEST_P(EventsTest, AttachingGoesFromTheFormInwardsAndBack)
 {
 	Lines expected = {"Main.FormCreate", "Main.OnShow", "Main.OnAttachedToWindow"};
 	for (const listed_event& component : Components()) {
@@ -297,23 +327,23 @@ TEST_F(EventsTest, AttachingGoesFromTheFormInwardsAndBack)
 	}
 	expected.push_back("Main.OnAllAttached");
 	expected.push_back("Main.OnGotFocus");
-	Lines calls = sRun->AllCalls();
+	Lines calls = Run().AllCalls();
 	ASSERT_GE(calls.size(), expected.size());
 	calls.resize(expected.size());
 	EXPECT_EQ(calls, expected);
 }
 
 
-TEST_F(EventsTest, OpeningTellsOfNoFrames)
+TEST_P(EventsTest, OpeningTellsOfNoFrames)
 {
 	for (const char* step : {"", "open"}) {
-		for (const std::string& call : sRun->Calls(step))
+		for (const std::string& call : Run().Calls(step))
 			EXPECT_EQ(call.find(".OnFrame"), std::string::npos) << call;
 	}
 }
 
 
-TEST_F(EventsTest, ClosingAsksQuitsDetachesAndDestroys)
+TEST_P(EventsTest, ClosingAsksQuitsDetachesAndDestroys)
 {
 	Lines expected = {"Main.OnQuitRequested", "Main.OnQuit"};
 	for (const listed_event& component : Components())
@@ -321,7 +351,7 @@ TEST_F(EventsTest, ClosingAsksQuitsDetachesAndDestroys)
 	expected.insert(expected.end(),
 		{"Main.OnAllDetached", "Main.OnHide", "Main.FormDestroy", "Events.OnQuitRequested"});
 	Lines calls;
-	for (const std::string& call : sRun->Calls("close")) {
+	for (const std::string& call : Run().Calls("close")) {
 		// The application's own events come in another thread.
 		if (call.find("Events.OnAppActivated") != 0 && call.find("Events.OnPulse") != 0)
 			calls.push_back(call);
@@ -330,29 +360,29 @@ TEST_F(EventsTest, ClosingAsksQuitsDetachesAndDestroys)
 }
 
 
-TEST_F(EventsTest, TheApplicationsEventsComeInOrder)
+TEST_P(EventsTest, TheApplicationsEventsComeInOrder)
 {
-	const Lines calls = sRun->AllCalls();
+	const Lines calls = Run().AllCalls();
 	EXPECT_LT(Index(calls, "Events.OnArgvReceived 2 word"), Index(calls, "Events.OnReadyToRun"));
 	EXPECT_LT(Index(calls, "Events.OnReadyToRun"), Index(calls, "Events.OnPulse"));
 	EXPECT_TRUE(Has(calls, "Events.OnAppActivated 1"));
-	EXPECT_EQ(sRun->Calls("menus", "Events.OnAboutRequested").size(), 1u);
+	EXPECT_EQ(Run().Calls("menus", "Events.OnAboutRequested").size(), 1u);
 }
 
 
-TEST_F(EventsTest, PointsAreInTheComponentsCoordinates)
+TEST_P(EventsTest, PointsAreInTheComponentsCoordinates)
 {
 	for (const listed_event& component : Components()) {
 		const std::string name = "Main." + component.component + ".";
 		const std::string step = "mouse on " + component.component;
 		const BPoint spot = Spot(component) - component.frame.LeftTop();
 		const std::string where = WithComma(spot.x, spot.y);
-		const Lines calls = sRun->Calls(step);
-		const Lines moves = sRun->Calls(step, name + "OnMouseMoved");
+		const Lines calls = Run().Calls(step);
+		const Lines moves = Run().Calls(step, name + "OnMouseMoved");
 		ASSERT_FALSE(moves.empty()) << component.className;
 		EXPECT_EQ(moves.front(), name + "OnMouseMoved " + where + " 0 none");
-		EXPECT_EQ(sRun->Calls(step, name + "OnMouseDown"), Lines{name + "OnMouseDown " + where});
-		EXPECT_EQ(sRun->Calls(OpensMenu(component) ? "release on " + component.component : step,
+		EXPECT_EQ(Run().Calls(step, name + "OnMouseDown"), Lines{name + "OnMouseDown " + where});
+		EXPECT_EQ(Run().Calls(OpensMenu(component) ? "release on " + component.component : step,
 					  name + "OnMouseUp"),
 			Lines{name + "OnMouseUp " + where});
 		EXPECT_LT(Index(calls, moves.front()), Index(calls, name + "OnMouseDown " + where));
@@ -363,12 +393,12 @@ TEST_F(EventsTest, PointsAreInTheComponentsCoordinates)
 			EXPECT_TRUE(!isClick || call.find(name) == 0) << step << ": " << call;
 		}
 	}
-	EXPECT_EQ(sRun->Calls("mouse on the form", "Main.OnMouseDown"), Lines{"Main.OnMouseDown 5,25"});
-	EXPECT_EQ(sRun->Calls("mouse on the form", "Main.OnMouseUp"), Lines{"Main.OnMouseUp 5,25"});
+	EXPECT_EQ(Run().Calls("mouse on the form", "Main.OnMouseDown"), Lines{"Main.OnMouseDown 5,25"});
+	EXPECT_EQ(Run().Calls("mouse on the form", "Main.OnMouseUp"), Lines{"Main.OnMouseUp 5,25"});
 }
 
 
-TEST_F(EventsTest, AClickIsOneClickAndNothingElseOfTheComponent)
+TEST_P(EventsTest, AClickIsOneClickAndNothingElseOfTheComponent)
 {
 	const struct {
 		const char* component;
@@ -388,21 +418,21 @@ TEST_F(EventsTest, AClickIsOneClickAndNothingElseOfTheComponent)
 	for (const auto& click : kClicks) {
 		const std::string name = std::string("Main.") + click.component + ".";
 		const std::string step = std::string("mouse on ") + click.component;
-		EXPECT_EQ(sRun->Calls(step, name + click.event), Lines{name + click.event});
+		EXPECT_EQ(Run().Calls(step, name + click.event), Lines{name + click.event});
 	}
 }
 
 
-TEST_F(EventsTest, TheFormsOwnKeysAreThoseThatNoComponentGets)
+TEST_P(EventsTest, TheFormsOwnKeysAreThoseThatNoComponentGets)
 {
-	EXPECT_EQ(sRun->Calls("keys of the form"), (Lines{"Main.OnKeyDown", "Main.OnKeyUp"}));
+	EXPECT_EQ(Run().Calls("keys of the form"), (Lines{"Main.OnKeyDown", "Main.OnKeyUp"}));
 }
 
 
-TEST_F(EventsTest, OneAtATimeHasTheFocusAndIsToldOfGainAndLoss)
+TEST_P(EventsTest, OneAtATimeHasTheFocusAndIsToldOfGainAndLoss)
 {
 	std::string focused;
-	for (const std::string& call : sRun->AllCalls()) {
+	for (const std::string& call : Run().AllCalls()) {
 		const size_t event = call.rfind('.');
 		if (call.find("Main.") == 0 && call.substr(event) == ".OnGotFocus") {
 			EXPECT_EQ(focused, "") << call;
@@ -415,63 +445,65 @@ TEST_F(EventsTest, OneAtATimeHasTheFocusAndIsToldOfGainAndLoss)
 }
 
 
-TEST_F(EventsTest, TheBorderMovesAndSizesTheFormAndWhatFollowsIt)
+TEST_P(EventsTest, TheBorderMovesAndSizesTheFormAndWhatFollowsIt)
 {
-	EXPECT_EQ(sRun->Calls("border", "Main.OnFrameMoved"), Lines{"Main.OnFrameMoved 120,90"});
-	EXPECT_EQ(sRun->Calls("border", "Main.OnFrameResized"), Lines{"Main.OnFrameResized 700 430"});
-	const BPoint more = BPoint(700, 430) - BPoint(kForm.Width(), kForm.Height());
+	EXPECT_EQ(Run().Calls("border", "Main.OnFrameMoved"), Lines{"Main.OnFrameMoved 120,90"});
+	const BPoint size = BPoint(FormFrame().Width(), FormFrame().Height()) + kMore;
+	EXPECT_EQ(
+		Run().Calls("border", "Main.OnFrameResized"), Lines{"Main.OnFrameResized " + At(size)});
 	for (const listed_event& component : Components()) {
 		const std::string name = "Main." + component.component + ".";
 		const BRect& frame = component.frame;
-		EXPECT_EQ(sRun->Calls("border", name + "OnFrameMoved"),
-			Lines{name + "OnFrameMoved " + WithComma(frame.left, frame.top + more.y)});
+		EXPECT_EQ(Run().Calls("border", name + "OnFrameMoved"),
+			Lines{name + "OnFrameMoved " + WithComma(frame.left, frame.top + kMore.y)});
 		std::ostringstream size;
-		size << " " << frame.Width() + more.x << " " << frame.Height();
-		EXPECT_EQ(sRun->Calls("border", name + "OnFrameResized"),
+		size << " " << frame.Width() + kMore.x << " " << frame.Height();
+		EXPECT_EQ(Run().Calls("border", name + "OnFrameResized"),
 			Lines{name + "OnFrameResized" + size.str()});
 	}
 }
 
 
-TEST_F(EventsTest, TheButtonsOfTheBorderTellWhatTheyDid)
+TEST_P(EventsTest, TheButtonsOfTheBorderTellWhatTheyDid)
 {
-	EXPECT_EQ(sRun->Calls("minimized", "Main.OnMinimize"),
+	EXPECT_EQ(Run().Calls("minimized", "Main.OnMinimize"),
 		(Lines{"Main.OnMinimize 1", "Main.OnMinimize 0"}));
-	const Lines zooms = sRun->Calls("zoomed", "Main.OnZoom");
-	ASSERT_EQ(zooms.size(), 2u) << Text(sRun->Calls("zoomed"));
-	EXPECT_EQ(zooms[1], "Main.OnZoom 120,90 689 399");
+	const Lines zooms = Run().Calls("zoomed", "Main.OnZoom");
+	ASSERT_EQ(zooms.size(), 2u) << Text(Run().Calls("zoomed"));
+	EXPECT_EQ(
+		zooms[1], "Main.OnZoom 120,90 " + At(BPoint(FormFrame().Width(), FormFrame().Height())));
 }
 
 
-TEST_F(EventsTest, ArgumentsTellWhatHappened)
+TEST_P(EventsTest, ArgumentsTellWhatHappened)
 {
-	const Lines menus = sRun->Calls("menus");
+	const Lines menus = Run().Calls("menus");
 	for (const char* call : {"Main.MenuBar1.OnInvoke Hide and show", "Main.OnHide", "Main.OnShow",
 			 "Main.OnOpenViewTransaction", "Main.OnCommitViewTransaction",
 			 "Main.OnWorkspacesChanged 1 2", "Main.OnScreenChanged 0,0,1279,1023 8",
 			 "Main.OnWorkspaceActivated 3 1"})
 		EXPECT_TRUE(Has(menus, call)) << call << " of\n" << Text(menus);
 	EXPECT_LT(Index(menus, "Main.OnMenusBeginning"), Index(menus, "Main.OnMenusEnded"));
-	const Lines components = sRun->Calls("components");
+	const Lines components = Run().Calls("components");
 	for (const char* call : {"Main.OutlineListView1.OnExpand Fruit 0", "Main.MenuField1.OnChange",
 			 "Main.Slider1.OnModify", "Main.Slider1.OnChange"})
 		EXPECT_TRUE(Has(components, call)) << call << " of\n" << Text(components);
 }
 
 
-TEST_F(EventsTest, AFormThatRefusesToQuitStaysAndMayBeClosedLater)
+TEST_P(EventsTest, AFormThatRefusesToQuitStaysAndMayBeClosedLater)
 {
-	EXPECT_EQ(sRun->Calls("kept", "Note 1.OnQuitRequested").size(), 1u);
-	EXPECT_EQ(sRun->Calls("kept", "Note 1.FormDestroy"), Lines());
-	EXPECT_EQ(sRun->Calls("closed", "Note 1.FormDestroy").size(), 1u);
-	EXPECT_EQ(sRun->Calls("closed", "Events.OnQuitRequested"), Lines());
-	EXPECT_EQ(sRun->Calls("closed", "Note 2.FormDestroy"), Lines());
+	EXPECT_EQ(Run().Calls("kept", "Note 1.OnQuitRequested").size(), 1u);
+	EXPECT_EQ(Run().Calls("kept", "Note 1.FormDestroy"), Lines());
+	EXPECT_EQ(Run().Calls("closed", "Note 1.FormDestroy").size(), 1u);
+	EXPECT_EQ(Run().Calls("closed", "Events.OnQuitRequested"), Lines());
+	EXPECT_EQ(Run().Calls("closed", "Note 2.FormDestroy"), Lines());
 }
 
 
-TEST_F(EventsTest, AFormMayQuitInAHandlerOfItsComponent)
+TEST_P(EventsTest, AFormMayQuitInAHandlerOfItsComponent)
 {
-	const Lines calls = sRun->Calls("vanished", "Note 2.");
+	const Lines calls = Run().Calls("vanished", "Note 2.");
 	ASSERT_EQ(calls.size(), 2u) << Text(calls);
 	EXPECT_EQ(calls[0], "Note 2.Vanish.OnClick");
 	EXPECT_EQ(calls[1], "Note 2.FormDestroy");
@@ -480,7 +512,7 @@ TEST_F(EventsTest, AFormMayQuitInAHandlerOfItsComponent)
 
 TEST(SeveralFormsTest, EachInstanceCallsItsOwnHandlers)
 {
-	ProgramRun run;
+	ProgramRun run("standard");
 	run.Do("wait-window Main");
 	for (const char* note : {"\"Note 1\"", "\"Note 2\""}) {
 		run.Do("wait-window Main");

@@ -2,7 +2,7 @@
 // Generates the program with every event, and writes into its handlers what a developer would write: a line that
 // tells of the call, and what the forms do.
 //
-// usage: make_events COMPONENTS_FOLDER FOLDER
+// usage: make_events COMPONENTS_FOLDER FOLDER classic|standard
 //
 // Besides the sources FOLDER gets events.tsv, which names each event: owner, component, class, frame, event,
 // parameters, result.
@@ -19,7 +19,7 @@
 
 #include "EventsProject.h"
 #include "app/Preferences.h"
-#include "codegen/CodeGenerator.h"
+#include "codegen/DialectGenerator.h"
 #include "codegen/HandlerNames.h"
 #include "model/AppComponent.h"
 #include "model/Event.h"
@@ -138,35 +138,39 @@ public:
 
 	~Source() { std::ofstream(fPath) << fText; }
 
-	/// Puts \a text behind the first \a mark, or before the last. Without one the generated text is not
-	/// what it should be.
-	void InsertAfter(const std::string& mark, const std::string& text)
+	/// Puts \a text behind the first \a mark after \a start, or before the last \a mark. Without one the
+	/// generated text is not what it should be.
+	void InsertAfter(const std::string& start, const std::string& mark, const std::string& text)
 	{
-		Insert(fText.find(mark), mark.size(), mark, text);
+		fText.insert(Find(start, mark) + mark.size(), text);
 	}
 
 	void InsertBeforeLast(const std::string& mark, const std::string& text)
 	{
-		Insert(fText.rfind(mark), 0, mark, text);
+		fText.insert(Checked(fText.rfind(mark), mark), text);
 	}
 
 	void Append(const std::string& text) { fText += text; }
 
-	void Replace(const std::string& mark, const std::string& text, const std::string& behind)
+	/// Puts \a text between the first \a from and the first \a to after \a start.
+	void Replace(const std::string& start, const std::string& from, const std::string& to,
+		const std::string& text)
 	{
-		const size_t from = fText.find(behind);
-		const size_t found = fText.find(mark, from);
-		if (from == std::string::npos || found == std::string::npos)
-			Fail(mark);
-		fText.replace(found, mark.size(), text);
+		const size_t begin = Find(start, from) + from.size();
+		fText.replace(begin, Checked(fText.find(to, begin), to) - begin, text);
 	}
 
 private:
-	void Insert(size_t found, size_t length, const std::string& mark, const std::string& text)
+	size_t Find(const std::string& start, const std::string& mark) const
+	{
+		return Checked(fText.find(mark, Checked(fText.find(start), start)), mark);
+	}
+
+	size_t Checked(size_t found, const std::string& mark) const
 	{
 		if (found == std::string::npos)
 			Fail(mark);
-		fText.insert(found + length, text);
+		return found;
 	}
 
 	[[noreturn]] void Fail(const std::string& mark) const
@@ -187,7 +191,7 @@ FillHandler(Source& source, const project_event& event, const std::string& handl
 	const char* parameters = event.event->parameters;
 	const char* result = event.event->returnType;
 	const std::string start = std::string(result != nullptr ? result : "void") + " T" + event.owner
-		+ "::" + handler + "(" + (parameters != nullptr ? parameters : "void") + ")\n{\n";
+		+ "::" + handler + "(";
 	const std::string name = Name(event);
 	const std::string self = event.owner == "Note"
 		? "std::string(Title()) + \"." + name.substr(name.find('.') + 1) + "\""
@@ -196,9 +200,9 @@ FillHandler(Source& source, const project_event& event, const std::string& handl
 	if (name == "Note.Text.OnChange")
 		extra = ", Text->Text()";
 	source.InsertAfter(
-		start, "  Record(this, " + self + extra + ");\n  " + Value(kActions, name) + "\n");
+		start, "\n{\n", "  Record(this, " + self + extra + ");\n  " + Value(kActions, name) + "\n");
 	if (result != nullptr)
-		source.Replace("result;", "result = " + Value(kResults, name) + ";", start);
+		source.Replace(start, " result", ";", " = " + Value(kResults, name));
 }
 
 
@@ -214,7 +218,7 @@ WriteHandler(Source& header, Source& source, const project_event& event, const s
 		+ ")\n{\n  Record(this, \"" + Name(event) + "\"" + ParameterNames(event.event->parameters)
 		+ ");\n}\n");
 	if (!event.component.empty()) {
-		source.InsertAfter("void T" + event.owner + "::FormCreate(void)\n{\n",
+		source.InsertAfter("void T" + event.owner + "::FormCreate(", "{\n",
 			"  " + event.component + "->" + event.event->name + " = &T" + event.owner
 				+ "::" + handler + ";\n");
 	}
@@ -246,17 +250,17 @@ Complete(const std::filesystem::path& folder, const std::vector<project_event>& 
 	}
 	headers["Main"]->InsertBeforeLast("};", kMainMembers);
 	sources["Main"]->Append(kMainFunctions);
-	sources["Main"]->InsertAfter("void TMain::FormCreate(void)\n{\n", kMainCreate);
-	sources["Note"]->InsertAfter("void TNote::FormCreate(void)\n{\n", kNoteCreate);
+	sources["Main"]->InsertAfter("void TMain::FormCreate(", "{\n", kMainCreate);
+	sources["Note"]->InsertAfter("void TNote::FormCreate(", "{\n", kNoteCreate);
 	for (const char* name : {"Main", "Note"}) {
 		const std::string start = std::string("void T") + name + "::";
-		sources[name]->InsertAfter(start + "FormDestroy(void)\n{\n",
+		sources[name]->InsertAfter(start + "FormDestroy(", "{\n",
 			"  Record(this, std::string(Title()) + \".FormDestroy\");\n");
-		sources[name]->InsertAfter(start + "FormCreate(void)\n{\n",
+		sources[name]->InsertAfter(start + "FormCreate(", "{\n",
 			"  Record(this, std::string(Title()) + \".FormCreate\");\n");
 	}
 	for (auto& [name, source] : sources)
-		source->InsertAfter("", "#include \"Record.h\"\n");
+		source->InsertAfter("", "", "#include \"Record.h\"\n");
 }
 
 
@@ -274,7 +278,7 @@ WriteList(const std::filesystem::path& folder, const std::vector<project_event>&
 
 
 int
-Make(const char* components, const std::filesystem::path& folder)
+Make(const char* components, const std::filesystem::path& folder, source_dialect dialect)
 {
 	TLibraryLoader loader(&PaletteCatalog());
 	if (loader.LoadFolder(components) != B_OK || loader.CountEntries() == 0) {
@@ -289,10 +293,10 @@ Make(const char* components, const std::filesystem::path& folder)
 
 	TProject project(FORM_HIDDEN);
 	std::vector<project_event> events;
-	if (!DesignEvents(&project, &events))
+	if (!DesignEvents(&project, dialect, &events))
 		return 1;
 	project.App()->SetPropertyValue("GenerationPath", folder.c_str());
-	TCodeGenerator generator;
+	TDialectGenerator generator(dialect);
 	generator.SetAppComponent(project.App());
 	generator.SetGenerationPath(folder.c_str());
 	generator.GenerateApp();
@@ -306,12 +310,13 @@ Make(const char* components, const std::filesystem::path& folder)
 int
 main(int argc, char** argv)
 {
-	if (argc != 3) {
-		fprintf(stderr, "usage: %s COMPONENTS_FOLDER FOLDER\n", argv[0]);
+	source_dialect dialect;
+	if (argc != 4 || !FindDialect(argv[3], &dialect)) {
+		fprintf(stderr, "usage: %s COMPONENTS_FOLDER FOLDER classic|standard\n", argv[0]);
 		return 2;
 	}
 	setenv("BE_DISPLAY", "none", 1);
 	AppSettings.LeaveFileAlone();
 	BApplication app("application/x-vnd.Plimworks-MakeEvents");
-	return Make(argv[1], argv[2]);
+	return Make(argv[1], argv[2], dialect);
 }

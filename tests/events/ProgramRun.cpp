@@ -44,6 +44,12 @@ ListedEvents()
 }
 
 
+ProgramRun::ProgramRun(const std::string& dialect)
+	: fDialect(dialect)
+{
+}
+
+
 void
 ProgramRun::Step(const std::string& name)
 {
@@ -64,9 +70,9 @@ ProgramRun::Run(const std::string& before, const std::string& after)
 {
 	TemporaryFolder folder;
 	std::ofstream(folder / "script.robot") << fScript;
-	const command_result result =
-		RunCommand("BE_DISPLAY=qt QT_QPA_PLATFORM=offscreen BE_ROBOT_SCRIPT="
-			+ (folder / "script.robot") + " " + before + " timeout 60 " EVENTS_PROGRAM " " + after);
+	const command_result result = RunCommand(
+		"BE_DISPLAY=qt QT_QPA_PLATFORM=offscreen BE_ROBOT_SCRIPT=" + (folder / "script.robot") + " "
+		+ before + " timeout 60 " EVENTS_PROGRAM + fDialect + " " + after);
 	fCode = result.code;
 	fOutput = result.output;
 	Read();

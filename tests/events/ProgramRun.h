@@ -29,6 +29,9 @@ std::vector<listed_event> ListedEvents();
 /// A script, and what the program told while each of its steps was carried out.
 class ProgramRun {
 public:
+	/// Of the program in that dialect.
+	explicit ProgramRun(const std::string& dialect);
+
 	/// What follows is done in the step \a name.
 	void Step(const std::string& name);
 	/// A command of the robot.
@@ -47,6 +50,7 @@ public:
 private:
 	void Read();
 
+	std::string fDialect;
 	std::string fScript;
 	Lines fSteps = {""};
 	std::map<std::string, Lines> fCalls;
