@@ -77,6 +77,7 @@ TellDispatched(const BMessage* message, BView* view)
 TForm::TForm(BRect frame, const char* title, window_look look, window_feel feel, uint32 flags)
 	: BWindow(frame, title, look, feel, flags | B_ASYNCHRONOUS_CONTROLS),
 	  fFormView(nullptr),
+	  fLastFocus(nullptr),
 	  fFocusedPart(nullptr),
 	  fIsMainForm(false),
 	  fIsOpen(false)
@@ -269,16 +270,18 @@ void
 TForm::TellFocus()
 {
 	for (int32 round = 0; round < kFocusRounds; round++) {
-		if (!fIsOpen || fFormView == nullptr)
+		BView* focus = CurrentFocus();
+		if (!fIsOpen || fFormView == nullptr || focus == fLastFocus)
 			return;
-		TFormPart* focused = PartAround(CurrentFocus());
+		fLastFocus = focus;
+		TFormPart* focused = PartAround(focus);
 		if (focused == fFocusedPart)
-			return;
+			continue;
 		TFormPart* before = FindPart(fFormView, fFocusedPart);
 		fFocusedPart = focused;
 		if (before != nullptr)
 			before->FormFocusChanged(false);
-		if (focused != nullptr && PartAround(CurrentFocus()) == focused)
+		if (focused != nullptr && CurrentFocus() == focus)
 			focused->FormFocusChanged(true);
 	}
 }

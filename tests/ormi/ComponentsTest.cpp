@@ -370,3 +370,15 @@ TEST_F(ComponentsTest, WhatAComponentIsMadeOfCountsAsTheComponent)
 	Locked([&] { fForm->Button1->MakeFocus(); });
 	EXPECT_EQ(TakeEvents(), (Lines{"Box1LostFocus", "Button1GotFocus"}));
 }
+
+
+TEST_F(ComponentsTest, AComponentThatComesBackIsToldOfTheFocusAgain)
+{
+	Locked([&] { fForm->Button1->MakeFocus(); });
+	Locked([&] { fForm->Button1->RemoveSelf(); });
+	Forget();
+	Locked([&] { fForm->FormView()->AddChild(fForm->Button1); });
+	Forget();
+	Locked([&] { fForm->Button1->MakeFocus(); });
+	EXPECT_EQ(TakeEvents(), Lines{"Button1GotFocus"});
+}

@@ -70,7 +70,9 @@ private:
 	void TellFocus();
 
 	TFormView* fFormView;
-	const TFormPart* fFocusedPart; // only compared: it may be gone
+	// Only compared: they may be gone.
+	const BView* fLastFocus;
+	const TFormPart* fFocusedPart;
 	bool fIsMainForm;
 	bool fIsOpen;
 };

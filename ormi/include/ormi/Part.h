@@ -104,9 +104,6 @@ public:
 
 	void FormInnerDispatched(const BView* inner, const BMessage* message) override
 	{
-		BPoint point;
-		message->FindPoint("be:view_where", &point);
-		point = this->ConvertFromScreen(inner->ConvertToScreen(point));
 		switch (message->what) {
 			case B_KEY_DOWN:
 				Call(OnKeyDown);
@@ -117,23 +114,19 @@ public:
 				break;
 
 			case B_MOUSE_DOWN:
-				Call(OnMouseDown, point);
+				if (OnMouseDown != nullptr)
+					Call(OnMouseDown, PointOf(inner, message));
 				break;
 
 			case B_MOUSE_UP:
-				Call(OnMouseUp, point);
+				if (OnMouseUp != nullptr)
+					Call(OnMouseUp, PointOf(inner, message));
 				break;
 
 			case B_MOUSE_MOVED:
-			{
-				int32 transit = B_INSIDE_VIEW;
-				message->FindInt32("be:transit", &transit);
-				BMessage dragged;
-				const bool isDrag = message->FindMessage("be:drag_message", &dragged) == B_OK;
-				Call(OnMouseMoved, point, static_cast<uint32>(transit),
-					static_cast<const BMessage*>(isDrag ? &dragged : nullptr));
+				if (OnMouseMoved != nullptr)
+					InnerMouseMoved(PointOf(inner, message), message);
 				break;
-			}
 
 			default:
 				break;
@@ -159,6 +152,7 @@ public:
 	void AllDetached() override
 	{
 		View::AllDetached();
+		fHasFocus = false;
 		Call(OnAllDetached);
 	}
 
@@ -229,6 +223,24 @@ protected:
 	}
 
 private:
+	/// Where the mouse is that \a inner got \a message of.
+	BPoint PointOf(const BView* inner, const BMessage* message) const
+	{
+		BPoint point;
+		message->FindPoint("be:view_where", &point);
+		return this->ConvertFromScreen(inner->ConvertToScreen(point));
+	}
+
+	void InnerMouseMoved(BPoint point, const BMessage* message)
+	{
+		int32 transit = B_INSIDE_VIEW;
+		message->FindInt32("be:transit", &transit);
+		BMessage dragged;
+		const bool isDrag = message->FindMessage("be:drag_message", &dragged) == B_OK;
+		Call(OnMouseMoved, point, static_cast<uint32>(transit),
+			static_cast<const BMessage*>(isDrag ? &dragged : nullptr));
+	}
+
 	Form* fForm;
 	uint32 fNeededFlags;
 	BRect fToldFrame;
