@@ -12,48 +12,44 @@
 
 /// A radio button. OnChange: chosen by the user; those of the same container are off then.
 template <class Form>
-class TRadioButton : public TPart<Form, BRadioButton> {
+class TRadioButton : public TInvokePart<Form, BRadioButton> {
 public:
-	typename TPart<Form, BRadioButton>::Event OnChange = nullptr;
+	typedef TInvokePart<Form, BRadioButton> Part;
+
+	typename Part::Event OnChange = nullptr;
 
 	TRadioButton(Form* form, BRect frame, const char* name, const char* label)
-		: TPart<Form, BRadioButton>(form, frame, name, label, static_cast<BMessage*>(nullptr))
+		: Part(form, frame, name, label, static_cast<BMessage*>(nullptr))
 	{
 	}
 
-	status_t Invoke(BMessage* message = nullptr) override
-	{
-		const status_t status = BRadioButton::Invoke(message);
-		this->Call(OnChange);
-		return status;
-	}
+protected:
+	typename Part::Event EventOf(const BMessage*) const override { return OnChange; }
 };
 
 /// A button with pictures. OnClick: pressed by mouse or keyboard.
 template <class Form>
-class TPictureButton : public TPart<Form, Ormi::FileButton> {
+class TPictureButton : public TInvokePart<Form, Ormi::FileButton> {
 public:
-	typename TPart<Form, Ormi::FileButton>::Event OnClick = nullptr;
+	typedef TInvokePart<Form, Ormi::FileButton> Part;
+
+	typename Part::Event OnClick = nullptr;
 
 	TPictureButton(Form* form, BRect frame, const char* name)
-		: TPart<Form, Ormi::FileButton>(form, frame, name)
+		: Part(form, frame, name)
 	{
 	}
 
-	status_t Invoke(BMessage* message = nullptr) override
-	{
-		const status_t status = BPictureButton::Invoke(message);
-		this->Call(OnClick);
-		return status;
-	}
+protected:
+	typename Part::Event EventOf(const BMessage*) const override { return OnClick; }
 };
 
 /// A slider. OnChange: the user gave it another value. OnModify: the value follows the thumb that the
 /// user holds.
 template <class Form>
-class TSlider : public TPart<Form, Ormi::RangeSlider> {
+class TSlider : public TInvokePart<Form, Ormi::RangeSlider> {
 public:
-	typedef TPart<Form, Ormi::RangeSlider> Part;
+	typedef TInvokePart<Form, Ormi::RangeSlider> Part;
 
 	typename Part::Event OnChange = nullptr;
 	typename Part::Event OnModify = nullptr;
@@ -64,33 +60,28 @@ public:
 		this->SetModificationMessage(new BMessage);
 	}
 
-	/// The slider sends itself its two messages through this operation.
-	status_t Invoke(BMessage* message = nullptr) override
+protected:
+	typename Part::Event EventOf(const BMessage* message) const override
 	{
-		const status_t status = BSlider::Invoke(message);
-		const bool modified = message != nullptr && message == this->ModificationMessage();
-		this->Call(modified ? OnModify : OnChange);
-		return status;
+		return message != nullptr && message == this->ModificationMessage() ? OnModify : OnChange;
 	}
 };
 
 /// A choice of a colour. OnChange: the user changed it; ValueAsColor() has it.
 template <class Form>
-class TColorControl : public TPart<Form, Ormi::ColorPanel> {
+class TColorControl : public TInvokePart<Form, Ormi::ColorPanel> {
 public:
-	typename TPart<Form, Ormi::ColorPanel>::Event OnChange = nullptr;
+	typedef TInvokePart<Form, Ormi::ColorPanel> Part;
+
+	typename Part::Event OnChange = nullptr;
 
 	TColorControl(Form* form, BRect frame, const char* name)
-		: TPart<Form, Ormi::ColorPanel>(form, frame, name)
+		: Part(form, frame, name)
 	{
 	}
 
-	status_t Invoke(BMessage* message = nullptr) override
-	{
-		const status_t status = BColorControl::Invoke(message);
-		this->Call(OnChange);
-		return status;
-	}
+protected:
+	typename Part::Event EventOf(const BMessage*) const override { return OnChange; }
 };
 
 /// A menu that shows what is chosen. OnChange: the user chose an item; Selected() has its index.

@@ -22,40 +22,36 @@
 
 /// A push button. OnClick: pressed by mouse or keyboard.
 template <class Form>
-class TButton : public TPart<Form, BButton> {
+class TButton : public TInvokePart<Form, BButton> {
 public:
-	typename TPart<Form, BButton>::Event OnClick = nullptr;
+	typedef TInvokePart<Form, BButton> Part;
+
+	typename Part::Event OnClick = nullptr;
 
 	TButton(Form* form, BRect frame, const char* name, const char* label)
-		: TPart<Form, BButton>(form, frame, name, label, static_cast<BMessage*>(nullptr))
+		: Part(form, frame, name, label, static_cast<BMessage*>(nullptr))
 	{
 	}
 
-	status_t Invoke(BMessage* message = nullptr) override
-	{
-		const status_t status = BButton::Invoke(message);
-		this->Call(OnClick);
-		return status;
-	}
+protected:
+	typename Part::Event EventOf(const BMessage*) const override { return OnClick; }
 };
 
 /// A check box. OnChange: ticked or unticked by the user; Value() has the new state.
 template <class Form>
-class TCheckBox : public TPart<Form, BCheckBox> {
+class TCheckBox : public TInvokePart<Form, BCheckBox> {
 public:
-	typename TPart<Form, BCheckBox>::Event OnChange = nullptr;
+	typedef TInvokePart<Form, BCheckBox> Part;
+
+	typename Part::Event OnChange = nullptr;
 
 	TCheckBox(Form* form, BRect frame, const char* name, const char* label)
-		: TPart<Form, BCheckBox>(form, frame, name, label, static_cast<BMessage*>(nullptr))
+		: Part(form, frame, name, label, static_cast<BMessage*>(nullptr))
 	{
 	}
 
-	status_t Invoke(BMessage* message = nullptr) override
-	{
-		const status_t status = BCheckBox::Invoke(message);
-		this->Call(OnChange);
-		return status;
-	}
+protected:
+	typename Part::Event EventOf(const BMessage*) const override { return OnChange; }
 };
 
 /// A line of text.

@@ -9,9 +9,9 @@
 /// A list that owns its items. OnSelect: another selection, by the user or by program. OnInvoke: a double
 /// click or Enter on the selection.
 template <class Form, class List>
-class TListPart : public TPart<Form, Ormi::ItemList<List>> {
+class TListPart : public TInvokePart<Form, Ormi::ItemList<List>> {
 public:
-	typedef TPart<Form, Ormi::ItemList<List>> Part;
+	typedef TInvokePart<Form, Ormi::ItemList<List>> Part;
 
 	typename Part::Event OnSelect = nullptr;
 	typename Part::Event OnInvoke = nullptr;
@@ -27,13 +27,11 @@ public:
 		this->Call(OnSelect);
 	}
 
+protected:
 	/// The list invokes itself without a message, also when it has none.
-	status_t Invoke(BMessage* message = nullptr) override
+	typename Part::Event EventOf(const BMessage* message) const override
 	{
-		const status_t status = Part::Invoke(message);
-		if (message == nullptr)
-			this->Call(OnInvoke);
-		return status;
+		return message == nullptr ? OnInvoke : nullptr;
 	}
 };
 

@@ -280,3 +280,22 @@ public:
 private:
 	bool fPressed = false;
 };
+
+/// A part that invokes itself when its user pressed, changed or chose something: its class says which event
+/// that is.
+template <class Form, class View>
+class TInvokePart : public TPart<Form, View> {
+public:
+	using TPart<Form, View>::TPart;
+
+	status_t Invoke(BMessage* message = nullptr) override
+	{
+		const status_t status = View::Invoke(message);
+		this->Call(EventOf(message));
+		return status;
+	}
+
+protected:
+	/// The handler of Invoke() with \a message, which may be null. Controls send both their messages by it.
+	virtual typename TPart<Form, View>::Event EventOf(const BMessage* message) const = 0;
+};

@@ -11,9 +11,9 @@
 /// A text field. OnChange: the text changed, by the user or by program. OnEnter: Enter was pressed, or
 /// the focus left, after a change.
 template <class Form>
-class TTextControl : public TPart<Form, BTextControl> {
+class TTextControl : public TInvokePart<Form, BTextControl> {
 public:
-	typedef TPart<Form, BTextControl> Part;
+	typedef TInvokePart<Form, BTextControl> Part;
 
 	typename Part::Event OnChange = nullptr;
 	typename Part::Event OnEnter = nullptr;
@@ -29,12 +29,9 @@ public:
 		this->SetModificationMessage(new BMessage);
 	}
 
-	/// The control sends itself its two messages through this operation.
-	status_t Invoke(BMessage* message = nullptr) override
+protected:
+	typename Part::Event EventOf(const BMessage* message) const override
 	{
-		const status_t status = BTextControl::Invoke(message);
-		const bool changed = message != nullptr && message == this->ModificationMessage();
-		this->Call(changed ? OnChange : OnEnter);
-		return status;
+		return message != nullptr && message == this->ModificationMessage() ? OnChange : OnEnter;
 	}
 };
