@@ -141,7 +141,8 @@ class Session:
         g.expect_no_window("One of several")
         g.keys("Right")
         g.look_at("One of several")
-        g.keys("Down", "Return")
+        # The keys begin at the present choice.
+        g.keys("Home", "Down", "Return")
         g.expect_no_window("Sample")
         g.look_at("Gallery")
         g.expect_status("Used: a menu, item 1")
@@ -284,6 +285,22 @@ class Session:
         g.expect_text("efName", "Hello, Moon")
         g.expect_status("Used: efName, value 0")
 
+    def selecting_beyond_the_edge(self):
+        """The text comes into sight while the pointer rests below it, and the selection with it."""
+        g = self.gallery
+        g.keys("ctrl+7")
+        left, top, _, bottom = (int(place) for place in g.frame("tvScrolled"))
+        # From behind the first letter.
+        self.desktop.xdotool("mousemove", left + 9, top + 8, "mousedown", 1, "mousemove", left + 9, bottom - 5,
+                             "mousemove", left + 9, bottom + 40)
+
+        def copied_to_the_end():
+            g.keys("ctrl+c")
+            text = self.desktop.clipboard() or ""
+            return text.startswith("ine 1 ") and "Line 20 of" in text
+        wait_for("the text is selected to its last line", copied_to_the_end)
+        self.desktop.xdotool("mouseup", 1)
+
     def dropped_file(self):
         g = self.gallery
         g.keys("ctrl+9")
@@ -309,7 +326,7 @@ def use_gallery(desktop, program, client):
     session = Session(desktop, program, client)
     for part in (session.buttons, session.menus_by_click, session.menus_by_keys, session.pop_up_menu, session.alerts,
                  session.open_panel, session.save_panel, session.lists, session.sliders_and_colours, session.tabs,
-                 session.texts, session.dropped_file):
+                 session.texts, session.selecting_beyond_the_edge, session.dropped_file):
         part()
         print(f"{time.monotonic() - started:6.2f} s  {part.__name__} done", flush=True)
     session.gallery.close()
