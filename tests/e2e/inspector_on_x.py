@@ -89,7 +89,7 @@ def edit_form(desktop, program, example, pictures):
     inspector.invoke(WINDOW_LOOK)
     desktop.key("space")
     session.save_picture("menu")
-    for key in ("Down", "Down", "Return"):
+    for key in ("Home", "Down", "Down", "Return"):
         desktop.key(key)
     inspector.wait_for_value("WindowLook", "B_DOCUMENT_WINDOW_LOOK")
     session.save_picture("choice")
