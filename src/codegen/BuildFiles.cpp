@@ -112,7 +112,7 @@ CMakeText(const build_plan& plan)
 		 << "find_package(Ormi REQUIRED)\n"
 		 << "\n"
 		 << "# The sources of forms that are added later belong here. The .fcp files are included "
-	        "by them.\n"
+			"by them.\n"
 		 << "add_executable(" << target << "\n";
 	for (const BString& source : plan.sources)
 		text << "  " << CMakeArgument(source) << "\n";
@@ -138,7 +138,7 @@ MakefileText(const build_plan& plan)
 		text << "APP_MIME_SIG = " << MakeValue(plan.signature) << "\n";
 	text << "\n"
 		 << "# The sources of forms that are added later belong here. The .fcp files are included "
-	        "by them.\n"
+			"by them.\n"
 		 << "SRCS =";
 	for (const BString& source : plan.sources)
 		text << " \\\n\t" << MakeValue(source);
@@ -147,7 +147,8 @@ MakefileText(const build_plan& plan)
 		 << "\n"
 		 << "# Where Plimworks is installed, with the runtime library of generated programs.\n"
 		 << "PLIMWORKS ?= /boot/home/config/non-packaged\n"
-		 << "SYSTEM_INCLUDE_PATHS = $(PLIMWORKS)/include/plimworks\n"
+		 << "SYSTEM_INCLUDE_PATHS = $(PLIMWORKS)/include/plimworks "
+			"$(PLIMWORKS)/develop/headers/plimworks\n"
 		 << "LIBPATHS = $(PLIMWORKS)/lib\n"
 		 << "LIBS = ormi be translation $(STDCPPLIBS)\n"
 		 << "\n"
