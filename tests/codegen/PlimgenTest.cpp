@@ -7,12 +7,8 @@
 #include <sys/wait.h>
 
 #include <functional>
-#include <regex>
-#include <set>
-#include <sstream>
 #include <vector>
 
-#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <Message.h>
@@ -161,28 +157,6 @@ Plimgen(const std::vector<std::string>& arguments, const std::string& folder = "
 	wait4(child, &status, 0, &usage);
 	return {WIFEXITED(status) ? WEXITSTATUS(status) : -WTERMSIG(status), ReadText(out),
 		ReadText(err), usage.ru_maxrss};
-}
-
-
-/// The options named in those lines of \a text that begin with \a start, in what stands before their explanation.
-std::set<std::string>
-OptionsIn(const std::string& text, const std::string& start)
-{
-	std::set<std::string> options;
-	std::istringstream lines(text);
-	for (std::string line; std::getline(lines, line);) {
-		if (line.compare(0, start.length(), start) != 0)
-			continue;
-		const std::string end = start[0] == '|' ? " | " : "  ";
-		line = line.substr(2, line.find(end, 2) - 2);
-		line = line.substr(0, line.find(" Needs: "));
-		const std::regex option("(^|[ ,`])(--?[a-z][a-z-]*)");
-		for (std::sregex_iterator each(line.begin(), line.end(), option), none; each != none;
-			 ++each) {
-			options.insert((*each)[2]);
-		}
-	}
-	return options;
 }
 
 
@@ -541,16 +515,6 @@ TEST(PlimgenTest, VersionAndHelpAreDone)
 	for (const char* option : {"PROJECT", "-o", "--output", "--components", "--main", "--check",
 			 "--allow-missing", "--dry-run", "--diff", "-v", "--verbose", "--version", "--help"})
 		EXPECT_TRUE(Has(help.out, option)) << option;
-}
-
-
-TEST(PlimgenTest, HelpAndDocumentationNameTheSameOptions)
-{
-	const std::set<std::string> helped = OptionsIn(Plimgen({"--help"}).out, "  -");
-	const std::set<std::string> documented =
-		OptionsIn(ReadText(PLIM_SOURCE_DIR "/docs/plimgen.md"), "| `-");
-	EXPECT_GT(helped.size(), 10u);
-	EXPECT_THAT(documented, testing::ContainerEq(helped));
 }
 
 
