@@ -75,7 +75,8 @@ public:
 
 	/// An outline in screen coordinates that follows the pointer: B_TRACK_WHOLE_RECT moves it,
 	/// B_TRACK_RECT_CORNER keeps its left-top. It ends with EndRectTracking() or the release of the buttons.
-	virtual void BeginRectTracking(BRect rect, uint32 style) = 0;
+	/// \a from: where the pointer was when it took hold of \a rect.
+	virtual void BeginRectTracking(BRect rect, uint32 style, BPoint from) = 0;
 	virtual void EndRectTracking() = 0;
 
 	/// Drags \a message while a button is held: moves carry it, the window under the release gets it by

@@ -19,6 +19,7 @@ namespace {
 
 // How far apart, in pixels, the presses of a double click may be.
 const float kClickDistance = 4;
+const bigtime_t kDoubleClickTime = 500000;
 
 } // namespace
 
@@ -379,10 +380,12 @@ InputHub::LeaveWindow(StackedWindow* next)
 
 
 void
-InputHub::PointerAt(BPoint screenWhere, uint32 buttons, std::optional<StackedWindow*> under)
+InputHub::PointerAt(BPoint screenWhere, uint32 buttons, std::optional<StackedWindow*> under,
+	std::optional<bigtime_t> when)
 {
 	std::lock_guard<std::mutex> lock(fMutex);
 	fLastInput = system_time();
+	const bigtime_t pressTime = when.value_or(fLastInput);
 	bool moved = screenWhere != fWhere;
 	fWhere = screenWhere;
 	if (moved)
@@ -395,13 +398,13 @@ InputHub::PointerAt(BPoint screenWhere, uint32 buttons, std::optional<StackedWin
 		bool isFirst = fButtons == 0;
 		fButtons ^= bit;
 		if ((buttons & bit) != 0) {
-			bool again = fClickButton == bit && fLastInput - fClickTime <= 500000
+			bool again = fClickButton == bit && pressTime - fClickTime <= kDoubleClickTime
 				&& std::fabs(fWhere.x - fClickWhere.x) <= kClickDistance
 				&& std::fabs(fWhere.y - fClickWhere.y) <= kClickDistance
 				&& fClickWindow == Under(under);
 			fClicks = again ? fClicks + 1 : 1;
 			fClickButton = bit;
-			fClickTime = fLastInput;
+			fClickTime = pressTime;
 			fClickWhere = fWhere;
 			fClickWindow = Under(under);
 			Pressed(Under(under), isFirst);

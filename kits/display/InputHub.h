@@ -84,7 +84,9 @@ public:
 	void RequestClose(StackedWindow* window);
 
 	/// \a under: the window under the pointer if the host knows it.
-	void PointerAt(BPoint screenWhere, uint32 buttons, std::optional<StackedWindow*> under);
+	/// \a when: the time of the input by the host's clock, in microseconds: a busy program hears of it later.
+	void PointerAt(BPoint screenWhere, uint32 buttons, std::optional<StackedWindow*> under,
+		std::optional<bigtime_t> when = std::nullopt);
 	/// The pointer has left the program's windows.
 	void PointerLeft();
 	void Wheel(float deltaX, float deltaY, std::optional<StackedWindow*> under);
@@ -104,7 +106,7 @@ public:
 	void GetKeys(key_info* info) const;
 	bigtime_t IdleTime() const;
 
-	void BeginTracking(BRect rect, uint32 style);
+	void BeginTracking(BRect rect, uint32 style, BPoint from);
 	void EndTracking();
 	void BeginDrag(
 		const BMessage& message, BRect rect, std::shared_ptr<const Picture> image, BPoint offset);

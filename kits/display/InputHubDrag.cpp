@@ -9,10 +9,10 @@
 namespace BPrivate {
 
 void
-InputHub::BeginTracking(BRect rect, uint32 style)
+InputHub::BeginTracking(BRect rect, uint32 style, BPoint from)
 {
 	std::lock_guard<std::mutex> lock(fMutex);
-	fTracking = TrackingState{rect, fWhere, style};
+	fTracking = TrackingState{rect, from, style};
 	OverlayMayHaveChanged();
 }
 

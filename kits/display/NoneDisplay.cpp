@@ -117,9 +117,9 @@ NoneDisplay::IdleTime()
 
 
 void
-NoneDisplay::BeginRectTracking(BRect rect, uint32 style)
+NoneDisplay::BeginRectTracking(BRect rect, uint32 style, BPoint from)
 {
-	fHub.BeginTracking(rect, style);
+	fHub.BeginTracking(rect, style, from);
 }
 
 

@@ -29,7 +29,7 @@ public:
 	void GetPointer(BPoint* screenWhere, uint32* buttons) override;
 	void GetKeys(key_info* info) override;
 	bigtime_t IdleTime() override;
-	void BeginRectTracking(BRect rect, uint32 style) override;
+	void BeginRectTracking(BRect rect, uint32 style, BPoint from) override;
 	void EndRectTracking() override;
 	void BeginDrag(
 		const BMessage& message, BRect rect, const PixelBuffer* image, BPoint offset) override;

@@ -656,11 +656,26 @@ WindowInput::TakeMouseMessage(BView* view, BPoint* where, uint32* buttons)
 }
 
 
+/// Inside a hook, the pointer as it was when that was called for: it may have gone on since.
+WindowInput::PointerState
+WindowInput::PointerOfHook() const
+{
+	PointerState pointer;
+	Display::Get().GetPointer(&pointer.where, &pointer.buttons);
+	BMessage* current = fWindow->CurrentMessage();
+	if (current != nullptr && IsMouseMessage(current->what)) {
+		pointer.where = current->GetPoint("screen_where", pointer.where);
+		pointer.buttons = current->GetInt32("buttons", pointer.buttons);
+	}
+	return pointer;
+}
+
+
 void
 WindowInput::BeginRectTracking(BRect rect, uint32 style)
 {
 	fIsTracking = true;
-	Display::Get().BeginRectTracking(rect, style);
+	Display::Get().BeginRectTracking(rect, style, PointerOfHook().where);
 }
 
 
@@ -678,23 +693,14 @@ void
 WindowInput::StartDrag(BView* source, const BMessage& message, BRect outline, const BBitmap* image,
 	BPoint offset, BHandler* replyTo)
 {
-	BPoint pointer;
-	uint32 buttons;
-	Display::Get().GetPointer(&pointer, &buttons);
-	// Inside a hook the message tells the place that the hook was called for.
-	BMessage* current = fWindow->CurrentMessage();
-	if (current != nullptr && IsMouseMessage(current->what)) {
-		pointer = current->GetPoint("screen_where", pointer);
-		buttons = current->GetInt32("buttons", buttons);
-	}
-
+	const PointerState pointer = PointerOfHook();
 	BMessage dragged(message);
 	if (!dragged.HasInt32("buttons"))
-		dragged.AddInt32("buttons", buttons);
+		dragged.AddInt32("buttons", pointer.buttons);
 	dragged.RemoveName(kDragReplyTo);
 	dragged.AddMessenger(kDragReplyTo, BMessenger(replyTo != nullptr ? replyTo : source));
 	if (image == nullptr) {
-		Display::Get().BeginDrag(dragged, outline, nullptr, pointer - outline.LeftTop());
+		Display::Get().BeginDrag(dragged, outline, nullptr, pointer.where - outline.LeftTop());
 		return;
 	}
 	DrawableBitmap drawable(*image);

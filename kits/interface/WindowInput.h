@@ -57,6 +57,12 @@ private:
 		int32 transit;
 	};
 
+	struct PointerState {
+		BPoint where; // on the screen
+		uint32 buttons;
+	};
+
+	PointerState PointerOfHook() const;
 	bool HandToMenus(BMessage* message);
 	BHandler* MouseTarget(BMessage* message);
 	bool TakeMouseMessage(BView* view, BPoint* where, uint32* buttons);

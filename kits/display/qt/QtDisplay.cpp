@@ -394,9 +394,9 @@ QtDisplay::HandleKey(const QKeyEvent& event)
 
 
 void
-QtDisplay::BeginRectTracking(BRect rect, uint32 style)
+QtDisplay::BeginRectTracking(BRect rect, uint32 style, BPoint from)
 {
-	fHub.BeginTracking(rect, style);
+	fHub.BeginTracking(rect, style, from);
 }
 
 

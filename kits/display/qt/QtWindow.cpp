@@ -494,11 +494,14 @@ QtWindow::HandleMouse(QMouseEvent* event)
 		return;
 	fDisplay.PointerMoved();
 	hub.SetModifiers(fDisplay.ModifiersNow(event->modifiers()));
+	std::optional<bigtime_t> when;
+	if (event->timestamp() != 0)
+		when = static_cast<bigtime_t>(event->timestamp()) * 1000;
 	// Without a button it is surely over this window; with one, the host sends it here all the same.
 	if (held == 0)
-		hub.PointerAt(where, buttons, fStacked);
+		hub.PointerAt(where, buttons, fStacked, when);
 	else
-		hub.PointerAt(where, buttons, fDisplay.WindowUnder(event->globalPosition().toPoint()));
+		hub.PointerAt(where, buttons, fDisplay.WindowUnder(event->globalPosition().toPoint()), when);
 }
 
 

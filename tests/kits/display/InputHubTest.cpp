@@ -134,14 +134,18 @@ TEST_F(InputHubTest, QuickPressesAtOnePlaceAreCounted)
 }
 
 
-TEST_F(InputHubTest, ALatePressIsANewClick)
+TEST_F(InputHubTest, ALatePressByTheHostsClockIsANewClick)
 {
 	TestWindow window(fHub, BRect(0, 0, 99, 99));
-	Pointer(10, 10, 1);
-	Pointer(10, 10);
-	snooze(550000);
-	Pointer(10, 10, 1);
+	fHub.PointerAt(BPoint(10, 10), 1, std::nullopt, 1000000);
+	fHub.PointerAt(BPoint(10, 10), 0, std::nullopt, 1010000);
+	fHub.PointerAt(BPoint(10, 10), 1, std::nullopt, 1500001);
 	EXPECT_EQ(window.client.Last().GetInt32("clicks", 0), 1);
+	// Until the host's word arrives, time may pass.
+	fHub.PointerAt(BPoint(10, 10), 0, std::nullopt, 1510000);
+	snooze(550000);
+	fHub.PointerAt(BPoint(10, 10), 1, std::nullopt, 1600000);
+	EXPECT_EQ(window.client.Last().GetInt32("clicks", 0), 2);
 }
 
 
@@ -528,17 +532,27 @@ TEST_F(InputHubTest, TheTrackedRectFollowsThePointerUntilTheRelease)
 {
 	TestWindow window(fHub, BRect(0, 0, 199, 199));
 	Pointer(50, 50, 1);
-	fHub.BeginTracking(BRect(40, 40, 60, 60), B_TRACK_WHOLE_RECT);
+	fHub.BeginTracking(BRect(40, 40, 60, 60), B_TRACK_WHOLE_RECT, BPoint(50, 50));
 	Pointer(60, 70, 1);
 	EXPECT_EQ(fHub.Overlay().tracking, BRect(50, 60, 70, 80));
 	fHub.EndTracking();
 	EXPECT_FALSE(fHub.Overlay().tracking.IsValid());
 
-	fHub.BeginTracking(BRect(40, 40, 60, 60), B_TRACK_RECT_CORNER);
+	fHub.BeginTracking(BRect(40, 40, 60, 60), B_TRACK_RECT_CORNER, BPoint(60, 70));
 	Pointer(65, 80, 1);
 	EXPECT_EQ(fHub.Overlay().tracking, BRect(40, 40, 65, 70));
 	Pointer(65, 80, 0);
 	EXPECT_FALSE(fHub.Overlay().tracking.IsValid());
+}
+
+
+TEST_F(InputHubTest, TheTrackedRectKnowsOfMovesThatCameBeforeItBegan)
+{
+	TestWindow window(fHub, BRect(0, 0, 199, 199));
+	Pointer(50, 50, 1);
+	Pointer(60, 70, 1);
+	fHub.BeginTracking(BRect(50, 50, 50, 50), B_TRACK_RECT_CORNER, BPoint(50, 50));
+	EXPECT_EQ(fHub.Overlay().tracking, BRect(50, 50, 60, 70));
 }
 
 
