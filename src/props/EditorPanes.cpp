@@ -284,10 +284,37 @@ TEditorPanes::AddButton(TPropEditType type, const char* name, uint32 command)
 }
 
 
+/// Whether the menu's items are those for \a state. What is marked may differ.
+bool
+TEditorPanes::PickMenuOffers(const TEditorState& state) const
+{
+	const int32 count = fPickMenu->CountItems();
+	if (!state.hasEditor || count != static_cast<int32>(state.choices.size()))
+		return false;
+	for (int32 i = 0; i < count; i++) {
+		const BMenuItem* item = fPickMenu->ItemAt(i);
+		void* property;
+		if (state.choices[i] != item->Label() || item->Message() == nullptr
+			|| item->Message()->FindPointer("prop", &property) != B_OK
+			|| property != state.property)
+			return false;
+	}
+	return true;
+}
+
+
 /// Offers the editor's choices, the one that is the property's value marked.
 void
 TEditorPanes::FillPickMenu(const TEditorState& state)
 {
+	// A menu that is open keeps the items that the user is choosing from.
+	if (PickMenuOffers(state)) {
+		fPickField->MenuItem()->SetLabel(state.value.String());
+		for (int32 i = 0; i < fPickMenu->CountItems(); i++)
+			fPickMenu->ItemAt(i)->SetMarked(state.choices[i] == state.value);
+		return;
+	}
+
 	fPickMenu->RemoveItems(0, fPickMenu->CountItems(), true);
 	// What the field shows while no item is marked.
 	fPickField->MenuItem()->SetLabel(state.value.String());

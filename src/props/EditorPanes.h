@@ -71,6 +71,7 @@ private:
 	bool TakeFocus(TPropEditType type);
 	BTextControl* AddField(TPropEditType type, const char* name, float width, uint32 command);
 	BButton* AddButton(TPropEditType type, const char* name, uint32 command);
+	bool PickMenuOffers(const TEditorState& state) const;
 	void FillPickMenu(const TEditorState& state);
 
 	BBox* fPanes[kCount];

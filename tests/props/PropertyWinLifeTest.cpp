@@ -5,6 +5,8 @@
 #include <functional>
 #include <thread>
 
+#include <MenuField.h>
+#include <MenuItem.h>
 #include <OS.h>
 
 #include "PropertyWinTest.h"
@@ -79,6 +81,26 @@ TEST_F(PropertyWinLifeTest, ARefusedPickIsDropped)
 	EXPECT_TRUE(robot.ClickItem("false"));
 	EXPECT_EQ(ShownValue("Enabled"), "true");
 	EXPECT_EQ(Value("Enabled"), "true");
+}
+
+
+TEST_F(PropertyWinLifeTest, ARefreshLeavesTheOpenMenuOfChoicesAlone)
+{
+	ShowControl();
+	Select("Enabled");
+	BMenu* menu;
+	{
+		WindowGuard guard(window);
+		menu = dynamic_cast<BMenuField*>(window->FindView("mfPickEdit"))->Menu();
+	}
+	EXPECT_TRUE(robot.ClickView("mfPickEdit"));
+	EXPECT_TRUE(robot.WaitForWindow("mnuPickEdit"));
+	const BMenuItem* first = menu->ItemAt(0);
+	window->UpdateDisplayValues();
+	Tell(PWM_MODAL_EDIT_FIELD);
+	EXPECT_EQ(menu->ItemAt(0), first);
+	EXPECT_TRUE(robot.ClickItem("false"));
+	EXPECT_EQ(Value("Enabled"), "false");
 }
 
 
