@@ -27,6 +27,7 @@ AWAY = (1000, 740)
 WINDOW_MANAGER_SETTINGS = """<?xml version="1.0" encoding="UTF-8"?>
 <openbox_config xmlns="http://openbox.org/3.4/rc">
   <focus><focusNew>yes</focusNew></focus>
+  <resistance><strength>0</strength><screen_edge_strength>0</screen_edge_strength></resistance>
   <desktops><number>1</number><popupTime>0</popupTime></desktops>
   <keyboard><keybind key="A-F4"><action name="Close"/></keybind></keyboard>
 </openbox_config>
