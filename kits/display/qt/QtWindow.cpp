@@ -127,7 +127,6 @@ QtWindow::QtWindow(QtDisplay& display, std::shared_ptr<Surface> surface, Stacked
 	  fStacked(stacked),
 	  fIsMinimized(false),
 	  fIsZoomed(false),
-	  fMustTellZoom(false),
 	  fIsAway(false)
 {
 	setSurfaceType(QSurface::RasterSurface);
@@ -419,7 +418,6 @@ QtWindow::GeometryChanged()
 		fRequested.clear();
 	if (isVisible())
 		fDisplay.ReportFrame(fStacked, RectOf(now), false);
-	TellZoom();
 }
 
 
@@ -557,9 +555,9 @@ QtWindow::HandleState()
 	bool zoomed = (windowStates() & Qt::WindowMaximized) != 0;
 	if (zoomed != fIsZoomed) {
 		fIsZoomed = zoomed;
-		fMustTellZoom = true;
-		// The host tells of the new frame before or after the state, in two steps or one.
-		QTimer::singleShot(kZoomDelay, this, [this] { TellZoom(); });
+		// The host tells of the new frame before or after the state, in one step or two.
+		QTimer::singleShot(kZoomDelay, this,
+			[this] { fDisplay.Hub().Deliver(fStacked, std::make_unique<BMessage>(B_ZOOM)); });
 	}
 
 	bool minimized = (windowStates() & Qt::WindowMinimized) != 0;
@@ -570,16 +568,6 @@ QtWindow::HandleState()
 	auto message = std::make_unique<BMessage>(B_MINIMIZE);
 	message->AddBool("minimize", minimized);
 	fDisplay.Hub().Deliver(fStacked, std::move(message));
-}
-
-
-void
-QtWindow::TellZoom()
-{
-	if (!fMustTellZoom)
-		return;
-	fMustTellZoom = false;
-	fDisplay.Hub().Deliver(fStacked, std::make_unique<BMessage>(B_ZOOM));
 }
 
 } // namespace BPrivate

@@ -67,7 +67,6 @@ private:
 	void HandleMouse(QMouseEvent* event);
 	void HandleWheel(QWheelEvent* event);
 	void HandleState();
-	void TellZoom();
 	void HandleDragOver(QDragMoveEvent* event);
 	void HandleDrop(QDropEvent* event);
 
@@ -79,7 +78,6 @@ private:
 	HostSizeLimits fLimits;
 	bool fIsMinimized;
 	bool fIsZoomed;
-	bool fMustTellZoom;
 	bool fIsAway;
 	/// What was asked of the host and not yet seen to happen, oldest first.
 	std::vector<QRect> fRequested;
