@@ -27,6 +27,7 @@
 #include <Message.h>
 #include <OS.h>
 #include <Path.h>
+#include <Screen.h>
 #include <View.h>
 #include <Window.h>
 
@@ -163,6 +164,14 @@ public:
 	void FrameResized(float width, float height) override
 	{
 		Say("resized " + PointText(BPoint(width, height)));
+	}
+
+	/// Both what it is told of the screen, and what it finds.
+	void ScreenChanged(BRect frame, color_space mode) override
+	{
+		const BRect found = BScreen(this).Frame();
+		Say("screen " + PointText(frame.LeftTop()) + " " + PointText(frame.RightBottom()) + " mode "
+			+ std::to_string(mode) + " found " + PointText(found.RightBottom()));
 	}
 
 	bool QuitRequested() override

@@ -71,8 +71,8 @@ class Program:
         check(self.process.returncode == 0, f"{self.name} ended with {self.process.returncode}: {self.lines()}")
 
 
-def main(use):
-    """Calls use(desktop, program, client); returns the exit code."""
+def main(use, tools=()):
+    """Calls use(desktop, program, client), which needs these tools, too; returns the exit code."""
     usage = f"usage: {sys.argv[0]} EXCHANGE_PROGRAM XDND_CLIENT FOLDER"
     return run(lambda desktop, program, client, _: use(desktop, program, client), 3, WHOLE_LIMIT, usage,
-               owns_folder=False)
+               owns_folder=False, tools=tools)

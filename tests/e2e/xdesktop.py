@@ -38,8 +38,8 @@ class Failure(Exception):
     """What was expected and did not happen."""
 
 
-def missing_tools():
-    return [tool for tool in TOOLS if shutil.which(tool) is None]
+def missing_tools(more=()):
+    return [tool for tool in (*TOOLS, *more) if shutil.which(tool) is None]
 
 
 def wait_for(what, answer):

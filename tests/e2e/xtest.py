@@ -29,14 +29,15 @@ def interrupted(number, _):
     raise Failure("the whole took too long" if number == signal.SIGALRM else f"signal {number} came")
 
 
-def run(use, paths, limit, usage, owns_folder=True):
+def run(use, paths, limit, usage, owns_folder=True, tools=()):
     """Calls use(desktop, PATH...) with the `paths` paths of the command line, of which the last is the folder for
     pictures; returns the exit code. `limit`: in seconds, below that of CTest, which would leave nobody to say what was
-    waited for. `owns_folder`: the folder is the test's alone, and old pictures in it are removed."""
+    waited for. `owns_folder`: the folder is the test's alone, and old pictures in it are removed. `tools`: what has to be
+    installed besides what all tests use."""
     if len(sys.argv) != 1 + paths:
         print(usage, file=sys.stderr)
         return 2
-    missing = missing_tools()
+    missing = missing_tools(tools)
     if missing:
         print(f"skipped: not installed here: {', '.join(missing)} (scripts/setup test installs it)")
         return SKIPPED
