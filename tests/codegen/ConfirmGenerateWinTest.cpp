@@ -16,7 +16,8 @@
 
 #include "app/Dialogs.h"
 #include "app/Preferences.h"
-#include "codegen/DialectGenerator.h"
+#include "codegen/CodeGenerator.h"
+#include "codegen/Dialect.h"
 #include "model/AppComponent.h"
 #include "model/Property.h"
 #include "project/Project.h"
@@ -203,7 +204,7 @@ TEST_F(ConfirmGenerateWinTest, WithoutAnApplicationABoxTellsAndNothingIsShown)
 
 TEST_F(ConfirmGenerateWinTest, TheDialectIsChosenInTheDialogAndKept)
 {
-	TPreferredGenerator generator;
+	TCodeGenerator& generator = *Generator();
 	generator.SetAppComponent(fProject.App());
 	ASSERT_EQ(PreferredDialect(), DIALECT_CLASSIC);
 	EXPECT_TRUE(generator.ConfirmSettings());
@@ -225,4 +226,5 @@ TEST_F(ConfirmGenerateWinTest, TheDialectIsChosenInTheDialogAndKept)
 	generator.GenerateApp();
 	EXPECT_EQ(fFolder.Read(path).find("nullptr"), std::string::npos);
 	AppSettings.RemoveName("Dialect");
+	generator.SetAppComponent(nullptr);
 }
