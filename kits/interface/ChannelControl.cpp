@@ -135,10 +135,10 @@ BChannelControl::InvokeChannel(
 	const BMessage* model = message != NULL ? message : Message();
 	if (model == NULL)
 		return B_BAD_VALUE;
-	if (channelCount < 0)
-		channelCount = std::max<int32>(CountChannels() - fromChannel, 0);
-	if (!HasChannels(fromChannel, channelCount))
+	if (!HasChannels(fromChannel, std::max<int32>(channelCount, 0)))
 		return B_BAD_INDEX;
+	if (channelCount < 0)
+		channelCount = CountChannels() - fromChannel;
 	BMessage sent(*model);
 	for (int32 i = 0; i < channelCount; i++) {
 		sent.AddInt32("be:channel_value", fValues[fromChannel + i]);

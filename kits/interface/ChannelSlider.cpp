@@ -3,6 +3,7 @@
 #include <ChannelSlider.h>
 
 #include <algorithm>
+#include <memory>
 
 #include <Message.h>
 #include <Window.h>
@@ -279,7 +280,8 @@ BChannelSlider::TrackTo(BPoint where)
 void
 BChannelSlider::ChangeValues(const std::vector<int32>& values)
 {
-	bool changed[kMostChannels] = {};
+	// A class derived from this one may allow more channels.
+	const auto changed = std::make_unique<bool[]>(CountChannels());
 	bool anyChanged = false;
 	for (int32 i = 0; i < CountChannels(); i++) {
 		changed[i] = values[i] != ValueFor(i);
@@ -291,7 +293,7 @@ BChannelSlider::ChangeValues(const std::vector<int32>& values)
 	if (!anyChanged || ModificationMessage() == NULL)
 		return;
 	BeginInvokeNotify(B_CONTROL_MODIFIED);
-	InvokeChannel(ModificationMessage(), 0, -1, changed);
+	InvokeChannel(ModificationMessage(), 0, -1, changed.get());
 	EndInvokeNotify();
 }
 
@@ -302,7 +304,7 @@ BChannelSlider::FinishChange()
 	if (!fIsChanging)
 		return;
 	fIsChanging = false;
-	bool changed[kMostChannels] = {};
+	const auto changed = std::make_unique<bool[]>(CountChannels());
 	bool anyChanged = false;
 	for (int32 i = 0; i < CountChannels(); i++) {
 		const size_t place = static_cast<size_t>(i);
@@ -311,5 +313,5 @@ BChannelSlider::FinishChange()
 	}
 	// What is sent may have the control deleted: nothing comes after it.
 	if (anyChanged)
-		InvokeChannel(NULL, 0, -1, changed);
+		InvokeChannel(NULL, 0, -1, changed.get());
 }

@@ -109,6 +109,7 @@ TEST_F(ChannelSliderTest, ChannelsThatAreNotThereAreRefused)
 	EXPECT_EQ(fSlider->SetLimitsFor(1, -1, numbers, numbers), B_BAD_INDEX);
 	EXPECT_EQ(fSlider->InvokeChannel(nullptr, 2, 2), B_BAD_INDEX);
 	EXPECT_EQ(fSlider->InvokeChannel(nullptr, INT_MAX), B_BAD_INDEX);
+	EXPECT_EQ(fSlider->InvokeChannel(nullptr, INT_MIN), B_BAD_INDEX);
 }
 
 
@@ -349,6 +350,30 @@ TEST_F(ChannelSliderTest, ChannelsMayGoWhileOneIsDragged)
 	});
 	fRobot->Key("end");
 	EXPECT_EQ(Values(), "10000 ");
+}
+
+
+TEST_F(ChannelSliderTest, DerivedClassMayHaveMoreChannels)
+{
+	class Wide : public BChannelSlider {
+	public:
+		using BChannelSlider::BChannelSlider;
+		int32 MaxChannelCount() const override { return 100; }
+	};
+	Wide* wide = Add(new Wide(BRect(10, 120, 289, 189), "wide", nullptr, new BMessage('wide'),
+		B_VERTICAL, 1, B_FOLLOW_LEFT_TOP, B_WILL_DRAW | B_NAVIGABLE));
+	ASSERT_EQ(wide->SetChannelCount(100), B_OK);
+	wide->SetModificationMessage(new BMessage('wmod'));
+	Show();
+	Do([&] {
+		wide->SetCurrentChannel(99);
+		wide->MakeFocus();
+	});
+	fRobot->Key("end");
+	const std::vector<BMessage> received = Take();
+	ASSERT_EQ(received.size(), 2u);
+	EXPECT_FALSE(received[1].GetBool("be:channel_changed", 98, true));
+	EXPECT_TRUE(received[1].GetBool("be:channel_changed", 99, false));
 }
 
 
