@@ -303,11 +303,8 @@ TProjectCheck::CheckHandler(
 		Report(handler() + " is no C++ identifier; rename the component or switch the event off");
 
 	BString parameters(event.parameters);
-	BString returnType(event.returnType);
-	if (fDialect == DIALECT_STANDARD) {
+	if (fDialect == DIALECT_STANDARD)
 		parameters = PlainSource(parameters.String());
-		returnType = PlainSource(returnType.String());
-	}
 	if (!IsAscii(parameters.String()))
 		Report(handler()
 			+ " would not compile: its parameters hold characters that are no plain ASCII"
@@ -316,7 +313,7 @@ TProjectCheck::CheckHandler(
 		Report(handler() + " would not compile: the brackets of its parameters do not match;"
 			+ " switch the event off");
 	if (event.returnType != nullptr
-		&& (!IsAscii(returnType.String()) || !IsReturnable(returnType.String())))
+		&& (!IsAscii(event.returnType) || !IsReturnable(event.returnType)))
 		Report(handler() + " would not compile: it cannot return " + Quoted(event.returnType)
 			+ "; switch the event off");
 

@@ -119,9 +119,8 @@ StandardHandlerStart(const TEvent& event, const char* className, const char* nam
 	const BString parameters = PlainParameters(event);
 	const BString marked =
 		HasParameters(parameters) ? MarkedParameters(parameters) : BString("void");
-	const BString returnType = PlainSource(HandlerReturnType(event));
 	return HandlerStart(
-		TEvent(event.name, marked.String(), returnType.String(), true), className, name);
+		TEvent(event.name, marked.String(), event.returnType, true), className, name);
 }
 
 
@@ -132,7 +131,7 @@ StandardHandlerBody(const TEvent& event, const char* baseClass)
 		return HandlerBody(event);
 
 	BString text("$TAB");
-	text << PlainSource(event.returnType) << " result";
+	text << event.returnType << " result";
 	if (baseClass != nullptr && strcmp(event.name, "OnQuitRequested") == 0)
 		text << " = " << baseClass << "::" << HandlerName(event) << "();\n\n";
 	else

@@ -349,8 +349,23 @@ TEST(StandardDialectTest, TheCheckTakesOddSpacesButNoBadNames)
 	form->SetEventSelection("OnMouseMoved", true);
 	EXPECT_EQ(TProjectCheck(&project.App(), "app", DIALECT_CLASSIC).Run().size(), 2u);
 	TProjectCheck check(&project.App(), "app", DIALECT_STANDARD);
-	ASSERT_EQ(check.Run().size(), 1u);
-	EXPECT_EQ(check.Run()[0].text, "the name of the form 'Form 1' is no C++ identifier; rename it");
+	const std::vector<project_problem> problems = check.Run();
+	ASSERT_EQ(problems.size(), 1u);
+	EXPECT_EQ(problems[0].text, "the name of the form 'Form 1' is no C++ identifier; rename it");
+}
+
+
+TEST(StandardDialectTest, TheCheckTakesNoOddSpacesInResults)
+{
+	SampleProject project;
+	TDesignForm* form = project.AddForm("Form1", "/projects/Form1.frm");
+	auto* button = project.Place(form, new TSampleControl("TButton", "Button1", 0, 0, 9, 9));
+	// A handler is found by its result, so that cannot be another one in each dialect.
+	button->AddSelectedEvent("OnAsk", nullptr, "char\xc2\xa0*");
+	TProjectCheck check(&project.App(), "app", DIALECT_STANDARD);
+	const std::vector<project_problem> problems = check.Run();
+	ASSERT_EQ(problems.size(), 1u);
+	EXPECT_TRUE(Has(problems[0].text, "it cannot return 'char\xc2\xa0*'"));
 }
 
 
