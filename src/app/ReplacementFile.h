@@ -12,15 +12,21 @@ enum replacement_sync {
 	REPLACE_UNSYNCED // for files that can be made again: leaves the order of writing to the file system
 };
 
+/// What the names of files begin with that are about to take another one's place.
+extern const char* const kReplacementPrefix;
+
 /// The next content of a file: written beside the present one, and put in its place in one step.
 ///
 /// Whoever reads the path meanwhile, or after a crash, finds the old content or the new one, whole.
 /// A link is followed: the file that it leads to is replaced. Something that is no regular file (a
 /// device, for instance) has no content to lose and is written directly. Not thread-safe.
+///
+/// The new file is locked (BNode::Lock()) as long as it is being written. One that nobody has locked was left
+/// behind by a program that was killed, and goes when the next file in its folder is written.
 class TReplacementFile {
 public:
 	/// Makes the new file beside \a path. Nothing that exists is touched before Replace().
-	explicit TReplacementFile(const char* path);
+	explicit TReplacementFile(const char* path, replacement_sync sync = REPLACE_SYNCED);
 	/// Without a successful Replace() the new file is removed again.
 	~TReplacementFile();
 
@@ -40,14 +46,17 @@ public:
 	///
 	/// Attributes already set on Stream() win over those of the present file. On failure the present
 	/// file is as it was. B_DEVICE_FULL and the like tell why.
-	status_t Replace(replacement_sync sync = REPLACE_SYNCED);
+	status_t Replace();
 
 private:
 	status_t OpenBeside(const char* path);
+	status_t MakeNewFile(const char* folder);
+	bool IsNewFileInPlace() const;
 	void TakeOverAttributes(BFile& present);
 
 	BString fPath;
 	BString fNewPath; // empty when the path is written directly
 	BFile fNewFile;
+	const replacement_sync fSync;
 	status_t fStatus;
 };

@@ -30,7 +30,8 @@ HasContent(const char* path, const BString& text)
 status_t
 ReplaceContent(const char* path, const char* content, size_t length, bool isNew)
 {
-	TReplacementFile replacement(path);
+	// Waiting for the disk would take longer than everything else that the generator does.
+	TReplacementFile replacement(path, REPLACE_UNSYNCED);
 	status_t status = replacement.InitCheck();
 	if (status != B_OK)
 		return status;
@@ -43,8 +44,7 @@ ReplaceContent(const char* path, const char* content, size_t length, bool isNew)
 	mode_t permissions;
 	if (isNew && stream->GetPermissions(&permissions) == B_OK)
 		stream->SetPermissions(permissions & kSourcePermissions);
-	// Waiting for the disk would take longer than everything else that the generator does.
-	return replacement.Replace(REPLACE_UNSYNCED);
+	return replacement.Replace();
 }
 
 } // namespace

@@ -8,12 +8,13 @@
 #include <cstring>
 
 static bool sShown = true;
+static thread_local bool sSilent = false;
 
 
 void
 PrintDiagnostic(const char* format, ...)
 {
-	if (!sShown)
+	if (!sShown || sSilent)
 		return;
 	va_list arguments;
 	va_start(arguments, format);
@@ -25,7 +26,7 @@ PrintDiagnostic(const char* format, ...)
 void
 PrintCall(const char* function, const char* first, const char* second)
 {
-	if (!sShown)
+	if (!sShown || sSilent)
 		return;
 
 	// Put together here, a line takes a fraction of what printf() takes for it.
@@ -50,4 +51,17 @@ void
 ShowDiagnostics(bool shown)
 {
 	sShown = shown;
+}
+
+
+TDiagnosticSilence::TDiagnosticSilence()
+	: fWasSilent(sSilent)
+{
+	sSilent = true;
+}
+
+
+TDiagnosticSilence::~TDiagnosticSilence()
+{
+	sSilent = fWasSilent;
 }

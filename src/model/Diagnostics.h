@@ -22,3 +22,16 @@ void PrintCall(const char* function, const char* first, const char* second);
 /// Whether diagnostics are printed, as they are at first. For programs whose standard output nobody sees, which
 /// need not wait for the texts to be put together: call it before there are other threads.
 void ShowDiagnostics(bool shown);
+
+/// Keeps the diagnostics of this thread back for the length of a block: of work that the user did not ask for.
+class TDiagnosticSilence {
+public:
+	TDiagnosticSilence();
+	~TDiagnosticSilence();
+
+	TDiagnosticSilence(const TDiagnosticSilence&) = delete;
+	TDiagnosticSilence& operator=(const TDiagnosticSilence&) = delete;
+
+private:
+	bool fWasSilent;
+};
