@@ -16,11 +16,14 @@
 #include "app/WindowGuard.h"
 #include "codegen/CodeGenerator.h"
 #include "designer/FormFile.h"
+#include "designer/LostWork.h"
+#include "designer/Recovery.h"
 #include "designer/RefFilters.h"
 #include "palette/ComponentPalette.h"
 #include "palette/ComponentPaletteView.h"
 #include "palette/LibraryLoader.h"
 #include "palette/PaletteCatalog.h"
+#include "project/Project.h"
 #include "project/ProjectOperation.h"
 #include "project/ProjectView.h"
 #include "project/ProjectWin.h"
@@ -33,6 +36,8 @@ constexpr const char* kFormDescription = "Plim++ Form";
 constexpr const char* kProjectDescription = "Plim++ Project";
 constexpr const char* kProposedName = "Project1.plim";
 constexpr size_t kWarningSize = 286;
+constexpr uint32 kMsgOfferLostWork = 'lost';
+constexpr int32 kMostFormsNamed = 10;
 
 // The palette takes the height of its column when it has this many entries at most.
 constexpr int32 kMostEntriesShown = 19;
@@ -52,6 +57,29 @@ InstallDocumentType(const char* type, const char* description)
 	mimeType.SetShortDescription(description);
 	mimeType.SetLongDescription(description);
 	mimeType.Install();
+}
+
+
+BString
+QuestionAbout(const lost_project& project)
+{
+	BString text("The designer ended before all work was saved. Of ");
+	if (project.path.IsEmpty())
+		text << "a new project";
+	else
+		text << "the project '" << project.path << "'";
+	text << " there are unsaved forms:";
+	int32 count = 0;
+	for (const lost_form& form : project.forms) {
+		if (count == kMostFormsNamed) {
+			text << " and " << static_cast<int32>(project.forms.size()) - count << " more";
+			break;
+		}
+		text << (count++ == 0 ? " " : ", ") << form.name;
+	}
+	text << ".\n\nRecover opens the project with them; nothing is saved by that. "
+		 << "Later asks again at the next start.";
+	return text;
 }
 
 
@@ -170,6 +198,10 @@ PlimApp::MessageReceived(BMessage* message)
 			AboutRequested();
 			break;
 
+		case kMsgOfferLostWork:
+			OfferLostWork();
+			break;
+
 		default:
 			BApplication::MessageReceived(message);
 			break;
@@ -250,7 +282,7 @@ PlimApp::SaveProject()
 		SaveProjectAs();
 		return;
 	}
-	if (!project->SaveToFile(name.String(), true))
+	if (!project->SaveToFile(name.String(), true) && project->Project()->OpenStatus() != B_CANCELED)
 		MsgBox("Error", "Unable to save the file.", "OK", nullptr, nullptr, B_WIDTH_AS_USUAL,
 			B_STOP_ALERT);
 }
@@ -295,6 +327,34 @@ PlimApp::GenerateCode()
 	TProjectOperation operation(project->Project());
 	Generator()->SetAppComponent(project->View()->AppComponent());
 	Generator()->ConfirmSettings();
+}
+
+
+void
+PlimApp::KeepRecoveryCopies()
+{
+	fRecovery = std::make_unique<TRecovery>();
+	// Comes after the messages that the application starts with.
+	if (fRecovery->InitCheck() == B_OK)
+		PostMessage(kMsgOfferLostWork);
+}
+
+
+/// Asks about the work that earlier runs have lost, one project after the other, until the user takes one.
+void
+PlimApp::OfferLostWork()
+{
+	TLostWork lostWork;
+	for (const lost_project& project : lostWork.Projects()) {
+		const int32 answer = MsgBox("Recovery", QuestionAbout(project).String(), "Later", "Discard",
+			"Recover", B_WIDTH_AS_USUAL, B_WARNING_ALERT);
+		if (answer == 1)
+			TLostWork::Discard(project);
+		if (answer == 2) {
+			MainWindow()->ProjectWindow()->Project()->Recover(project);
+			return;
+		}
+	}
 }
 
 

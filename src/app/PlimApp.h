@@ -11,6 +11,7 @@
 class BFilePanel;
 class PlimWin;
 class TProjectRefFilter;
+class TRecovery;
 
 /// The signature of the designer.
 extern const char* const APP_SIG;
@@ -58,6 +59,10 @@ public:
 	/// Loads the component libraries beside the program into the palette. Once.
 	void LoadComponentPalette();
 
+	/// From now on forms that are not saved yet have recovery copies, and those of designers that are no more are
+	/// offered to the user, after what the command line names was opened. Call it before Run(), once.
+	void KeepRecoveryCopies();
+
 private:
 	friend class PlimWin;
 
@@ -66,9 +71,11 @@ private:
 	void SaveProjectAs();
 	void SaveRequested(BMessage* message);
 	void GenerateCode();
+	void OfferLostWork();
 	void MainWindowQuit();
 
 	std::unique_ptr<TProjectRefFilter> fProjectFilter;
+	std::unique_ptr<TRecovery> fRecovery;
 	BFilePanel* fOpenPanel;
 	BFilePanel* fSavePanel;
 	std::atomic<PlimWin*> fMainWindow;

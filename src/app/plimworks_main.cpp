@@ -48,6 +48,7 @@ main(int argc, char** argv)
 
 	PlimApp app;
 	app.SetCursor(B_HAND_CURSOR);
+	app.KeepRecoveryCopies();
 	app.Run();
 	return 0;
 }

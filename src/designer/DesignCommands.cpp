@@ -355,7 +355,7 @@ TDesignFormView::SaveAsChosen(BMessage* message)
 void
 TDesignFormView::SaveOrWarn(const char* path)
 {
-	if (SaveToFile(path))
+	if (SaveAfterAsking(path) != FORM_NOT_SAVED)
 		return;
 	WindowRelease release;
 	MsgBox("Warning", "Unable to save the form.", "OK", nullptr, nullptr, B_WIDTH_AS_USUAL,

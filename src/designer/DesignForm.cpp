@@ -129,6 +129,14 @@ TDesignForm::MessageReceived(BMessage* message)
 			ReplyToSave(message);
 			break;
 
+		case DFM_LOADCOPY:
+			ReplyToLoadCopy(message);
+			break;
+
+		case DFM_KEEPCOPY:
+			fDesignView->KeepDueCopy();
+			break;
+
 		case kMsgPaste:
 		case kMsgSavePanel:
 			fDesignView->MessageReceived(message);
@@ -372,6 +380,22 @@ TDesignForm::AdoptComponent(TComponent* component)
 
 
 void
+TDesignForm::ComponentModified(TComponent* component)
+{
+	fDesignView->ComponentModified(component);
+}
+
+
+void
+TDesignForm::OKToClose(bool closing)
+{
+	fClosing = closing;
+	if (closing)
+		fDesignView->KeepDueCopy();
+}
+
+
+void
 TDesignForm::UpdateWindowPosition()
 {
 	WriteFrame(this, Frame());
@@ -525,9 +549,24 @@ void
 TDesignForm::ReplyToLoad(BMessage* message)
 {
 	const char* path = nullptr;
-	const bool loaded = message->FindString("filename", &path) == B_OK && LoadFromFile(path);
+	ReplyToLoad(message, message->FindString("filename", &path) == B_OK && LoadFromFile(path));
+}
 
-	BMessage reply(DFM_LOADFILE);
+
+void
+TDesignForm::ReplyToLoadCopy(BMessage* message)
+{
+	BMessage copy;
+	ReplyToLoad(message,
+		message->FindMessage("copy", &copy) == B_OK
+			&& fDesignView->LoadCopy(copy, message->GetInt32("id", 0)));
+}
+
+
+void
+TDesignForm::ReplyToLoad(BMessage* message, bool loaded)
+{
+	BMessage reply(message->what);
 	reply.AddBool("result", loaded);
 	reply.AddString("formname", ComponentName());
 	message->SendReply(&reply);
@@ -537,9 +576,12 @@ TDesignForm::ReplyToLoad(BMessage* message)
 void
 TDesignForm::ReplyToSave(BMessage* message)
 {
-	const bool saved = *Filename() != '\0' && SaveToFile(Filename());
+	const form_save_result result =
+		*Filename() != '\0' ? fDesignView->SaveAfterAsking(Filename()) : FORM_NOT_SAVED;
 
 	BMessage reply(DFM_SAVEFILE);
-	reply.AddBool("result", saved);
+	reply.AddBool("result", result == FORM_SAVED);
+	if (result == FORM_SAVE_CANCELED)
+		reply.AddBool("canceled", true);
 	message->SendReply(&reply);
 }

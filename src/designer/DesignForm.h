@@ -14,7 +14,11 @@ class TLoadReport;
 
 enum {
 	DFM_LOADFILE = 'f_lF', // "filename" (string); reply: "result" (bool), "formname" (string)
-	DFM_SAVEFILE = 'f_sF'  // reply: "result" (bool)
+	DFM_SAVEFILE =
+		'f_sF', // reply: "result" (bool), "canceled" (bool) when the user did not want to overwrite
+	DFM_LOADCOPY =
+		'f_lC', // "copy" (message), "id" (int32): see TDesignFormView::LoadCopy(); replies as DFM_LOADFILE
+	DFM_KEEPCOPY = 'f_kC' // a recovery copy is due
 };
 
 /// Whether a design form's window appears. A hidden one is a document without a window thread, for
@@ -81,12 +85,13 @@ public:
 	TComponent* CreateComponent(BView* parent, BRect frame) override;
 	void DoneDroppingComponent() override;
 	bool AdoptComponent(TComponent* component) override;
+	void ComponentModified(TComponent* component) override;
 
 	/// A press beside the components: points the property window at the form.
 	virtual void MouseDown(BPoint where);
 
-	/// Lets the window really close from now on.
-	void OKToClose(bool closing) { fClosing = closing; }
+	/// Lets the window really close from now on. A recovery copy that is due is made.
+	void OKToClose(bool closing);
 
 	/// Writes the window's edges, rounded, into the editors of "Left", "Top", "Right" and "Bottom".
 	void UpdateWindowPosition();
@@ -117,6 +122,8 @@ private:
 	bool ApplyColor(const char* name, const char* value);
 	void ReplyToLoad(BMessage* message);
 	void ReplyToSave(BMessage* message);
+	void ReplyToLoadCopy(BMessage* message);
+	void ReplyToLoad(BMessage* message, bool loaded);
 
 	TFormHost* fHost;
 	TDesignFormView* fDesignView;

@@ -9,10 +9,7 @@
 
 #include "designer/DesignForm.h"
 #include "designer/FormHost.h"
-#include "designer/FormReader.h"
-#include "designer/FormWriter.h"
 #include "model/Diagnostics.h"
-#include "model/FixedText.h"
 #include "palette/PaletteCatalog.h"
 #include "palette/PaletteEntry.h"
 
@@ -27,6 +24,9 @@ TDesignFormView::TDesignFormView(BRect frame, TDesignForm* form)
 	: BView(frame, "vwDesign", B_FOLLOW_ALL_SIDES, B_WILL_DRAW),
 	  fForm(form),
 	  fFilename(),
+	  fIsIncomplete(false),
+	  fCopyId(0),
+	  fCopyIsDue(false),
 	  fModified(false),
 	  fIsMainForm(false)
 {
@@ -76,8 +76,10 @@ void
 TDesignFormView::SetModified(bool modified)
 {
 	fModified = modified;
-	if (modified)
+	if (modified) {
+		WantCopy();
 		return;
+	}
 	for (int32 i = 0; i < TFormDesigner::CountComponents(); i++) {
 		TComponent* component = TFormDesigner::ComponentAt(i);
 		if (component->Modified())
@@ -104,6 +106,13 @@ TDesignFormView::ComponentPropertyModified(TComponent*, const char*, const char*
 {
 	SetModified(true);
 	return true;
+}
+
+
+void
+TDesignFormView::ComponentModified(TComponent*)
+{
+	WantCopy();
 }
 
 
@@ -140,37 +149,4 @@ void
 TDesignFormView::DoneDroppingComponent()
 {
 	PaletteCatalog().SetDropEntry(nullptr);
-}
-
-
-bool
-TDesignFormView::SaveToFile(const char* path)
-{
-	TFormWriter writer(this);
-	if (!writer.Write(path))
-		return false;
-	SetFilename(path);
-	SetModified(false);
-	fForm->TFormComponent::SetModified(false);
-	return true;
-}
-
-
-bool
-TDesignFormView::LoadFromFile(const char* path, TLoadReport* report)
-{
-	TFormReader reader(this, report);
-	if (!reader.Read(path))
-		return false;
-	SetFilename(path);
-	SetModified(false);
-	fForm->TFormComponent::SetModified(false);
-	return true;
-}
-
-
-void
-TDesignFormView::SetFilename(const char* name)
-{
-	SetFixedText(fFilename, name);
 }

@@ -7,6 +7,7 @@
 
 #include <View.h>
 
+#include "designer/FileStamp.h"
 #include "model/FormComponent.h"
 #include "model/FormDesigner.h"
 
@@ -16,6 +17,9 @@ class BPopUpMenu;
 class TDesignForm;
 class TLoadReport;
 class TPaletteEntry;
+
+/// What came of saving a form.
+enum form_save_result { FORM_SAVED, FORM_NOT_SAVED, FORM_SAVE_CANCELED };
 
 /// The view that fills a design form: it owns the form's components, which are its child views.
 ///
@@ -58,6 +62,7 @@ public:
 	TComponent* CreateComponent(BView* parent, BRect frame) override;
 	void DoneDroppingComponent() override;
 	bool AdoptComponent(TComponent* component) override;
+	void ComponentModified(TComponent* component) override;
 	/// Makes \a component the only selected one, and shows it in the property window.
 	void ComponentSelected(TComponent* component) override;
 	/// Shows the new place of \a component in the property window, if that shows it.
@@ -100,6 +105,22 @@ public:
 	/// nothing changed, when the file cannot be read.
 	bool LoadFromFile(const char* path, TLoadReport* report = nullptr);
 
+	/// Saves, unless somebody else has changed the file since it was loaded or saved here and the user does not want
+	/// that overwritten. The window's lock is given up while the user is asked.
+	form_save_result SaveAfterAsking(const char* path);
+
+	/// Writes a recovery copy of the form, if it was changed. It is written by another thread, a little later.
+	void KeepCopy();
+	/// The same, if one is due.
+	void KeepDueCopy();
+
+	/// Removes the recovery copy: the user does not want what was changed.
+	void ForgetCopy();
+
+	/// Reads the form from a recovery copy (TRecovery), as a changed one. \a id: the copy's number; see
+	/// TRecovery::TakeOver(). False, with nothing changed, when it holds no form.
+	bool LoadCopy(const BMessage& copy, int32 id);
+
 	/// The form's file; empty when it was never saved. At most 255 bytes are kept.
 	const char* Filename() const { return fFilename; }
 	void SetFilename(const char* name);
@@ -135,11 +156,20 @@ private:
 	void MoveChildrenUp(TComponent* component, BView* parent);
 	bool CopyComponent(TComponent* component);
 
+	// The document and its recovery copy
+	bool IsChangedOnDisk(const char* path) const;
+	void WantCopy();
+
 	std::unique_ptr<BPopUpMenu> fComponentMenu;
 	std::unique_ptr<BPopUpMenu> fFormMenu;
 	std::unique_ptr<BFilePanel> fSavePanel;
 	TDesignForm* fForm;
 	char fFilename[256];
+	// What the file held when it was loaded or saved, and whether components of it were left out.
+	TFileStamp fStamp;
+	bool fIsIncomplete;
+	int32 fCopyId; // 0: there is no recovery copy
+	bool fCopyIsDue;
 	bool fModified;
 	bool fIsMainForm;
 };

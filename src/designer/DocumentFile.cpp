@@ -7,6 +7,7 @@
 #include <Entry.h>
 #include <File.h>
 #include <NodeInfo.h>
+#include <TypeConstants.h>
 
 #include "app/ReplacementFile.h"
 #include "model/FixedText.h"
@@ -63,7 +64,10 @@ TPLIMFile::OpenFile()
 		return false;
 
 	fStatus = Unflatten(&file);
-	return fStatus == B_OK;
+	if (fStatus != B_OK)
+		return false;
+	fStamp.Take(&file);
+	return true;
 }
 
 
@@ -74,6 +78,13 @@ TPLIMFile::SetFilename(const char* name)
 		return;
 	SetFixedText(fFilename, name);
 	fFilenameCut = strlen(name) >= sizeof(fFilename);
+}
+
+
+void
+TPLIMFile::SetAttribute(const char* name, const char* value)
+{
+	fAttributes.push_back({name, value});
 }
 
 
@@ -105,5 +116,21 @@ TPLIMFile::WriteDocument()
 	BNodeInfo info(file.Stream());
 	info.SetType(fFileType);
 	info.SetPreferredApp(kDesignerSignature, B_OPEN);
-	return file.Replace();
+	WriteAttributes(file.Stream());
+
+	TFileStamp stamp;
+	stamp.Take(file.Stream());
+	status = file.Replace();
+	if (status == B_OK)
+		fStamp = stamp;
+	return status;
+}
+
+
+void
+TPLIMFile::WriteAttributes(BNode* node) const
+{
+	for (const text_attribute& attribute : fAttributes)
+		node->WriteAttr(attribute.name.String(), B_STRING_TYPE, 0, attribute.value.String(),
+			attribute.value.Length() + 1);
 }

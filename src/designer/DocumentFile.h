@@ -3,9 +3,15 @@
 
 #pragma once
 
+#include <vector>
+
 #include <Path.h>
+#include <String.h>
 
 #include "app/TypedMessage.h"
+#include "designer/FileStamp.h"
+
+class BNode;
 
 /// A message that knows the file it is stored in and that file's type.
 ///
@@ -39,13 +45,28 @@ public:
 	/// The result of the last opening, reading or writing; B_NO_INIT before there was one.
 	status_t InitCheck() const { return fStatus; }
 
+	/// Gives the file a text attribute when it is written, in the same step as its content. Where a file system
+	/// keeps no attributes it is lost.
+	void SetAttribute(const char* name, const char* value);
+
+	/// What the file held when it was last opened, or holds since it was saved.
+	const TFileStamp& Stamp() const { return fStamp; }
+
 private:
+	struct text_attribute {
+		BString name;
+		BString value;
+	};
+
 	status_t ResolvePath();
 	status_t WriteDocument();
+	void WriteAttributes(BNode* node) const;
 
 	char fFilename[256];
 	bool fFilenameCut;
 	char fFileType[100];
 	BPath fPath;
 	status_t fStatus;
+	std::vector<text_attribute> fAttributes;
+	TFileStamp fStamp;
 };

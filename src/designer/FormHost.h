@@ -17,6 +17,9 @@ public:
 	/// that does not lock.
 	virtual std::vector<TDesignForm*> Forms() const = 0;
 
+	/// The project's file; empty when it was never saved. Any thread; see TProject::Filename().
+	virtual const char* ProjectFile() const = 0;
+
 	/// \a object, the application or a form, has a new name. Thread of the object's window, locked.
 	virtual void ObjectNameChanged(TComponent* object) = 0;
 

@@ -22,7 +22,8 @@
 
 TFormReader::TFormReader(TDesignFormView* form, TLoadReport* report)
 	: fForm(form),
-	  fReport(report)
+	  fReport(report),
+	  fIsIncomplete(false)
 {
 }
 
@@ -34,20 +35,27 @@ TFormReader::Read(const char* path)
 	file.SetFilename(path);
 	if (!file.OpenFile())
 		return false;
-	fPath = path;
+	fStamp = file.Stamp();
+	return ReadDocument(file, path);
+}
 
+
+bool
+TFormReader::ReadDocument(const BMessage& document, const char* path)
+{
+	fPath = path;
 	BMessage part;
 	{
 		TViewLock lock(fForm);
 		if (!lock.IsLocked())
 			return false;
-		if (file.FindMessage("_FormProperties", &part) == B_OK)
+		if (document.FindMessage("_FormProperties", &part) == B_OK)
 			ReadFormProperties(part);
-		if (file.FindMessage("_FormEvents", &part) == B_OK)
+		if (document.FindMessage("_FormEvents", &part) == B_OK)
 			ReadFormEvents(part);
 	}
 
-	if (file.FindMessage("Components", &part) != B_OK) {
+	if (document.FindMessage("Components", &part) != B_OK) {
 		PrintDiagnostic("No components found for '%s'\n", fForm->DesignWindow()->ComponentName());
 		return true;
 	}
@@ -130,6 +138,7 @@ TFormReader::CreateComponent(const char* savedName, const BMessage& record)
 	TPaletteEntry* entry = PaletteCatalog().FindPalEntry(className);
 	if (entry == nullptr) {
 		PrintDiagnostic("Warning: No palette entry found for '%s'\n", className);
+		fIsIncomplete = true;
 		if (fReport != nullptr) {
 			BString text;
 			text << "component '" << savedName
@@ -259,6 +268,7 @@ TFormReader::Nest(TComponent* child, TComponent* owner, const placement& place)
 void
 TFormReader::DropComponent(const char* savedName, const char* reason)
 {
+	fIsIncomplete = true;
 	if (fReport == nullptr)
 		return;
 	BString text;

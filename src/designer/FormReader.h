@@ -9,6 +9,8 @@
 #include <Rect.h>
 #include <String.h>
 
+#include "designer/FileStamp.h"
+
 class BMessage;
 class TComponent;
 class TDesignFormView;
@@ -25,6 +27,14 @@ public:
 
 	/// Reads the document at \a path into the form; false, with nothing changed, when that fails.
 	bool Read(const char* path);
+
+	/// Reads \a document, which is not in a file of its own, into the form. \a path: the form's file, for reports.
+	bool ReadDocument(const BMessage& document, const char* path);
+
+	/// What the document's file held.
+	const TFileStamp& Stamp() const { return fStamp; }
+	/// Whether a component of the document was left out.
+	bool IsIncomplete() const { return fIsIncomplete; }
 
 private:
 	struct placement {
@@ -45,6 +55,8 @@ private:
 	TDesignFormView* fForm;
 	TLoadReport* fReport;
 	BString fPath;
+	TFileStamp fStamp;
+	bool fIsIncomplete;
 	// By the components' saved names: who is inside another component, and where.
 	std::unordered_map<std::string, placement> fPlacements;
 };

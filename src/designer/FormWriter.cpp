@@ -35,19 +35,28 @@ bool
 TFormWriter::Write(const char* path)
 {
 	TPLIMFormFile file;
+	WriteInto(&file);
+	file.SetFilename(path);
+	if (!file.SaveFile())
+		return false;
+	fStamp = file.Stamp();
+	return true;
+}
+
+
+void
+TFormWriter::WriteInto(TTypedMessage* document)
+{
 	AddFormProperties(&fProperties);
 	AddFormEvents(&fEvents);
-	if (file.SetMessage("_FormProperties", &fProperties) != B_OK)
+	if (document->SetMessage("_FormProperties", &fProperties) != B_OK)
 		PrintDiagnostic("Warning: Unable to save form properties\n");
-	if (file.SetMessage("_FormEvents", &fEvents) != B_OK)
+	if (document->SetMessage("_FormEvents", &fEvents) != B_OK)
 		PrintDiagnostic("Warning: Unable to save form events\n");
 
 	BMessage collection('PCmp');
 	AddComponents(&collection);
-	file.AddMessage("Components", &collection);
-
-	file.SetFilename(path);
-	return file.SaveFile();
+	document->AddMessage("Components", &collection);
 }
 
 

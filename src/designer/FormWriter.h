@@ -5,8 +5,11 @@
 
 #include <Message.h>
 
+#include "designer/FileStamp.h"
+
 class TComponent;
 class TDesignFormView;
+class TTypedMessage;
 
 /// Writes one form into its document; used once.
 ///
@@ -18,6 +21,12 @@ public:
 
 	/// Writes the document to \a path; false, with the file as it was, when that fails.
 	bool Write(const char* path);
+
+	/// Fills \a document with the fields of a form's document.
+	void WriteInto(TTypedMessage* document);
+
+	/// What the document's file holds.
+	const TFileStamp& Stamp() const { return fStamp; }
 
 private:
 	void AddFormProperties(BMessage* properties);
@@ -33,4 +42,5 @@ private:
 	BMessage fRecord;
 	BMessage fProperties;
 	BMessage fEvents;
+	TFileStamp fStamp;
 };

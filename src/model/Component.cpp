@@ -11,6 +11,7 @@
 #include "model/Diagnostics.h"
 #include "model/Event.h"
 #include "model/FixedText.h"
+#include "model/FormDesigner.h"
 #include "model/NameCompare.h"
 #include "model/Property.h"
 #include "model/PropertyStore.h"
@@ -152,6 +153,8 @@ void
 TComponent::SetModified(bool modified)
 {
 	fModified = modified;
+	if (modified && fDesigner != nullptr)
+		fDesigner->ComponentModified(this);
 }
 
 

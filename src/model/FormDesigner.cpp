@@ -77,6 +77,12 @@ TFormDesigner::AdoptComponent(TComponent*)
 }
 
 
+void
+TFormDesigner::ComponentModified(TComponent*)
+{
+}
+
+
 bool
 TFormDesigner::IsForm(const TComponentOwner* owner) const
 {

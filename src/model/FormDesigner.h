@@ -46,6 +46,9 @@ public:
 	/// owner and its view no parent then. False when it cannot be had. True here.
 	virtual bool AdoptComponent(TComponent* component);
 
+	/// \a component was marked as changed. Nothing here.
+	virtual void ComponentModified(TComponent* component);
+
 	BView* DTFormView() const { return fDTFormView; }
 
 	/// Whether \a owner is the form itself, seen as its window or as its design surface, and not a

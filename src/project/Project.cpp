@@ -209,8 +209,10 @@ TProject::RemoveForm(TDesignForm* form)
 		fObserver.load()->FormRemoved(form);
 	{
 		WindowGuard guard(form, B_INFINITE_TIMEOUT);
-		if (guard.IsLocked())
+		if (guard.IsLocked()) {
 			fApp->RemoveComponent(form);
+			form->View()->ForgetCopy();
+		}
 	}
 	Close({form});
 	return true;

@@ -14,6 +14,7 @@
 #include <String.h>
 
 #include "designer/DesignForm.h"
+#include "designer/FileStamp.h"
 #include "designer/FormHost.h"
 #include "model/AppComponent.h"
 
@@ -23,6 +24,8 @@ class TLoadReport;
 class TPLIMFile;
 class TProjectObserver;
 class TProjectOperation;
+struct lost_form;
+struct lost_project;
 
 /// An application component and the design forms of its windows.
 ///
@@ -66,7 +69,17 @@ public:
 	///
 	/// A form without a file is told about in a box and left out. Without \a saveForms no form is
 	/// recorded. False when the document cannot be written, or cannot record a form; it is then as it was.
+	/// A file that somebody else has changed since it was opened or saved here is asked about first. If the user does
+	/// not want the project's overwritten, the result is false, and OpenStatus() B_CANCELED.
 	bool SaveToFile(const char* path, bool saveForms);
+
+	/// Starts anew with what an earlier run of the designer left unsaved: opens its project, or a new one, with the
+	/// recovery copies in place of the forms' files. They become this run's. Forms that the project's file does not
+	/// have are added. Needs a TRecovery.
+	void Recover(const lost_project& lost);
+
+	/// Removes the recovery copies of all forms: the user does not want what was changed.
+	void ForgetCopies();
 
 	/// The result of the last opening or writing of a document.
 	status_t OpenStatus() const { return fStatus; }
@@ -100,14 +113,19 @@ public:
 	/// a form of the project already: two forms would overwrite each other.
 	TDesignForm* AddFormFile(const char* path);
 
-	/// Takes \a form out of the project and closes it; false when it is no form of the project.
+	/// Takes \a form out of the project and closes it, and its recovery copy goes; false when it is no form of the
+	/// project.
 	bool RemoveForm(TDesignForm* form);
 
 	/// Has \a form write itself to its file; false when it has none or that fails.
-	bool SaveForm(TDesignForm* form);
+	///
+	/// A file that somebody else has changed is asked about. \a canceled, if not null, tells that the user did not
+	/// want it overwritten.
+	bool SaveForm(TDesignForm* form, bool* canceled = nullptr);
 
 	// TFormHost
 	std::vector<TDesignForm*> Forms() const override;
+	const char* ProjectFile() const override { return Filename(); }
 	void ObjectNameChanged(TComponent* object) override;
 
 	/// Any thread.
@@ -170,8 +188,11 @@ private:
 	bool ReadForm(TDesignForm* form, const char* path, TLoadReport* report, BString* name);
 	bool AddAppTo(TPLIMFile* document);
 	bool SaveForms(TPLIMFile* document);
+	bool LoadCopy(TDesignForm* form, const lost_form& lost, BString* name);
+	void AddLostForms();
+	bool MayOverwrite(const char* path);
 	void ReadMainForm();
-	void WriteMainForm();
+	BString MainFormName();
 	BString ResolvePath(const char* path) const;
 
 	const form_visibility fVisibility;
@@ -192,4 +213,10 @@ private:
 	bool fFilenameCut;
 
 	status_t fStatus;
+
+	// What fStampedFile held when it was loaded or saved. Only operations use it.
+	TFileStamp fStamp;
+	BString fStampedFile;
+	// During Recover(): the copies that no form has taken yet.
+	std::vector<const lost_form*> fLostForms;
 };

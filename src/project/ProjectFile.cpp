@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // The document of a project, and those of its forms.
 
+#include <algorithm>
 #include <cstring>
 
 #include <Entry.h>
@@ -14,6 +15,8 @@
 #include "designer/FormFile.h"
 #include "designer/Inspector.h"
 #include "designer/LoadReport.h"
+#include "designer/LostWork.h"
+#include "designer/Recovery.h"
 #include "model/Diagnostics.h"
 #include "model/Event.h"
 #include "model/Property.h"
@@ -68,6 +71,8 @@ TProject::LoadFromFile(const char* path, TLoadReport* report)
 	}
 
 	SetFilename(path);
+	fStamp = document.Stamp();
+	fStampedFile = path;
 	LoadApp(document);
 	LoadForms(document, report);
 	ReadMainForm();
@@ -84,6 +89,10 @@ TProject::SaveToFile(const char* path, bool saveForms)
 		fStatus = B_NAME_TOO_LONG;
 		return false;
 	}
+	if (!MayOverwrite(path)) {
+		fStatus = B_CANCELED;
+		return false;
+	}
 	TPLIMFile document(kProjectFileType);
 	document.what = 'PPrj';
 	if (!AddAppTo(&document))
@@ -92,15 +101,57 @@ TProject::SaveToFile(const char* path, bool saveForms)
 		return false;
 
 	document.SetFilename(path);
+	document.SetAttribute(kMainFormAttribute, MainFormName().String());
 	const bool saved = document.SaveFile();
 	fStatus = document.InitCheck();
 	if (!saved)
 		return false;
 
 	SetFilename(path);
-	WriteMainForm();
+	fStamp = document.Stamp();
+	fStampedFile = path;
 	MarkApp(false);
 	return true;
+}
+
+
+void
+TProject::Recover(const lost_project& lost)
+{
+	TProjectOperation operation(this);
+	for (const lost_form& form : lost.forms)
+		fLostForms.push_back(&form);
+	if (lost.path.IsEmpty() || !LoadFromFile(lost.path.String()))
+		NewProject(false);
+	AddLostForms();
+	fLostForms.clear();
+}
+
+
+void
+TProject::ForgetCopies()
+{
+	TProjectOperation operation(this);
+	for (TDesignForm* form : Forms()) {
+		WindowGuard guard(form, B_INFINITE_TIMEOUT);
+		if (guard.IsLocked())
+			form->View()->ForgetCopy();
+	}
+}
+
+
+/// Asks about a file that somebody else has changed.
+bool
+TProject::MayOverwrite(const char* path)
+{
+	if (fStampedFile != path || !fStamp.Differs(path))
+		return true;
+	BString text("Another program has changed the project file '");
+	text << path << "' since it was opened or saved here. Overwriting it loses those changes.";
+	WindowRelease release;
+	return MsgBox("Warning", text.String(), "Cancel", "Overwrite", nullptr, B_WIDTH_AS_USUAL,
+			   B_WARNING_ALERT)
+		== 1;
 }
 
 
@@ -138,15 +189,26 @@ TProject::AddFormFile(const char* path)
 
 
 bool
-TProject::SaveForm(TDesignForm* form)
+TProject::SaveForm(TDesignForm* form, bool* canceled)
 {
 	TProjectOperation operation(this);
-	if (fVisibility == FORM_HIDDEN)
-		return *form->Filename() != '\0' && form->SaveToFile(form->Filename());
+	if (canceled != nullptr)
+		*canceled = false;
+	if (fVisibility == FORM_HIDDEN) {
+		const form_save_result result = *form->Filename() != '\0'
+			? form->View()->SaveAfterAsking(form->Filename())
+			: FORM_NOT_SAVED;
+		if (canceled != nullptr)
+			*canceled = result == FORM_SAVE_CANCELED;
+		return result == FORM_SAVED;
+	}
 	WindowRelease release;
 	BMessage request(DFM_SAVEFILE);
 	BMessage reply;
-	return Ask(form, &request, &reply);
+	const bool saved = Ask(form, &request, &reply);
+	if (canceled != nullptr)
+		*canceled = reply.GetBool("canceled", false);
+	return saved;
 }
 
 
@@ -201,8 +263,12 @@ void
 TProject::LoadForm(TDesignForm* form, const char* path, TLoadReport* report)
 {
 	BString name;
-	const bool loaded = ReadForm(form, path, report, &name);
-	if (!loaded) {
+	const auto lost = std::find_if(fLostForms.begin(), fLostForms.end(),
+		[path](const lost_form* each) { return each->path == path; });
+	const bool recovered = lost != fLostForms.end() && LoadCopy(form, **lost, &name);
+	if (recovered)
+		fLostForms.erase(lost);
+	if (!recovered && !ReadForm(form, path, report, &name)) {
 		BString text;
 		text << "the form '" << name << "' cannot be read";
 		if (report != nullptr)
@@ -214,6 +280,46 @@ TProject::LoadForm(TDesignForm* form, const char* path, TLoadReport* report)
 	WindowGuard guard(form, B_INFINITE_TIMEOUT);
 	if (guard.IsLocked())
 		ObjectNameChanged(form);
+}
+
+
+/// Has the form, which is shown, read its recovery copy, which becomes one of this run's. \a name gets its name.
+bool
+TProject::LoadCopy(TDesignForm* form, const lost_form& lost, BString* name)
+{
+	TRecovery* recovery = TRecovery::Current();
+	const int32 id = recovery != nullptr ? recovery->TakeOver(lost.copyPath.String()) : 0;
+	if (id == 0)
+		return false;
+	WindowRelease release;
+	BMessage request(DFM_LOADCOPY);
+	request.AddMessage("copy", &lost.copy);
+	request.AddInt32("id", id);
+	BMessage reply;
+	const bool loaded = Ask(form, &request, &reply);
+	const char* formName = "";
+	reply.FindString("formname", &formName);
+	*name = formName;
+	return loaded;
+}
+
+
+/// Adds the forms whose copies are left over: the project's file has not heard of them.
+void
+TProject::AddLostForms()
+{
+	for (const lost_form* lost : fLostForms) {
+		TDesignForm* form = MakeForm(lost->name.String());
+		BString name;
+		if (!LoadCopy(form, *lost, &name)) {
+			Close({form});
+			continue;
+		}
+		Enter({form, BString(), BString()}, name.String());
+		if (lost->path.IsEmpty() && lost->copy.GetBool("main", false))
+			SetMainForm(form);
+		MarkApp(true);
+	}
 }
 
 
@@ -286,7 +392,8 @@ TProject::SaveForms(TPLIMFile* document)
 			MsgBox("Information", "There's a form with no filename. Better save that.", "OK");
 			continue;
 		}
-		if (!SaveForm(entry.form))
+		bool canceled;
+		if (!SaveForm(entry.form, &canceled) && !canceled)
 			MsgBox("Warning", "Unable to save the form.", "OK");
 		const bool asRead = path == entry.resolvedPath;
 		// A name that the document uses itself cannot stand for a form, which would be lost.
@@ -310,23 +417,20 @@ TProject::ReadMainForm()
 	if (length <= 0)
 		return;
 	name[length] = '\0';
-	SetMainForm(FindForm(name));
+	if (*name != '\0')
+		SetMainForm(FindForm(name));
 }
 
 
-void
-TProject::WriteMainForm()
+BString
+TProject::MainFormName()
 {
-	BNode node(Filename());
-	node.RemoveAttr(kMainFormAttribute);
 	for (TDesignForm* form : Forms()) {
 		WindowGuard guard(form, B_INFINITE_TIMEOUT);
-		if (!guard.IsLocked() || !form->IsMainForm())
-			continue;
-		const char* name = form->ComponentName();
-		node.WriteAttr(kMainFormAttribute, B_STRING_TYPE, 0, name, strlen(name) + 1);
-		return;
+		if (guard.IsLocked() && form->IsMainForm())
+			return form->ComponentName();
 	}
+	return BString();
 }
 
 

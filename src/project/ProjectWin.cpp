@@ -119,6 +119,8 @@ ProjectWin::CloseProject()
 		const int32 answer = YesNoCancelBox(text.String());
 		if (answer == 2 || (answer == 0 && !SaveBeforeClosing()))
 			return false;
+		if (answer == 1)
+			fProject->ForgetCopies();
 	}
 	NewProject(false);
 	return true;

@@ -37,11 +37,25 @@ protected:
 	command_result RunScript(const std::string& script, const std::string& arguments = "",
 		const std::string& program = kProgram)
 	{
+		return RunCommand(Prepare(script) + " timeout 100 " + program + " " + arguments);
+	}
+
+	/// The same, but as soon as there is a file \a path in the settings, the designer is killed.
+	command_result RunAndKill(
+		const std::string& script, const std::string& arguments, const std::string& path)
+	{
+		return RunCommand(Prepare(script) + " " + kProgram + " " + arguments
+			+ " & plim=$!; for i in " + "$(seq 600); do for f in settings/" + path
+			+ "; do [ -e \"$f\" ] && break 2; done; sleep 0.1; done; kill -9 $plim; wait $plim");
+	}
+
+	std::string Prepare(const std::string& script)
+	{
 		const std::string file = fFolder.Write("script", "limit 60\n" + script);
-		return RunCommand("cd " + fFolder.Path() + " && HOME=" + fFolder.Path()
-			+ " XDG_CONFIG_HOME=" + fFolder.Make("settings") + " XDG_DATA_HOME="
-			+ fFolder.Make("data") + " LD_LIBRARY_PATH=" PLIM_BUILD_DIR "/lib BE_ROBOT_SCRIPT="
-			+ file + " " + fEnvironment + " timeout 100 " + program + " " + arguments);
+		return "cd " + fFolder.Path() + "; HOME=" + fFolder.Path() + " XDG_CONFIG_HOME="
+			+ fFolder.Make("settings") + " XDG_DATA_HOME=" + fFolder.Make("data")
+			+ " LD_LIBRARY_PATH=" PLIM_BUILD_DIR "/lib BE_ROBOT_SCRIPT=" + file + " "
+			+ fEnvironment;
 	}
 
 	BRect StoredFrame(const char* key)
@@ -187,6 +201,28 @@ TEST_F(PlimworksTest, TheBoxAboutABadProjectIsAnsweredByEscape)
 	ExpectCleanEnd(RunScript("wait-window Warning\nkey escape\nwait-no-window Warning\n"
 							 "wait-window Plimworks\nquit\n",
 		"bad.plim"));
+}
+
+
+TEST_F(PlimworksTest, KilledItOffersTheUnsavedWorkAtTheNextStart)
+{
+	std::filesystem::copy(PLIM_SOURCE_DIR "/examples/hello", fFolder / "one");
+	const std::string saved = fFolder.Read("one/MainForm.frm");
+	RunAndKill("wait-window Hello\ndrag-view Count 20 10\npause 60000\n", "one/hello.plim",
+		"Plim_Recovery/*.copy");
+	EXPECT_TRUE(fFolder.Read("one/MainForm.frm") == saved);
+
+	// Somebody else changes the form meanwhile, and is not overwritten without a question.
+	std::ofstream(fFolder / "one/MainForm.frm", std::ios::binary | std::ios::app) << "more";
+	const std::string picture = fFolder / "recovery.png";
+	ExpectCleanEnd(RunScript("wait-window Recovery\nsave-png " + picture
+			+ "\nclick-view Recover\nwait-window Hello\nwait-window Plimworks\nclick 250 30\n"
+			  "key command+s\nwait-window Warning\nclick-view Cancel\nwait-no-window Warning\n"
+			  "wait-window Plimworks\nclick 250 30\nkey command+s\nwait-window Warning\n"
+			  "click-view Overwrite\nwait-no-window Warning\nquit\n",
+		"one/hello.plim"));
+	EXPECT_FALSE(fFolder.Read("one/MainForm.frm").substr(0, saved.size()) == saved);
+	EXPECT_TRUE(std::filesystem::is_empty(fFolder / "settings/Plim_Recovery"));
 }
 
 

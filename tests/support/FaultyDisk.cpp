@@ -156,7 +156,8 @@ rename(const char* from, const char* to) noexcept
 
 
 int
-renameat2(int fromFolder, const char* from, int toFolder, const char* to, unsigned int flags) noexcept
+renameat2(
+	int fromFolder, const char* from, int toFolder, const char* to, unsigned int flags) noexcept
 {
 	NEXT(renameat2);
 	return Fails("rename", false) ? -1 : sNext(fromFolder, from, toFolder, to, flags);
