@@ -43,7 +43,8 @@ IsRawPrefix(std::string_view word)
 
 TSourceParts::TSourceParts(std::string_view source)
 	: fSource(source),
-	  fPosition(0)
+	  fPosition(0),
+	  fCodeStart(0)
 {
 }
 
@@ -56,7 +57,11 @@ TSourceParts::Next(source_part* part)
 
 	const size_t start = fPosition;
 	part->kind = KindAt(start);
+	if (part->kind == SOURCE_CODE)
+		fCodeStart = start;
 	fPosition = EndOf(part->kind, start);
+	if (part->kind != SOURCE_CODE)
+		fCodeStart = fPosition;
 	part->text = fSource.substr(start, fPosition - start);
 	return true;
 }
@@ -66,7 +71,7 @@ TSourceParts::Next(source_part* part)
 source_part_kind
 TSourceParts::KindAt(size_t position) const
 {
-	const std::string_view before = fSource.substr(0, position);
+	const std::string_view before = fSource.substr(fCodeStart, position - fCodeStart);
 	if (fSource[position] == '"')
 		return IsRawPrefix(LastWord(before)) ? SOURCE_RAW_STRING : SOURCE_STRING;
 	if (fSource[position] == '\'') {

@@ -41,4 +41,6 @@ private:
 
 	std::string_view fSource;
 	size_t fPosition;
+	size_t
+		fCodeStart; // of the code that the next part follows, the next part's start when there is none
 };
