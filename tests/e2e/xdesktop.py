@@ -23,13 +23,17 @@ LIMIT = 40
 TOOLS = ("Xvfb", "openbox", "xdotool", "xclip")
 PR_SET_PDEATHSIG = 1
 AWAY = (1000, 740)
-# The default theme and all keys would be the user's; one key is enough.
+# The default theme and all keys would be the user's; a few keys are enough.
 WINDOW_MANAGER_SETTINGS = """<?xml version="1.0" encoding="UTF-8"?>
 <openbox_config xmlns="http://openbox.org/3.4/rc">
   <focus><focusNew>yes</focusNew></focus>
   <resistance><strength>0</strength><screen_edge_strength>0</screen_edge_strength></resistance>
   <desktops><number>1</number><popupTime>0</popupTime></desktops>
-  <keyboard><keybind key="A-F4"><action name="Close"/></keybind></keyboard>
+  <keyboard>
+    <keybind key="A-F4"><action name="Close"/></keybind>
+    <keybind key="A-F9"><action name="Iconify"/></keybind>
+    <keybind key="A-F10"><action name="ToggleMaximize"/></keybind>
+  </keyboard>
 </openbox_config>
 """
 

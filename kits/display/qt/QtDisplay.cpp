@@ -62,6 +62,7 @@ QtDisplay::QtDisplay(bool managesFocus)
 	  fLastRepeatKey(0),
 	  fRepeats(0),
 	  fIsActive(true),
+	  fToldActive(false),
 	  fIsDraggingOut(false),
 	  fWindowUnderDrag(nullptr),
 	  fOverlayIsPending(false),
@@ -308,6 +309,7 @@ QtDisplay::ApplicationStateChanged(bool active)
 		});
 		return;
 	}
+	TellActive(true);
 	if (fIsActive)
 		return;
 	fIsActive = true;
@@ -315,10 +317,6 @@ QtDisplay::ApplicationStateChanged(bool active)
 		if (window->Window() != nullptr)
 			window->Window()->ShowAgain();
 	}
-	BMessage activated(B_APP_ACTIVATED);
-	activated.AddBool("active", true);
-	if (be_app != nullptr)
-		be_app->PostMessage(&activated);
 }
 
 
@@ -330,10 +328,21 @@ QtDisplay::HideFloatingWindows()
 		if (window->Window() != nullptr)
 			window->Window()->HideWhileInactive();
 	}
-	BMessage deactivated(B_APP_ACTIVATED);
-	deactivated.AddBool("active", false);
+	TellActive(false);
+}
+
+
+// A program is not active before its first window is, but its floating windows are shown from the beginning.
+void
+QtDisplay::TellActive(bool active)
+{
+	if (fToldActive == active)
+		return;
+	fToldActive = active;
+	BMessage activated(B_APP_ACTIVATED);
+	activated.AddBool("active", active);
 	if (be_app != nullptr)
-		be_app->PostMessage(&deactivated);
+		be_app->PostMessage(&activated);
 }
 
 

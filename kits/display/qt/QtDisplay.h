@@ -108,6 +108,7 @@ private:
 	void ApplicationStateChanged(bool active);
 	QtWindow* FloatingWindow() const;
 	void HideFloatingWindows();
+	void TellActive(bool active);
 	void OverlayChanged();
 	void RepaintOverlay();
 	bool CanDragOut() const;
@@ -130,6 +131,7 @@ private:
 	int32 fLastRepeatKey;
 	int32 fRepeats;
 	bool fIsActive;
+	bool fToldActive;
 	bool fIsDraggingOut;
 	StackedWindow* fWindowUnderDrag;
 
