@@ -9,6 +9,8 @@ set(plimworks_cmake_dir ${CMAKE_INSTALL_LIBDIR}/cmake/Plimworks)
 
 foreach(program plimworks plimgen)
   if(TARGET ${program})
+    set_target_properties(${program} PROPERTIES
+      INSTALL_RPATH "$ORIGIN/../${CMAKE_INSTALL_LIBDIR}")
     install(TARGETS ${program} RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})
   endif()
 endforeach()
@@ -29,10 +31,22 @@ foreach(dir IN LISTS component_dirs)
     if(type STREQUAL "MODULE_LIBRARY")
       set_target_properties(${library} PROPERTIES
         INSTALL_RPATH "$ORIGIN/../../${CMAKE_INSTALL_LIBDIR}")
+      list(APPEND component_libraries ${library})
       install(TARGETS ${library} LIBRARY DESTINATION ${CMAKE_INSTALL_BINDIR}/Components)
     endif()
   endforeach()
 endforeach()
+
+# The paths to the libraries are the same in the build folder and installed. Paths to be replaced when
+# installing end with an empty entry, in which the loader looks for every library at every start.
+
+if(CMAKE_INSTALL_LIBDIR STREQUAL "lib")
+  foreach(target plimworks plimgen be ormi plim be_display_qt ${component_libraries})
+    if(TARGET ${target})
+      set_target_properties(${target} PROPERTIES BUILD_WITH_INSTALL_RPATH ON)
+    endif()
+  endforeach()
+endif()
 
 # Headers
 

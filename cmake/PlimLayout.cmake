@@ -11,4 +11,5 @@ set(PLIM_COMPONENTS_DIR ${CMAKE_BINARY_DIR}/bin/Components)
 set(CMAKE_BUILD_RPATH_USE_ORIGIN ON)
 # The headers of all libraries, in folders whose names cannot meet those of the system.
 set(PLIM_INSTALL_INCLUDEDIR ${CMAKE_INSTALL_INCLUDEDIR}/plimworks)
-set(CMAKE_INSTALL_RPATH "$ORIGIN/../${CMAKE_INSTALL_LIBDIR}" "$ORIGIN")
+# Where installed libraries find each other; programs and component libraries have paths of their own.
+set(CMAKE_INSTALL_RPATH "$ORIGIN")
