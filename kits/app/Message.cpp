@@ -312,14 +312,14 @@ BMessage::AddData(
 		return AddData(name, type, copy.data(), numBytes, isFixedSize);
 	}
 
-	int32 index;
-	const status_t status = FindField(name, type, &index);
-	if (status == B_NAME_NOT_FOUND)
-		return AddField(name, type, isFixedSize, data, uint32(numBytes));
-	if (status != B_OK)
-		return status;
+	const FieldName fieldName(name);
+	const int32 index = IndexOf(fieldName);
+	if (index < 0)
+		return AddField(fieldName, type, isFixedSize, data, uint32(numBytes));
 
 	const Field& field = fBody->Fields()[index];
+	if (field.type != type)
+		return B_BAD_TYPE;
 	if (field.IsFixedSize() && field.dataSize / field.count != size_t(numBytes))
 		return B_BAD_VALUE;
 	return AddItem(index, data, uint32(numBytes));
@@ -341,24 +341,30 @@ BMessage::ReplaceData(
 		return B_BAD_VALUE;
 	if (numBytes > kMaxDataSize)
 		return B_NO_MEMORY;
-	if (Owns(data)) {
-		const uint8* bytes = static_cast<const uint8*>(data);
-		const std::vector<uint8> copy(bytes, bytes + numBytes);
-		return ReplaceData(name, type, index, copy.data(), numBytes);
-	}
 
 	int32 fieldIndex;
-	status_t status = FindField(name, type, &fieldIndex);
-	if (status != B_OK)
-		return status;
+	const status_t status = FindField(name, type, &fieldIndex);
+	return status == B_OK ? ReplaceItem(fieldIndex, index, data, uint32(numBytes)) : status;
+}
+
+
+/// Replaces an item of a field by \a newSize bytes, 1 or more, which may be this message's own.
+status_t
+BMessage::ReplaceItem(int32 fieldIndex, int32 index, const void* data, uint32 newSize)
+{
+	if (Owns(data)) {
+		const uint8* bytes = static_cast<const uint8*>(data);
+		const std::vector<uint8> copy(bytes, bytes + newSize);
+		return ReplaceItem(fieldIndex, index, copy.data(), newSize);
+	}
+
 	const uint8* oldData;
 	uint32 oldSize;
-	status = FindItem(fieldIndex, index, &oldData, &oldSize);
+	status_t status = FindItem(fieldIndex, index, &oldData, &oldSize);
 	if (status != B_OK)
 		return status;
 
 	const bool isFixedSize = fBody->Fields()[fieldIndex].IsFixedSize();
-	const uint32 newSize = uint32(numBytes);
 	if (isFixedSize && newSize != oldSize)
 		return B_BAD_VALUE;
 
@@ -380,13 +386,21 @@ status_t
 BMessage::SetData(const char* name, type_code type, const void* data, ssize_t numBytes,
 	bool isFixedSize, int32 count)
 {
-	const status_t status = ReplaceData(name, type, data, numBytes);
-	if (status != B_NAME_NOT_FOUND)
-		return status;
+	if (name == nullptr || data == nullptr || numBytes <= 0 || type == B_ANY_TYPE)
+		return B_BAD_VALUE;
+	if (numBytes > kMaxDataSize)
+		return B_NO_MEMORY;
+
+	const FieldName fieldName(name);
+	const int32 index = IndexOf(fieldName);
+	if (index >= 0) {
+		return fBody->Fields()[index].type == type ? ReplaceItem(index, 0, data, uint32(numBytes))
+												   : B_BAD_TYPE;
+	}
 	// Bytes of this message's own move while it grows.
 	if (Owns(name) || Owns(data))
 		return AddData(name, type, data, numBytes, isFixedSize, count);
-	return AddField(name, type, isFixedSize, data, uint32(numBytes));
+	return AddField(fieldName, type, isFixedSize, data, uint32(numBytes));
 }
 
 
@@ -443,18 +457,19 @@ BMessage::RemoveData(const char* name, int32 index)
 	if (status != B_OK)
 		return status;
 
-	Field& field = fBody->Fields()[fieldIndex];
-	if (field.count == 1) {
-		RemoveField(fieldIndex);
-		return B_OK;
-	}
+	const Field& old = fBody->Fields()[fieldIndex];
+	if (old.count == 1)
+		return RemoveField(fieldIndex);
 
 	uint32 offset = uint32(data - fBody->Data());
-	if (!field.IsFixedSize()) {
+	if (!old.IsFixedSize()) {
 		offset -= sizeof(uint32);
 		size += sizeof(uint32);
 	}
-	ResizeBytes(fieldIndex, offset, size, 0);
+	status = ResizeBytes(fieldIndex, offset, size, 0);
+	if (status != B_OK)
+		return status;
+	Field& field = fBody->Fields()[fieldIndex];
 	field.dataSize -= size;
 	field.count--;
 	return B_OK;
@@ -466,9 +481,7 @@ BMessage::RemoveName(const char* name)
 {
 	int32 index;
 	const status_t status = FindField(name, B_ANY_TYPE, &index);
-	if (status == B_OK)
-		RemoveField(index);
-	return status;
+	return status == B_OK ? RemoveField(index) : status;
 }
 
 
@@ -484,24 +497,24 @@ BMessage::Rename(const char* oldEntry, const char* newEntry)
 	status_t status = FindField(oldEntry, B_ANY_TYPE, &index);
 	if (status != B_OK)
 		return status;
-	const size_t nameLength = strlen(newEntry) + 1;
-	if (nameLength > B_FIELD_NAME_LENGTH + 1)
+	const FieldName newName(newEntry);
+	if (newName.length > B_FIELD_NAME_LENGTH + 1)
 		return B_BAD_VALUE;
-	if (IndexOf(newEntry) >= 0)
+	if (IndexOf(newName) >= 0)
 		return B_NAME_IN_USE;
 
 	const Field& old = fBody->Fields()[index];
 	const uint32 offset = old.offset;
-	status = ResizeBytes(index, offset, old.nameLength, uint32(nameLength));
+	status = ResizeBytes(index, offset, old.nameLength, newName.length);
 	if (status != B_OK)
 		return status;
 
-	memcpy(fBody->Data() + offset, newEntry, nameLength);
+	memcpy(fBody->Data() + offset, newEntry, newName.length);
 	fBody->DropNames();
 	Unlink(index);
 	Field& field = fBody->Fields()[index];
-	field.nameLength = uint16(nameLength);
-	field.hash = Private::HashName(newEntry);
+	field.nameLength = uint16(newName.length);
+	field.hash = newName.hash;
 	Link(index);
 	return B_OK;
 }

@@ -7,6 +7,8 @@
 
 #include <Message.h>
 
+class MessageBytes;
+
 // The data block holds numbers exactly as a file does.
 static_assert(std::endian::native == std::endian::little);
 
@@ -17,6 +19,10 @@ inline constexpr uint32 kIndexedFieldCount = 64;
 
 /// The most bytes that the names and items of one message can take.
 inline constexpr uint32 kMaxDataSize = 0x7fffffff;
+
+/// Messages of that many bytes are read where they lie; smaller ones are copied. A nested message must also take half of
+/// the bytes that it lies in, which it keeps in memory.
+inline constexpr size_t kSharedSize = 64 * 1024;
 
 /// Functions that call themselves for nested messages go this deep. A file can nest far deeper.
 inline constexpr int32 kMaxNesting = 64;
@@ -41,8 +47,28 @@ struct BMessage::Field {
 };
 
 
+/// A name to look for, with what the look-up and a new field need to know of it.
+struct BMessage::FieldName {
+	explicit FieldName(const char* name);
+	/// The name of a field that is there.
+	FieldName(const char* name, const Field& field)
+		: text(name),
+		  length(field.nameLength),
+		  hash(field.hash)
+	{
+	}
+
+	const char* text;
+	uint32 length; // with the terminator
+	uint32 hash;
+};
+
+
 /// The fields of a message in one block of memory: this header, room for fieldCapacity fields, room
 /// for dataCapacity bytes.
+///
+/// The data of a large message that was read lies in the bytes it came from instead. Nobody changes those: Reserve() and
+/// ResizeBytes() make a block of the message's own first.
 ///
 /// Invariant: the data block holds, per field in the order of the fields and without gaps, the name
 /// with its terminator and the items. So the end of a field is the start of the next.
@@ -52,6 +78,9 @@ struct BMessage::Body {
 	uint32 dataSize;
 	uint32 fieldCapacity;
 	uint32 dataCapacity;
+	uint8* data;
+	// What the data lies in; null when it is the message's own, behind the fields.
+	MessageBytes* bytes;
 	// The variable item that was found last, index << 32 | offset of its size word, or 0: a loop over
 	// the items of a field would else walk from the first one each time. Several threads may be
 	// reading, so it is only touched by the functions below.
@@ -73,16 +102,26 @@ struct BMessage::Body {
 	static void Destroy(Body* body);
 
 	Field* Fields() { return reinterpret_cast<Field*>(this + 1); }
-	uint8* Data() { return reinterpret_cast<uint8*>(Fields() + fieldCapacity); }
+	uint8* Data() { return data; }
 	const char* NameOf(const Field& field)
 	{
 		return reinterpret_cast<const char*>(Data()) + field.offset;
 	}
+	/// Whether the field has that name.
+	bool HasName(const Field& field, const FieldName& name)
+	{
+		return field.hash == name.hash && field.nameLength == name.length
+			&& (NameOf(field) == name.text
+				|| __builtin_memcmp(NameOf(field), name.text, name.length) == 0);
+	}
+
+	/// Has the data lie at \a start in \a shared, which is acquired.
+	void ShareData(MessageBytes* shared, uint8* start, uint32 size);
 
 	/// Makes the table of names when there are enough fields for one; without memory there is none.
 	void IndexNames();
 	/// The slot of the table with the field of that name, or the empty one where it belongs.
-	int32* NameSlot(const char* name, uint32 nameLength, uint32 hash);
+	int32* NameSlot(const FieldName& name);
 	/// Enters a field that was linked at the end of its chain.
 	void AddName(int32 index);
 	/// Forgets the table and the ends of the chains, before a field goes or gets another name.

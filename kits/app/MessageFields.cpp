@@ -7,7 +7,26 @@
 #include <cstring>
 
 #include "app/MessageBody.h"
+#include "app/MessageBytes.h"
 #include "app/MessagePrivate.h"
+
+namespace {
+
+/// Messages start with room for so many fields and bytes. From twice as much on they grow slower.
+constexpr uint32 kSmallFieldCount = 8;
+constexpr uint32 kSmallDataSize = 128;
+
+
+/// A capacity of \a needed or more that keeps adding at the end cheap, in time and, for large messages, in memory.
+uint32
+GrownCapacity(uint32 old, uint32 needed, uint32 small)
+{
+	const uint64 grown = old < 2 * small ? uint64(old) * 2 : uint64(old) + old / 2;
+	return uint32(std::max<uint64>({needed, small, grown}));
+}
+
+} // namespace
+
 
 BMessage::Body*
 BMessage::Body::Create(uint32 fieldCapacity, uint32 dataCapacity)
@@ -22,6 +41,8 @@ BMessage::Body::Create(uint32 fieldCapacity, uint32 dataCapacity)
 	body->dataSize = 0;
 	body->fieldCapacity = fieldCapacity;
 	body->dataCapacity = dataCapacity;
+	body->data = reinterpret_cast<uint8*>(body->Fields() + fieldCapacity);
+	body->bytes = nullptr;
 	body->cursor = 0;
 	body->nameCursor = 0;
 	std::fill_n(body->lastLinks, kBucketCount, -1);
@@ -34,9 +55,24 @@ BMessage::Body::Create(uint32 fieldCapacity, uint32 dataCapacity)
 void
 BMessage::Body::Destroy(Body* body)
 {
-	if (body != nullptr)
-		free(body->names);
+	if (body == nullptr)
+		return;
+	if (body->bytes != nullptr)
+		body->bytes->Release();
+	free(body->names);
 	free(body);
+}
+
+
+void
+BMessage::Body::ShareData(MessageBytes* shared, uint8* start, uint32 size)
+{
+	shared->Acquire();
+	bytes = shared;
+	data = start;
+	dataSize = size;
+	// Nothing can be added there.
+	dataCapacity = size;
 }
 
 
@@ -63,7 +99,7 @@ BMessage::Body::IndexNames()
 			const Field& field = Fields()[i];
 			if (field.hash % kBucketCount != bucket)
 				continue;
-			int32* slot = NameSlot(NameOf(field), field.nameLength, field.hash);
+			int32* slot = NameSlot(FieldName(NameOf(field), field));
 			if (*slot < 0)
 				*slot = i;
 		}
@@ -72,19 +108,14 @@ BMessage::Body::IndexNames()
 
 
 int32*
-BMessage::Body::NameSlot(const char* name, uint32 nameLength, uint32 hash)
+BMessage::Body::NameSlot(const FieldName& name)
 {
 	// Fibonacci hashing: the low bits of the hash know the last letters only.
 	const int shift = std::countl_zero(namesSize - 1);
-	uint32 slot = (hash * 2654435769u) >> shift;
-	for (;; slot = (slot + 1) & (namesSize - 1)) {
-		if (names[slot] < 0)
-			return &names[slot];
-		const Field& field = Fields()[names[slot]];
-		if (field.hash == hash && field.nameLength == nameLength
-			&& memcmp(NameOf(field), name, nameLength) == 0)
-			return &names[slot];
-	}
+	uint32 slot = (name.hash * 2654435769u) >> shift;
+	while (names[slot] >= 0 && !HasName(Fields()[names[slot]], name))
+		slot = (slot + 1) & (namesSize - 1);
+	return &names[slot];
 }
 
 
@@ -102,7 +133,7 @@ BMessage::Body::AddName(int32 index)
 		return;
 	}
 	const Field& field = Fields()[index];
-	int32* slot = NameSlot(NameOf(field), field.nameLength, field.hash);
+	int32* slot = NameSlot(FieldName(NameOf(field), field));
 	if (*slot < 0)
 		*slot = index;
 }
@@ -118,16 +149,22 @@ BMessage::Body::DropNames()
 }
 
 
+BMessage::FieldName::FieldName(const char* name)
+	: text(name),
+	  hash(0)
+{
+	const char* end = name;
+	for (; *end != '\0'; end++)
+		hash = Private::HashStep(hash, *end);
+	hash = Private::HashEnd(hash);
+	length = uint32(end - name) + 1;
+}
+
+
 uint32
 BMessage::Private::HashName(const char* name)
 {
-	uint32 hash = 0;
-	for (; *name != '\0'; name++) {
-		hash = (hash << 7) ^ (hash >> 24);
-		// Bytes from 0x80 up enter as negative numbers, whatever char is here.
-		hash ^= uint32(int32(int8(*name)));
-	}
-	return hash ^ (hash << 12);
+	return FieldName(name).hash;
 }
 
 
@@ -145,26 +182,29 @@ BMessage::IndexOf(const char* name) const
 		return -1;
 
 	// A loop over the fields asks for each by the very name that GetInfo() handed out.
-	const Field* fields = fBody->Fields();
 	const uint32 cursorField = uint32(fBody->NameCursor());
-	const bool isCursor =
-		cursorField < fBody->fieldCount && name == fBody->NameOf(fields[cursorField]);
-	const uint32 hash = isCursor ? fields[cursorField].hash : Private::HashName(name);
-	const size_t nameLength = isCursor ? fields[cursorField].nameLength : strlen(name) + 1;
-	if (fBody->names != nullptr)
-		return *fBody->NameSlot(name, uint32(nameLength), hash);
-
-	int32 index = fBody->buckets[hash % kBucketCount];
-	while (index >= 0) {
-		const Field& field = fields[index];
-		if (field.hash == hash && field.nameLength == nameLength
-			&& (fBody->NameOf(field) == name
-				|| memcmp(fBody->NameOf(field), name, nameLength) == 0)) {
-			return index;
-		}
-		index = field.next;
+	if (cursorField < fBody->fieldCount) {
+		const Field& field = fBody->Fields()[cursorField];
+		if (name == fBody->NameOf(field))
+			return IndexOf(FieldName(name, field));
 	}
-	return -1;
+	return IndexOf(FieldName(name));
+}
+
+
+int32
+BMessage::IndexOf(const FieldName& name) const
+{
+	if (fBody == nullptr)
+		return -1;
+	if (fBody->names != nullptr)
+		return *fBody->NameSlot(name);
+
+	const Field* fields = fBody->Fields();
+	int32 index = fBody->buckets[name.hash % kBucketCount];
+	while (index >= 0 && !fBody->HasName(fields[index], name))
+		index = fields[index].next;
+	return index;
 }
 
 
@@ -224,9 +264,8 @@ BMessage::Owns(const void* bytes) const
 	if (fBody == nullptr)
 		return false;
 	const uintptr_t address = reinterpret_cast<uintptr_t>(bytes);
-	const uintptr_t start = reinterpret_cast<uintptr_t>(fBody);
-	return address >= start
-		&& address < reinterpret_cast<uintptr_t>(fBody->Data()) + fBody->dataCapacity;
+	const uintptr_t start = reinterpret_cast<uintptr_t>(fBody->Data());
+	return address >= start && address < start + fBody->dataCapacity;
 }
 
 
@@ -239,17 +278,17 @@ BMessage::Reserve(uint32 moreFields, uint32 moreData)
 	const uint64 data = uint64(fBody == nullptr ? 0 : fBody->dataSize) + moreData;
 	if (data > kMaxDataSize || fields > kMaxDataSize)
 		return B_NO_MEMORY;
-	if (fBody != nullptr && fields <= oldFields && data <= oldData)
+	const bool isOwn = fBody == nullptr || fBody->bytes == nullptr;
+	if (fBody != nullptr && isOwn && fields <= oldFields && data <= oldData)
 		return B_OK;
 
-	// Growing by half each time keeps adding at the end cheap, in time and in memory. What is nearly
-	// full grows along, and is not copied again soon.
+	// What is nearly full grows along, and is not copied again soon.
 	uint32 newFields = oldFields;
 	if (fields > oldFields - oldFields / 4)
-		newFields = uint32(std::max<uint64>({fields, 8, uint64(oldFields) + oldFields / 2}));
+		newFields = GrownCapacity(oldFields, uint32(fields), kSmallFieldCount);
 	uint32 newData = oldData;
 	if (data > oldData - oldData / 4)
-		newData = uint32(std::max<uint64>({data, 128, uint64(oldData) + oldData / 2}));
+		newData = GrownCapacity(oldData, uint32(data), kSmallDataSize);
 
 	Body* body = Body::Create(newFields, newData);
 	if (body == nullptr)
@@ -265,27 +304,25 @@ BMessage::Reserve(uint32 moreFields, uint32 moreData)
 		body->namesSize = fBody->namesSize;
 		memcpy(body->Fields(), fBody->Fields(), fBody->fieldCount * sizeof(Field));
 		memcpy(body->Data(), fBody->Data(), fBody->dataSize);
-		free(fBody);
+		fBody->names = nullptr;
+		Body::Destroy(fBody);
 	}
 	fBody = body;
 	return B_OK;
 }
 
 
-/// Makes oldSize bytes at offset, which belong to the field, newSize bytes; the rest moves.
+/// Makes oldSize bytes at offset, which belong to the field, newSize bytes, which the caller may then set; the rest moves.
+/// Afterwards, data and fields may lie elsewhere.
 ///
 /// The names and items behind move along, and their fields know it. Sizes inside the field are the
 /// caller's to set.
 status_t
 BMessage::ResizeBytes(int32 fieldIndex, uint32 offset, uint32 oldSize, uint32 newSize)
 {
-	if (newSize == oldSize)
-		return B_OK;
-	if (newSize > oldSize) {
-		const status_t status = Reserve(0, newSize - oldSize);
-		if (status != B_OK)
-			return status;
-	}
+	const status_t status = Reserve(0, newSize > oldSize ? newSize - oldSize : 0);
+	if (status != B_OK || newSize == oldSize)
+		return status;
 
 	uint8* bytes = fBody->Data() + offset;
 	memmove(bytes + newSize, bytes + oldSize, fBody->dataSize - offset - oldSize);
@@ -302,33 +339,34 @@ BMessage::ResizeBytes(int32 fieldIndex, uint32 offset, uint32 oldSize, uint32 ne
 /// Adds a field that does not exist yet, with its first item.
 status_t
 BMessage::AddField(
-	const char* name, type_code type, bool isFixedSize, const void* data, uint32 size)
+	const FieldName& name, type_code type, bool isFixedSize, const void* data, uint32 size)
 {
-	const size_t nameLength = strlen(name) + 1;
-	if (nameLength > B_FIELD_NAME_LENGTH + 1)
+	if (name.length > B_FIELD_NAME_LENGTH + 1)
 		return B_BAD_VALUE;
 
 	const uint32 sizeWord = isFixedSize ? 0 : sizeof(uint32);
-	if (size > kMaxDataSize - sizeWord - nameLength)
+	if (size > kMaxDataSize - sizeWord - name.length)
 		return B_NO_MEMORY;
-	const status_t status = Reserve(1, uint32(nameLength) + sizeWord + size);
+	const status_t status = Reserve(1, name.length + sizeWord + size);
 	if (status != B_OK)
 		return status;
 
 	const int32 index = int32(fBody->fieldCount);
 	Field& field = fBody->Fields()[index];
 	field.flags = isFixedSize ? Field::kValid | Field::kFixedSize : Field::kValid;
-	field.nameLength = uint16(nameLength);
+	field.nameLength = uint16(name.length);
 	field.type = type;
 	field.count = 1;
 	field.dataSize = sizeWord + size;
 	field.offset = fBody->dataSize;
-	field.hash = Private::HashName(name);
+	field.hash = name.hash;
 
 	uint8* bytes = fBody->Data() + field.offset;
-	memcpy(bytes, name, nameLength);
-	memcpy(bytes + nameLength, &size, sizeWord);
-	memcpy(bytes + nameLength + sizeWord, data, size);
+	memcpy(bytes, name.text, name.length);
+	bytes += name.length;
+	if (!isFixedSize)
+		memcpy(bytes, &size, sizeof(size));
+	memcpy(bytes + sizeWord, data, size);
 	fBody->dataSize = field.EndOffset();
 	fBody->fieldCount++;
 	Link(index);
@@ -364,17 +402,18 @@ BMessage::AddItem(int32 fieldIndex, const void* data, uint32 size)
 }
 
 
-void
+status_t
 BMessage::RemoveField(int32 index)
 {
+	const uint32 offset = fBody->Fields()[index].offset;
+	const uint32 size = fBody->Fields()[index].EndOffset() - offset;
+	const status_t status = ResizeBytes(index, offset, size, 0);
+	if (status != B_OK)
+		return status;
+
 	fBody->DropNames();
 	Unlink(index);
-
 	Field* fields = fBody->Fields();
-	const uint32 offset = fields[index].offset;
-	const uint32 size = fields[index].EndOffset() - offset;
-	ResizeBytes(index, offset, size, 0);
-
 	fBody->SetNameCursor(0);
 	fBody->fieldCount--;
 	memmove(fields + index, fields + index + 1, (fBody->fieldCount - index) * sizeof(Field));
@@ -387,6 +426,7 @@ BMessage::RemoveField(int32 index)
 		if (fields[i].next > index)
 			fields[i].next--;
 	}
+	return B_OK;
 }
 
 

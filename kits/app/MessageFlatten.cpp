@@ -10,6 +10,7 @@
 #include <Errors.h>
 
 #include "app/MessageBody.h"
+#include "app/MessageBytes.h"
 #include "app/MessagePrivate.h"
 #include "app/MessageStream.h"
 
@@ -41,9 +42,24 @@ HasSoundItems(const uint8* items, uint32 size, uint32 count)
 }
 
 
-/// Checks one field header against the data block. Nothing in it is trusted.
+/// Hashes a name; false when its first zero byte is not its last one.
 bool
-IsSound(const FlatFieldHeader& field, const uint8* data, uint32 dataSize)
+HashTerminated(const uint8* name, uint32 length, uint32* hash)
+{
+	uint32 value = 0;
+	for (const uint8* last = name + length - 1; name != last; name++) {
+		if (*name == '\0')
+			return false;
+		value = BMessage::Private::HashStep(value, *name);
+	}
+	*hash = BMessage::Private::HashEnd(value);
+	return *name == '\0';
+}
+
+
+/// Checks one field header against the data block, and hashes the field's name. Nothing in it is trusted.
+bool
+IsSound(const FlatFieldHeader& field, const uint8* data, uint32 dataSize, uint32* hash)
 {
 	if (uint64(field.offset) + field.nameLength + field.dataSize > dataSize)
 		return false;
@@ -51,7 +67,7 @@ IsSound(const FlatFieldHeader& field, const uint8* data, uint32 dataSize)
 		return false;
 
 	const uint8* name = data + field.offset;
-	if (memchr(name, '\0', field.nameLength) != name + field.nameLength - 1)
+	if (!HashTerminated(name, field.nameLength, hash))
 		return false;
 	if ((field.flags & 0x2) != 0)
 		return field.dataSize > 0 && field.dataSize % field.count == 0;
@@ -148,7 +164,8 @@ BMessage::Flatten(BDataIO* stream, ssize_t* size) const
 /// Reads a message in the Haiku format. Returns its fields (null when it is damaged), sets code and
 /// header of \a message, and the bytes of the message; nothing else is touched.
 BMessage::Body*
-BMessage::Private::ParseHaiku(const uint8* buffer, size_t size, BMessage* message, size_t* used)
+BMessage::Private::ParseHaiku(
+	const uint8* buffer, size_t size, BMessage* message, size_t* used, MessageBytes* shared)
 {
 	FlatMessageHeader header;
 	if (size < sizeof(header))
@@ -166,7 +183,9 @@ BMessage::Private::ParseHaiku(const uint8* buffer, size_t size, BMessage* messag
 			return nullptr;
 	}
 
-	Body* body = Body::Create(header.fieldCount, header.dataSize);
+	if (shared != nullptr && (total < kSharedSize || total < shared->Size() / 2))
+		shared = nullptr;
+	Body* body = Body::Create(header.fieldCount, shared != nullptr ? 0 : header.dataSize);
 	if (body == nullptr)
 		return nullptr;
 	memcpy(body->buckets, header.buckets, sizeof(body->buckets));
@@ -179,13 +198,14 @@ BMessage::Private::ParseHaiku(const uint8* buffer, size_t size, BMessage* messag
 	for (uint32 i = 0; i < header.fieldCount; i++) {
 		const FlatFieldHeader flat =
 			ReadNumber<FlatFieldHeader>(flatFields + i * sizeof(FlatFieldHeader));
-		if (!IsSound(flat, data, header.dataSize) || !IsLink(flat.next, header.fieldCount)) {
+		uint32 hash;
+		if (!IsSound(flat, data, header.dataSize, &hash) || !IsLink(flat.next, header.fieldCount)) {
 			free(body);
 			return nullptr;
 		}
 		isDense = isDense && flat.offset == offset;
 		body->Fields()[i] = {flat.flags, flat.nameLength, flat.type, flat.count, flat.dataSize,
-			uint32(offset), flat.next, HashName(reinterpret_cast<const char*>(data) + flat.offset)};
+			uint32(offset), flat.next, hash};
 		offset += flat.nameLength + flat.dataSize;
 		// Fields that lie over each other could make more of the bytes than there are.
 		if (offset > header.dataSize) {
@@ -195,8 +215,13 @@ BMessage::Private::ParseHaiku(const uint8* buffer, size_t size, BMessage* messag
 	}
 	body->dataSize = uint32(offset);
 
-	if (isDense) {
+	if (isDense && shared != nullptr) {
+		body->ShareData(shared, const_cast<uint8*>(data), body->dataSize);
+	} else if (isDense) {
 		memcpy(body->Data(), data, body->dataSize);
+	} else if (shared != nullptr) {
+		free(body);
+		return ParseHaiku(buffer, size, message, used, nullptr);
 	} else {
 		// Gaps or another order: sound, but everything else here relies on the writer's layout.
 		for (uint32 i = 0; i < header.fieldCount; i++) {
@@ -212,7 +237,7 @@ BMessage::Private::ParseHaiku(const uint8* buffer, size_t size, BMessage* messag
 		for (; link >= 0 && length <= header.fieldCount; length++)
 			link = body->Fields()[link].next;
 		if (length > header.fieldCount) {
-			free(body);
+			Body::Destroy(body);
 			return nullptr;
 		}
 	}
@@ -232,7 +257,7 @@ BMessage::Private::ParseHaiku(const uint8* buffer, size_t size, BMessage* messag
 
 
 status_t
-BMessage::Private::Unflatten(const void* buffer, size_t size, size_t* used)
+BMessage::Private::Unflatten(const void* buffer, size_t size, size_t* used, MessageBytes* shared)
 {
 	if (size < sizeof(uint32))
 		return B_NOT_A_MESSAGE;
@@ -246,7 +271,7 @@ BMessage::Private::Unflatten(const void* buffer, size_t size, size_t* used)
 	size_t length = 0;
 	Body* body;
 	if (format == kHaikuFormat)
-		body = ParseHaiku(bytes, size, &result, &length);
+		body = ParseHaiku(bytes, size, &result, &length, shared);
 	else if (format == kR5Format || format == kR5SwappedFormat)
 		body = ParseR5(bytes, size, &result, &length);
 	else
@@ -310,7 +335,11 @@ BMessage::Unflatten(BDataIO* stream)
 		MakeEmpty();
 		return status;
 	}
+	const uint8* bytes = input.Bytes();
+	MessageBytes* shared = input.Size() >= kSharedSize ? input.Share() : nullptr;
 	size_t used = 0;
-	status = Private(this).Unflatten(input.Bytes(), input.Size(), &used);
+	status = Private(this).Unflatten(bytes, input.Size(), &used, shared);
+	if (shared != nullptr)
+		shared->Release();
 	return status == B_OK ? input.Finish(used) : status;
 }

@@ -273,7 +273,7 @@ BMessage::FindMessage(const char* name, int32 index, BMessage* value) const
 	const void* data;
 	ssize_t size;
 	status_t status = FindData(name, B_MESSAGE_TYPE, index, &data, &size);
-	if (status == B_OK && Private(value).Unflatten(data, size) != B_OK)
+	if (status == B_OK && Private(value).Unflatten(data, size, nullptr, fBody->bytes) != B_OK)
 		status = B_BAD_DATA;
 	if (status != B_OK)
 		*value = BMessage();

@@ -5,6 +5,8 @@
 
 #include <Message.h>
 
+class MessageBytes;
+
 /// Tokens of handlers: none, and the preferred handler of the looper.
 inline constexpr int32 kNoToken = -1;
 inline constexpr int32 kPreferredToken = -2;
@@ -94,8 +96,10 @@ public:
 	/// Set it after MarkDelivered(); the drop fields are the caller's to add.
 	void MarkDropped();
 
-	/// Unflatten() from \a size bytes at most. \a used: bytes of the message; may be null.
-	status_t Unflatten(const void* buffer, size_t size, size_t* used = nullptr);
+	/// Unflatten() from \a size bytes at most. \a used: bytes of the message; may be null. With \a shared, in which the
+	/// buffer lies, the message may go on using its bytes.
+	status_t Unflatten(
+		const void* buffer, size_t size, size_t* used = nullptr, MessageBytes* shared = nullptr);
 
 	/// The R5 format in little endian, as the platform writes it on request.
 	ssize_t R5FlattenedSize() const;
@@ -105,11 +109,18 @@ public:
 	static bool HasSameData(
 		const BMessage& one, const BMessage& other, bool ignoreFieldOrder, bool deep, int32 depth);
 
-	/// The hash of a field's name as the flattened hash table has it.
+	/// The hash of a field's name as the flattened hash table has it: a step for each of its bytes, from 0 on, and
+	/// the end. Bytes from 0x80 up enter as negative numbers, whatever char is here.
+	static uint32 HashStep(uint32 hash, uint8 byte)
+	{
+		return (hash << 7) ^ (hash >> 24) ^ uint32(int32(int8(byte)));
+	}
+	static uint32 HashEnd(uint32 hash) { return hash ^ (hash << 12); }
 	static uint32 HashName(const char* name);
 
 private:
-	static Body* ParseHaiku(const uint8* buffer, size_t size, BMessage* header, size_t* used);
+	static Body* ParseHaiku(
+		const uint8* buffer, size_t size, BMessage* header, size_t* used, MessageBytes* shared);
 	static Body* ParseR5(const uint8* buffer, size_t size, BMessage* header, size_t* used);
 	uint8 R5Flags() const;
 	uint64 R5DataSize(int32 field) const;

@@ -11,6 +11,7 @@
 #include <Errors.h>
 
 #include "app/MessageBody.h"
+#include "app/MessageBytes.h"
 #include "app/MessageR5.h"
 
 namespace {
@@ -53,7 +54,8 @@ MessageStream::ReadUpTo(size_t size, size_t enough)
 {
 	while (fSize < size) {
 		if (fSize == fCapacity) {
-			const size_t capacity = std::min(size, std::max(fCapacity * 2, kPieceSize));
+			const size_t capacity =
+				HasBytes(size - fSize) ? size : std::min(size, std::max(fCapacity * 2, kPieceSize));
 			uint8* bytes = static_cast<uint8*>(realloc(fBytes.get(), capacity));
 			if (bytes == nullptr)
 				return B_NO_MEMORY;
@@ -71,6 +73,27 @@ MessageStream::ReadUpTo(size_t size, size_t enough)
 		fSize += bytesRead;
 	}
 	return B_OK;
+}
+
+
+/// Whether so many bytes follow for certain.
+bool
+MessageStream::HasBytes(size_t count) const
+{
+	off_t end;
+	return count > kPieceSize && fPositionStream != nullptr
+		&& fPositionStream->GetSize(&end) == B_OK
+		&& end - fPositionStream->Position() >= off_t(count);
+}
+
+
+MessageBytes*
+MessageStream::Share()
+{
+	MessageBytes* shared = MessageBytes::Adopt(fBytes.get(), fSize);
+	if (shared != nullptr)
+		fBytes.release();
+	return shared;
 }
 
 

@@ -9,6 +9,7 @@
 
 class BDataIO;
 class BPositionIO;
+class MessageBytes;
 
 
 /// The bytes of a stream from its position on, as far as they were asked for.
@@ -27,6 +28,9 @@ public:
 	/// Sets the stream's position behind the first \a used bytes.
 	status_t Finish(size_t used);
 
+	/// Gives the bytes to a block, which the caller is to release. Null without memory: they stay here then.
+	MessageBytes* Share();
+
 	const uint8* Bytes() const { return fBytes.get(); }
 	size_t Size() const { return fSize; }
 
@@ -36,6 +40,7 @@ private:
 	};
 
 	status_t ReadUpTo(size_t size, size_t enough);
+	bool HasBytes(size_t count) const;
 
 	BDataIO* fStream;
 	BPositionIO* fPositionStream;

@@ -388,6 +388,7 @@ public:
 
 private:
 	struct Field;
+	struct FieldName;
 	struct Body;
 
 	void InitHeader();
@@ -401,6 +402,7 @@ private:
 
 	int32 CountFields() const;
 	int32 IndexOf(const char* name) const;
+	int32 IndexOf(const FieldName& name) const;
 	status_t FindField(const char* name, type_code type, int32* field) const;
 	status_t FindItem(int32 field, int32 index, const uint8** data, uint32* size) const;
 	status_t FindValue(
@@ -408,9 +410,10 @@ private:
 	bool HasValue(const char* name, type_code type, int32 index, size_t size) const;
 
 	status_t AddField(
-		const char* name, type_code type, bool isFixedSize, const void* data, uint32 size);
+		const FieldName& name, type_code type, bool isFixedSize, const void* data, uint32 size);
 	status_t AddItem(int32 field, const void* data, uint32 size);
-	void RemoveField(int32 field);
+	status_t ReplaceItem(int32 field, int32 index, const void* data, uint32 size);
+	status_t RemoveField(int32 field);
 	void Link(int32 field);
 	void Unlink(int32 field);
 	status_t Reserve(uint32 moreFields, uint32 moreData);
