@@ -344,10 +344,9 @@ TCodeGenerator::WriteFormText(TDesignForm* form, const BString& path, BString& t
 void
 TCodeGenerator::WriteAppText(const BString& path, BString& text)
 {
-	const BString signature = PropertyText(fAppComponent, "Signature");
 	ReplacePlaceholders(text,
-		{{"$APPNAME", fAppComponent->ComponentName()}, {"$APPSIG", signature.String()},
-			{"$TAB", "  "}});
+		{{"$APPNAME", fAppComponent->ComponentName()},
+			{"$APPSIG", PropertyText(fAppComponent, "Signature")}, {"$TAB", "  "}});
 	fWriter.WriteText(path.String(), text);
 }
 

@@ -63,11 +63,10 @@ constexpr setting_field kSettings[] = {
 };
 
 
-BString
+const char*
 ValueOf(const setting_field& setting, const TAppComponent* app)
 {
-	return setting.property != nullptr ? PropertyText(app, setting.property)
-									   : BString(app->ComponentName());
+	return setting.property != nullptr ? PropertyText(app, setting.property) : app->ComponentName();
 }
 
 

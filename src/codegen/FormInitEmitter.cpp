@@ -3,7 +3,7 @@
 
 #include "codegen/FormSourceEmitter.h"
 
-#include <string.h>
+#include <string>
 
 #include "codegen/FormParts.h"
 #include "codegen/HandlerNames.h"
@@ -55,8 +55,8 @@ TFormSourceEmitter::EmitFormConstructor(BString& text)
 void
 TFormSourceEmitter::EmitFormConstructStart(BString& text)
 {
-	BString flags = PropertyText(Form(), "WindowFlags");
-	if (flags.Length() == 0)
+	const char* flags = PropertyText(Form(), "WindowFlags");
+	if (flags[0] == '\0')
 		flags = "0";
 
 	text << "T$FORMNAME::T$FORMNAME(void)\n"
@@ -195,21 +195,17 @@ void
 TFormSourceEmitter::EmitComponentPropSet(TComponent* component, BString& text)
 {
 	text << "$TAB// initialize " << component->ComponentName() << "\n";
+	std::string statements;
+	statements.reserve(1024);
 	for (int32 i = 0; i < component->CountProperties(); i++) {
 		const TProperty* property = component->PropertyAt(i);
 		if (property == nullptr || !property->IsGenerated())
 			continue;
 
-		BString statement = property->SetStatement();
-		// Most statements hold no placeholder.
-		if (strchr(statement.String(), '$') != nullptr) {
-			const BString value(property->Value(), TPropertyText::kSize);
-			ReplacePlaceholders(statement,
-				{{"$COMPONENT", component->ComponentName()}, {"$VALUE", value.String()}});
-		}
-		IndentContinuationLines(statement);
-		text << "$TAB" << statement << "\n";
+		AppendStatement(statements, property->SetStatement(),
+			{{"$COMPONENT", component->ComponentName()}, {"$VALUE", property->Value()}});
 	}
+	text.Append(statements.data(), static_cast<int32>(statements.length()));
 }
 
 
@@ -233,10 +229,9 @@ TFormSourceEmitter::EmitComponentExtendedInit(TComponent* component, BString& te
 	if (!component->OnGenInitForm(init))
 		return;
 
-	ReplacePlaceholder(init, "$COMPONENT", component->ComponentName());
-	IndentContinuationLines(init);
-	text << "$TAB// Extended init for " << component->ComponentName() << "\n"
-		 << "$TAB" << init << "\n";
+	std::string statement;
+	AppendStatement(statement, init, {{"$COMPONENT", component->ComponentName()}});
+	text << "$TAB// Extended init for " << component->ComponentName() << "\n" << statement.c_str();
 }
 
 
@@ -245,7 +240,7 @@ TFormSourceEmitter::EmitFormColor(const char* property, BString& text)
 {
 	BString statement = IndentedSetStatement(Form(), property);
 	ReplacePlaceholder(statement, "$COMPONENT", "FormView()");
-	ReplacePlaceholder(statement, "$VALUE", PropertyText(Form(), property).String());
+	ReplacePlaceholder(statement, "$VALUE", PropertyText(Form(), property));
 	text << "$TAB" << statement << "\n";
 }
 
@@ -258,7 +253,7 @@ TFormSourceEmitter::EmitFormFont(const char* property, BString& text)
 	const char* name = Form()->ComponentName();
 	if (name[0] != '\0')
 		statement.ReplaceAll(name, "FormView()");
-	ReplacePlaceholder(statement, "$VALUE", PropertyText(Form(), property).String());
+	ReplacePlaceholder(statement, "$VALUE", PropertyText(Form(), property));
 	text << "$TAB" << statement << "\n";
 }
 

@@ -36,11 +36,11 @@ ParentExpression(TDesignForm* form, const TComponent* component)
 }
 
 
-BString
+const char*
 PropertyText(const TComponent* component, const char* name)
 {
 	const TProperty* property = component->FindProperty(name);
-	return property != nullptr ? BString(property->Value(), TPropertyText::kSize) : BString();
+	return property != nullptr ? property->Value() : "";
 }
 
 

@@ -19,8 +19,9 @@ bool IsOwnedByForm(TDesignForm* form, const TComponent* component);
 /// The expression for the view that receives \a component: "FormView()", or its container's name.
 const char* ParentExpression(TDesignForm* form, const TComponent* component);
 
-/// The value of the property \a name, at most 1024 bytes; empty when there is no such property.
-BString PropertyText(const TComponent* component, const char* name);
+/// The value of the property \a name, at most 1024 bytes; empty when there is no such property. Valid until the
+/// value changes.
+const char* PropertyText(const TComponent* component, const char* name);
 
 /// The frame of a form or component as source text.
 BString FrameExpression(const TComponent* component);

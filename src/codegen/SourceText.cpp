@@ -95,10 +95,10 @@ BeginsWith(const char* text, std::string_view prefix)
 const placeholder_value*
 FindPlaceholder(const char* text, std::initializer_list<placeholder_value> placeholders)
 {
+	// Placeholders rarely share the letter behind their "$".
+	const char letter = LowerCase(text[1]);
 	for (const placeholder_value& each : placeholders) {
-		// Placeholders rarely share the letter behind their "$".
-		if (LowerCase(text[1]) == LowerCase(each.placeholder[1])
-			&& BeginsWith(text, each.placeholder))
+		if (letter == LowerCase(each.placeholder[1]) && BeginsWith(text, each.placeholder))
 			return &each;
 	}
 	return nullptr;
@@ -118,46 +118,72 @@ BeginsPlaceholder(std::string_view start, std::initializer_list<placeholder_valu
 }
 
 
-/// Replaces all of \a placeholders at once. False, with \a text as it is, when one pass for each could come to
-/// another result: when replacing one makes another.
-bool
-ReplaceInOnePass(BString& text, std::initializer_list<placeholder_value> placeholders)
+/// What becomes of the line breaks in a text that is appended to another.
+enum LineBreaks { kLineBreaksKept, kLineBreaksIndented };
+
+
+void
+AppendPiece(std::string_view piece, LineBreaks lineBreaks, std::string& text)
 {
-	// Most statements hold no placeholder at all: their first character settles that quickly.
-	const char* from = strchr(text.String(), '$');
-	if (from == nullptr)
-		return true;
-
-	for (const placeholder_value& each : placeholders) {
-		if (placeholders.size() > 1 && strchr(each.value, '$') != nullptr)
-			return false;
+	if (lineBreaks == kLineBreaksIndented) {
+		size_t lineBreak;
+		while ((lineBreak = piece.find('\n')) != std::string_view::npos) {
+			text.append(piece.data(), lineBreak + 1).append("  ");
+			piece.remove_prefix(lineBreak + 1);
+		}
 	}
+	text.append(piece);
+}
 
-	const char* copied = text.String();
+
+/// Appends \a source with all of \a placeholders replaced at once. False, with \a text as it was, when one pass for
+/// each could come to another result: when replacing one makes another.
+bool
+AppendInOnePass(const char* source, std::initializer_list<placeholder_value> placeholders,
+	LineBreaks lineBreaks, std::string& text)
+{
+	const size_t oldLength = text.length();
+	const bool isOne = placeholders.size() == 1;
 	const char* loneDollar = nullptr;
-	std::string result;
-	for (; from != nullptr; from = strchr(from, '$')) {
+	for (const char* from = strchr(source, '$'); from != nullptr; from = strchr(from, '$')) {
 		const placeholder_value* found = FindPlaceholder(from, placeholders);
 		if (found == nullptr) {
 			loneDollar = from++;
 			continue;
 		}
-		if (placeholders.size() > 1 && loneDollar != nullptr
-			&& BeginsPlaceholder(std::string_view(loneDollar, from - loneDollar), placeholders))
+		const bool makesAnother = found->value.find('$') != std::string_view::npos
+			|| (loneDollar != nullptr
+				&& BeginsPlaceholder(
+					std::string_view(loneDollar, from - loneDollar), placeholders));
+		if (makesAnother && !isOne) {
+			text.resize(oldLength);
 			return false;
+		}
 
-		if (copied == text.String())
-			result.reserve(text.Length() + text.Length() / 8 + 64);
+		AppendPiece(std::string_view(source, from - source), lineBreaks, text);
+		AppendPiece(found->value, lineBreaks, text);
 		loneDollar = nullptr;
-		result.append(copied, from);
-		result.append(found->value);
-		copied = from + found->placeholder.length();
-		from = copied;
+		source = from + found->placeholder.length();
+		from = source;
 	}
-	if (copied != text.String()) {
-		result.append(copied);
-		text.SetTo(result.data(), static_cast<int32>(result.length()));
-	}
+	AppendPiece(source, lineBreaks, text);
+	return true;
+}
+
+
+/// Replaces all of \a placeholders at once. False, with \a text as it is, when one pass for each could come to
+/// another result.
+bool
+ReplaceInOnePass(BString& text, std::initializer_list<placeholder_value> placeholders)
+{
+	if (strchr(text.String(), '$') == nullptr)
+		return true;
+
+	std::string result;
+	result.reserve(text.Length() + text.Length() / 8 + 64);
+	if (!AppendInOnePass(text.String(), placeholders, kLineBreaksKept, result))
+		return false;
+	text.SetTo(result.data(), static_cast<int32>(result.length()));
 	return true;
 }
 
@@ -229,21 +255,28 @@ ReplacePlaceholders(BString& text, std::initializer_list<placeholder_value> plac
 
 
 void
+AppendStatement(std::string& text, const BString& statement,
+	std::initializer_list<placeholder_value> placeholders)
+{
+	text.append("$TAB");
+	if (!AppendInOnePass(statement.String(), placeholders, kLineBreaksIndented, text)) {
+		BString replaced(statement);
+		ReplacePlaceholders(replaced, placeholders);
+		AppendPiece(replaced.String(), kLineBreaksIndented, text);
+	}
+	text += '\n';
+}
+
+
+void
 IndentContinuationLines(BString& statement)
 {
-	const char* rest = statement.String();
-	const char* lineBreak = strchr(rest, '\n');
-	if (lineBreak == nullptr)
+	if (strchr(statement.String(), '\n') == nullptr)
 		return;
 
-	std::string result;
-	result.reserve(statement.Length() + 16);
-	for (; lineBreak != nullptr; lineBreak = strchr(rest, '\n')) {
-		result.append(rest, lineBreak + 1).append("  ");
-		rest = lineBreak + 1;
-	}
-	result.append(rest);
-	statement.SetTo(result.data(), static_cast<int32>(result.length()));
+	std::string indented;
+	AppendPiece(statement.String(), kLineBreaksIndented, indented);
+	statement.SetTo(indented.data(), static_cast<int32>(indented.length()));
 }
 
 

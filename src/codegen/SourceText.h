@@ -6,6 +6,7 @@
 #include <stddef.h>
 
 #include <initializer_list>
+#include <string>
 #include <string_view>
 
 #include <String.h>
@@ -34,11 +35,16 @@ void ReplacePlaceholder(BString& text, const char* placeholder, const char* valu
 /// A word that begins with its only "$", as a text with its zero byte, and what it becomes.
 struct placeholder_value {
 	std::string_view placeholder;
-	const char* value;
+	std::string_view value;
 };
 
 /// Replaces several placeholders, one after the other: what the first put in is searched for the second.
 void ReplacePlaceholders(BString& text, std::initializer_list<placeholder_value> placeholders);
+
+/// Appends \a statement to \a text, with its placeholders replaced as ReplacePlaceholders() does it and its
+/// second and later lines then indented, as a line of its own that "$TAB" indents.
+void AppendStatement(std::string& text, const BString& statement,
+	std::initializer_list<placeholder_value> placeholders);
 
 /// Indents the second and every later line of a statement by two spaces.
 void IndentContinuationLines(BString& statement);

@@ -5,6 +5,7 @@
 
 #include <cstdio>
 #include <cstring>
+#include <string_view>
 
 #include <String.h>
 
@@ -120,16 +121,13 @@ TProperty::SetStatement() const
 	if (HasText(fSetStatement))
 		return BString(fSetStatement.Text());
 
-	const char* quote = fQuoted ? "\"" : "";
-	const char* const parts[] = {
+	const std::string_view quote = fQuoted ? "\"" : "";
+	const std::string_view parts[] = {
 		NameOf(fComponent), "->Set", Name(), "(", quote, Value(), quote, ");"};
 	char statement[kMaxSetStatement];
 	size_t length = 0;
-	for (const char* part : parts) {
-		const size_t partLength = strnlen(part, kMaxSetStatement - length);
-		memcpy(statement + length, part, partLength);
-		length += partLength;
-	}
+	for (const std::string_view& part : parts)
+		length += part.copy(statement + length, kMaxSetStatement - length);
 	return BString(statement, static_cast<int32>(length));
 }
 
