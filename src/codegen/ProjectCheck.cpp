@@ -39,6 +39,7 @@ const char* const kAppMembers[] = {
 /// Classes that generated code takes from the runtime library.
 const char* const kRuntimeClasses[] = {"TForm", "TFormView"};
 const char* const kRuntimeLibrary = "the runtime library";
+const char* const kGeneratedClass = "the generated class";
 
 
 bool
@@ -117,13 +118,6 @@ IsReturnable(std::string_view type)
 }
 
 
-std::string
-ComponentOwnerText(const TComponent* component)
-{
-	return "the component " + Quoted(component->ComponentName());
-}
-
-
 /// The path of the form's document, or its name when it was never saved.
 std::string
 FormFileText(TDesignForm* form)
@@ -133,6 +127,17 @@ FormFileText(TDesignForm* form)
 }
 
 } // namespace
+
+
+std::string
+TProjectCheck::name_owner::Text() const
+{
+	std::string text;
+	if (event != nullptr)
+		text.append("the event ").append(event).append(" of ");
+	text += kind;
+	return name != nullptr ? text + " " + Quoted(name) : text;
+}
 
 
 TProjectCheck::TProjectCheck(
@@ -148,7 +153,7 @@ const std::vector<project_problem>&
 TProjectCheck::Run()
 {
 	for (const char* name : kRuntimeClasses)
-		fClasses.emplace(name, kRuntimeLibrary);
+		fClasses.emplace(name, name_owner{kRuntimeLibrary, nullptr});
 
 	CheckApp();
 	for (int32 i = 0; i < fApp->CountComponents(); i++) {
@@ -165,7 +170,7 @@ TProjectCheck::CheckApp()
 {
 	fFile = fProjectFile;
 	const std::string name = fApp->ComponentName();
-	const std::string owner = "the application " + Quoted(name);
+	const name_owner owner = {"the application", fApp->ComponentName()};
 	CheckIdentifier(name.c_str(), owner);
 	fFiles.emplace(name, owner);
 	ClaimName(fClasses, "T" + name, owner, "class");
@@ -173,7 +178,7 @@ TProjectCheck::CheckApp()
 	fMembers.clear();
 	fHandlers.clear();
 	for (const char* member : kAppMembers)
-		fMembers.emplace(member, "the generated class");
+		fMembers.emplace(member, name_owner{kGeneratedClass, nullptr});
 	for (int32 i = 0; i < fApp->CountEvents(); i++) {
 		const TEvent* event = fApp->EventAt(i);
 		if (IsSelected(event))
@@ -196,9 +201,10 @@ TProjectCheck::CheckForm(TDesignForm* form)
 	fMembers.reserve(2 * count);
 	fHandlers.reserve(count);
 	for (const char* member : kFormMembers)
-		fMembers.emplace(member, "the generated class");
-	fMembers.emplace(std::string("T") + form->ComponentName(), "the form's class");
-	fMembers.emplace(std::string("T") + form->ComponentName() + "View", "the form's view class");
+		fMembers.emplace(member, name_owner{kGeneratedClass, nullptr});
+	const std::string className = std::string("T") + form->ComponentName();
+	fMembers.emplace(className, name_owner{"the form's class", nullptr});
+	fMembers.emplace(className + "View", name_owner{"the form's view class", nullptr});
 	CheckComponentNames(form);
 	CheckHandlers(form);
 }
@@ -208,7 +214,7 @@ void
 TProjectCheck::CheckFormFile(TDesignForm* form)
 {
 	const std::string name = form->ComponentName();
-	const std::string owner = "the form " + Quoted(name);
+	const name_owner owner = {"the form", form->ComponentName()};
 	CheckIdentifier(name.c_str(), owner);
 
 	char buffer[kGeneratedNameSize];
@@ -226,7 +232,7 @@ void
 TProjectCheck::CheckFormClasses(TDesignForm* form)
 {
 	const std::string name = form->ComponentName();
-	const std::string owner = "the form " + Quoted(name);
+	const name_owner owner = {"the form", form->ComponentName()};
 	ClaimName(fClasses, "T" + name, owner, "class");
 	ClaimName(fClasses, "T" + name + "View", owner, "class");
 }
@@ -245,7 +251,7 @@ TProjectCheck::CheckComponentNames(TDesignForm* form)
 	}
 	for (int32 i = 0; i < count; i++) {
 		const TComponent* component = components->ComponentAt(i);
-		const std::string owner = ComponentOwnerText(component);
+		const name_owner owner = {"the component", component->ComponentName()};
 		CheckIdentifier(component->ComponentName(), owner);
 		ClaimName(fMembers, component->ComponentName(), owner, "member");
 	}
@@ -257,15 +263,16 @@ TProjectCheck::CheckComponentClass(const TComponent* component)
 {
 	const std::string className = component->ClassName();
 	// A member cannot be called like the class of another member.
-	fMembers.emplace(className, "the components' class " + Quoted(className));
+	fMembers.emplace(className, name_owner{"the components' class", component->ClassName()});
 	if (!IsIdentifier(className)) {
-		Report("the class name " + Quoted(className) + " of " + ComponentOwnerText(component)
+		const name_owner owner = {"the component", component->ComponentName()};
+		Report("the class name " + Quoted(className) + " of " + owner.Text()
 			+ " is no C++ identifier; correct its component library");
 	}
 	const auto clash = fClasses.find(className);
-	if (clash != fClasses.end() && clash->second != kRuntimeLibrary) {
+	if (clash != fClasses.end() && clash->second.kind != kRuntimeLibrary) {
 		Report("the components' class " + Quoted(className) + " is also the class of "
-			+ clash->second + "; rename that");
+			+ clash->second.Text() + "; rename that");
 	}
 }
 
@@ -276,8 +283,7 @@ TProjectCheck::CheckHandlers(TDesignForm* form)
 	for (int32 i = 0; i < form->CountEvents(); i++) {
 		const TEvent* event = form->EventAt(i);
 		if (IsSelected(event))
-			CheckHandler(
-				*event, HandlerName(*event).String(), "the form " + Quoted(form->ComponentName()));
+			CheckHandler(*event, HandlerName(*event).String(), {"the form", form->ComponentName()});
 	}
 
 	const TComponentOwner* components = FormComponents(form);
@@ -287,7 +293,7 @@ TProjectCheck::CheckHandlers(TDesignForm* form)
 			const TEvent* event = component->EventAt(j);
 			if (IsSelected(event))
 				CheckHandler(*event, HandlerName(*component, *event).String(),
-					ComponentOwnerText(component));
+					{"the component", component->ComponentName()});
 		}
 	}
 }
@@ -295,10 +301,10 @@ TProjectCheck::CheckHandlers(TDesignForm* form)
 
 void
 TProjectCheck::CheckHandler(
-	const TEvent& event, const std::string& name, const std::string& eventOwner)
+	const TEvent& event, const std::string& name, const name_owner& eventOwner)
 {
-	const std::string owner = "the event " + std::string(event.name) + " of " + eventOwner;
-	const auto handler = [&] { return "the handler " + Quoted(name) + " of " + owner; };
+	const name_owner owner = {eventOwner.kind, eventOwner.name, event.name};
+	const auto handler = [&] { return "the handler " + Quoted(name) + " of " + owner.Text(); };
 	if (!IsIdentifier(name))
 		Report(handler() + " is no C++ identifier; rename the component or switch the event off");
 
@@ -322,28 +328,28 @@ TProjectCheck::CheckHandler(
 	// An existing source is searched without regard to case: one handler would stand for both.
 	const auto claimed = fHandlers.emplace(LowerCase(name), owner);
 	if (!claimed.second && fProblems.size() == before)
-		Report("the handlers of " + claimed.first->second + " and of " + owner
+		Report("the handlers of " + claimed.first->second.Text() + " and of " + owner.Text()
 			+ " differ in the case of letters only; rename a component");
 }
 
 
 void
-TProjectCheck::CheckIdentifier(const char* name, const std::string& owner)
+TProjectCheck::CheckIdentifier(const char* name, const name_owner& owner)
 {
 	if (!IsIdentifier(name))
-		Report("the name of " + owner + " is no C++ identifier; rename it");
+		Report("the name of " + owner.Text() + " is no C++ identifier; rename it");
 }
 
 
 /// Gives \a name to \a owner, unless another one has it already, which is a problem.
 void
 TProjectCheck::ClaimName(
-	name_owners& owners, const std::string& name, const std::string& owner, const char* kind)
+	name_owners& owners, const std::string& name, const name_owner& owner, const char* kind)
 {
 	const auto claimed = owners.emplace(name, owner);
 	if (!claimed.second)
-		Report(claimed.first->second + " and " + owner + " would both have the " + kind + " "
-			+ Quoted(name) + "; rename one of them");
+		Report(claimed.first->second.Text() + " and " + owner.Text() + " would both have the "
+			+ kind + " " + Quoted(name) + "; rename one of them");
 }
 
 

@@ -38,7 +38,15 @@ public:
 	const std::vector<project_problem>& Run();
 
 private:
-	typedef std::unordered_map<std::string, std::string> name_owners;
+	/// What has a name, for a report: "the event OnClick of the component 'Button1'".
+	struct name_owner {
+		std::string Text() const;
+
+		const char* kind;            // "the component"
+		const char* name;            // null when the kind says it all
+		const char* event = nullptr; // null when the name is not that of a handler
+	};
+	typedef std::unordered_map<std::string, name_owner> name_owners;
 
 	void CheckApp();
 	void CheckForm(TDesignForm* form);
@@ -47,10 +55,10 @@ private:
 	void CheckComponentNames(TDesignForm* form);
 	void CheckComponentClass(const TComponent* component);
 	void CheckHandlers(TDesignForm* form);
-	void CheckHandler(const TEvent& event, const std::string& name, const std::string& owner);
-	void CheckIdentifier(const char* name, const std::string& owner);
+	void CheckHandler(const TEvent& event, const std::string& name, const name_owner& eventOwner);
+	void CheckIdentifier(const char* name, const name_owner& owner);
 	void ClaimName(
-		name_owners& owners, const std::string& name, const std::string& owner, const char* kind);
+		name_owners& owners, const std::string& name, const name_owner& owner, const char* kind);
 	void Report(const std::string& text);
 
 	const TAppComponent* fApp;
