@@ -13,18 +13,19 @@ thread_local WindowGuard* sInnermost = nullptr;
 
 WindowGuard::WindowGuard(BLooper* target, bigtime_t patience)
 	: fTarget(target),
-	  fIsLocked(false),
+	  fIsLocked(target != nullptr && target->IsLocked()),
+	  fHasTaken(false),
 	  fGivenUp(nullptr),
 	  fLevels(0),
 	  fOuter(sInnermost)
 {
 	// Loading a form takes a guard for every property, with the form's window locked all the while.
-	if (target != nullptr && !target->IsLocked()) {
+	if (target != nullptr && !fIsLocked) {
 		fGivenUp = HeldLooper();
 		fLevels = GiveUp(fGivenUp);
+		fHasTaken = target->LockWithTimeout(patience) == B_OK;
+		fIsLocked = fHasTaken;
 	}
-	if (target != nullptr)
-		fIsLocked = target->LockWithTimeout(patience) == B_OK;
 	sInnermost = this;
 }
 
@@ -33,7 +34,7 @@ WindowGuard::~WindowGuard()
 {
 	sInnermost = fOuter;
 	// The block may have quit the target, whose lock is gone with it.
-	if (fIsLocked && fTarget->IsLocked())
+	if (fHasTaken && fTarget->IsLocked())
 		fTarget->Unlock();
 	TakeBack(fGivenUp, fLevels);
 }

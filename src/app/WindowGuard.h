@@ -16,8 +16,7 @@ class BLooper;
 /// While a guard lives, and until its constructor returns, other threads may change what the given-up lock
 /// protects: look such things up again. The lock that is given up is that of the guard around this one or,
 /// outside any, of the looper whose thread this is; a lock that a thread took on some other looper by itself
-/// is not known here and must not be held. A looper that the thread has locked already is locked once more,
-/// and nothing is given up.
+/// is not known here and must not be held. With a looper that the thread has locked already a guard does nothing.
 class WindowGuard {
 public:
 	/// Long enough for a window that is busy drawing or loading, short enough for a user who waits; in microseconds.
@@ -43,6 +42,7 @@ private:
 
 	BLooper* fTarget;
 	bool fIsLocked;
+	bool fHasTaken; // the lock is the guard's own, and not that of somebody around it
 	BLooper* fGivenUp;
 	int32 fLevels;
 	WindowGuard* fOuter;

@@ -7,6 +7,7 @@
 #include <gtest/gtest.h>
 
 #include <Application.h>
+#include <Autolock.h>
 #include <Looper.h>
 #include <Message.h>
 #include <Messenger.h>
@@ -190,8 +191,9 @@ TEST_F(WindowGuardTest, KeepsALockThatTheThreadHasAlready)
 	{
 		WindowGuard inner(looper);
 		EXPECT_TRUE(inner.IsLocked());
-		EXPECT_EQ(looper->CountLocks(), 2);
+		EXPECT_EQ(looper->CountLocks(), 1);
 	}
+	EXPECT_TRUE(looper->IsLocked());
 	EXPECT_EQ(looper->CountLocks(), 1);
 }
 
@@ -267,7 +269,7 @@ TEST_F(WindowGuardTest, AReleaseGivesUpTheLockOfTheGuardAroundIt)
 	looper->Run();
 	{
 		WindowGuard guard(looper);
-		WindowGuard again(looper);
+		BAutolock again(looper);
 		{
 			WindowRelease release;
 			EXPECT_FALSE(looper->IsLocked());
