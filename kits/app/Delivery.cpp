@@ -99,7 +99,9 @@ private:
 team_id
 ThisTeam()
 {
-	return getpid();
+	// Every view asks for it when it gets a window.
+	static const team_id sTeam = getpid();
+	return sTeam;
 }
 
 

@@ -414,5 +414,6 @@ TComponent::StoreProperty(const char* name, const char* value)
 			SetModified(true);
 	}
 	property->SetValue(value);
-	fPropertyStore->SetString(name, property->Value());
+	// Not by the store's own setter: that takes precautions for texts of the store.
+	fPropertyStore->BMessage::SetString(name, property->Value());
 }
