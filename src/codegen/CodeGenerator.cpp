@@ -25,15 +25,17 @@
 
 namespace {
 
-/// Tells an emitter about the file that it is going to edit.
-template <typename Emitter>
 void
-StartEmitter(Emitter* emitter, bool exists, const BString& text)
+SetSubject(TAppEmitter* emitter, TAppComponent* app)
 {
-	emitter->SetFileText(BString());
-	emitter->SetFileExists(exists);
-	if (exists)
-		emitter->SetFileText(text);
+	emitter->SetApp(app);
+}
+
+
+void
+SetSubject(TFormEmitter* emitter, TDesignForm* form)
+{
+	emitter->SetForm(form);
 }
 
 } // namespace
@@ -142,16 +144,10 @@ TCodeGenerator::GenerateAppHeader()
 {
 	const BString path = TargetPath(fAppComponent->ComponentName(), ".h");
 	const std::unique_ptr<TAppHeaderEmitter> emitter(AppHeaderEmitter(fAppComponent));
-	if (emitter == nullptr)
-		return true;
-
-	emitter->SetApp(fAppComponent);
-	bool exists;
 	BString text;
-	if (!ReadTarget(path.String(), &exists, text))
+	if (!StartTarget(emitter.get(), fAppComponent, path, text))
 		return true;
 
-	StartEmitter(emitter.get(), exists, text);
 	emitter->EmitHeaderComments(text);
 	emitter->EmitHeaderStart(text);
 	emitter->EmitHeaderIncludes(text);
@@ -170,16 +166,10 @@ TCodeGenerator::GenerateAppSource()
 {
 	const BString path = TargetPath(fAppComponent->ComponentName(), ".cpp");
 	const std::unique_ptr<TAppSourceEmitter> emitter(AppSourceEmitter(fAppComponent));
-	if (emitter == nullptr)
-		return true;
-
-	emitter->SetApp(fAppComponent);
-	bool exists;
 	BString text;
-	if (!ReadTarget(path.String(), &exists, text))
+	if (!StartTarget(emitter.get(), fAppComponent, path, text))
 		return true;
 
-	StartEmitter(emitter.get(), exists, text);
 	emitter->EmitSourceComments(text);
 	emitter->EmitSourceIncludes(text);
 	emitter->EmitSourceGlobals(text);
@@ -208,16 +198,10 @@ TCodeGenerator::GenerateFormHeader(TDesignForm* form)
 	char buffer[kGeneratedNameSize];
 	const BString path = TargetPath(BaseFormFilename(form, buffer), ".h");
 	const std::unique_ptr<TFormHeaderEmitter> emitter(FormHeaderEmitter(form));
-	if (emitter == nullptr)
-		return true;
-
-	emitter->SetForm(form);
-	bool exists;
 	BString text;
-	if (!ReadTarget(path.String(), &exists, text))
+	if (!StartTarget(emitter.get(), form, path, text))
 		return true;
 
-	StartEmitter(emitter.get(), exists, text);
 	emitter->EmitHeaderComments(text);
 	emitter->EmitHeaderStart(text);
 	emitter->EmitViewClassStart(text);
@@ -241,16 +225,10 @@ TCodeGenerator::GenerateFormSource(TDesignForm* form)
 	const BString path = TargetPath(baseName, ".cpp");
 	const BString initPath = TargetPath(baseName, ".fcp");
 	const std::unique_ptr<TFormSourceEmitter> emitter(FormSourceEmitter(form));
-	if (emitter == nullptr)
-		return true;
-
-	emitter->SetForm(form);
-	bool exists;
 	BString text;
-	if (!ReadTarget(path.String(), &exists, text))
+	if (!StartTarget(emitter.get(), form, path, text))
 		return true;
 
-	StartEmitter(emitter.get(), exists, text);
 	emitter->EmitSourceComments(text);
 	emitter->EmitSourceIncludes(text);
 
@@ -299,6 +277,26 @@ TCodeGenerator::TargetPath(const char* baseName, const char* ending) const
 	BString path(fGenerationPath);
 	path << "/" << baseName << ending;
 	return path;
+}
+
+
+/// Has \a emitter edit the file at \a path, whose old content comes into \a text. False when nothing is to be written:
+/// without an emitter, or when the file cannot be read.
+template <typename Emitter, typename Subject>
+bool
+TCodeGenerator::StartTarget(Emitter* emitter, Subject* subject, const BString& path, BString& text)
+{
+	if (emitter == nullptr)
+		return false;
+
+	SetSubject(emitter, subject);
+	bool exists;
+	if (!ReadTarget(path.String(), &exists, text))
+		return false;
+
+	emitter->SetFileExists(exists);
+	emitter->SetFileText(text);
+	return true;
 }
 
 

@@ -73,6 +73,8 @@ public:
 
 private:
 	BString TargetPath(const char* baseName, const char* ending) const;
+	template <typename Emitter, typename Subject>
+	bool StartTarget(Emitter* emitter, Subject* subject, const BString& path, BString& text);
 	bool ReadTarget(const char* path, bool* exists, BString& text);
 	void WriteFormText(TDesignForm* form, const BString& path, BString& text);
 	void WriteAppText(const BString& path, BString& text);
