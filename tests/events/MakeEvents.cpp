@@ -39,6 +39,8 @@ const std::map<std::string, std::string> kActions = {
 	{"Main.OnZoom", "TForm::Zoom(origin, width, height);"},
 	{"Main.OnOpenViewTransaction", "TForm::OpenViewTransaction();"},
 	{"Main.OnCommitViewTransaction", "TForm::CommitViewTransaction();"},
+	{"Main.PictureView1.OnMouseDown",
+		"BMessage dragged('drag'); PictureView1->DragMessage(&dragged, PictureView1->Frame());"},
 	{"Main.MenuBar1.OnInvoke", "Do(item->Label());"},
 	{"Events.OnReadyToRun", "SetPulseRate(100000);"},
 	{"Note.Close.OnClick", "PostMessage(B_QUIT_REQUESTED);"},
