@@ -499,7 +499,8 @@ QtWindow::HandleMouse(QMouseEvent* event)
 	if (held == 0)
 		hub.PointerAt(where, buttons, fStacked, when);
 	else
-		hub.PointerAt(where, buttons, fDisplay.WindowUnder(event->globalPosition().toPoint()), when);
+		hub.PointerAt(
+			where, buttons, fDisplay.WindowUnder(event->globalPosition().toPoint()), when);
 }
 
 
