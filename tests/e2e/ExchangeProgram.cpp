@@ -8,6 +8,8 @@
 //                                      the same with these numbers of Window.h
 //   limits TITLE LEAST MOST            of width and height
 //   behind TITLE OTHER                 sends a window behind another one
+//   frame TITLE LEFT TOP WIDTH HEIGHT  gives a window another place and size, in four steps
+//   where TITLE                        prints what the window's frame is
 //   put TYPE FILE, put-number NAME N   adds a field to what commit puts on the clipboard
 //   commit                             empties the clipboard and puts that there
 //   get, get TYPE FILE                 prints the names of what is on the clipboard, and sizes; writes one
@@ -219,6 +221,10 @@ private:
 			SetLimits(words);
 		else if (command == "behind")
 			SendBehind(words);
+		else if (command == "frame")
+			SetFrame(words);
+		else if (command == "where")
+			PrintFrame(words);
 		else if (command == "put") {
 			words >> name >> value;
 			std::string bytes = ContentOf(value);
@@ -274,6 +280,33 @@ private:
 		window->SetSizeLimits(least, most, least, most);
 		window->Unlock();
 		Print("limited " + title);
+	}
+
+	void SetFrame(std::istringstream& words)
+	{
+		std::string title;
+		float left, top, width, height;
+		words >> title >> left >> top >> width >> height;
+		BWindow* window = fWindows[title];
+		window->Lock();
+		window->MoveTo(left, window->Frame().top);
+		window->MoveTo(left, top);
+		window->ResizeTo(width - 1, window->Frame().Height());
+		window->ResizeTo(width - 1, height - 1);
+		window->Unlock();
+		Print("placed " + title);
+	}
+
+	void PrintFrame(std::istringstream& words)
+	{
+		std::string title;
+		words >> title;
+		BWindow* window = fWindows[title];
+		window->Lock();
+		const BRect frame = window->Frame();
+		window->Unlock();
+		Print(
+			title + " at " + PointText(frame.LeftTop()) + " to " + PointText(frame.RightBottom()));
 	}
 
 	void SendBehind(std::istringstream& words)

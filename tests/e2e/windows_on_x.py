@@ -116,6 +116,22 @@ class Session:
         self.desktop.wait_until_active(free)
         self.close("Free")
 
+    def early(self):
+        """What a program asks for at once, before the manager knows the window, is what it gets, and what it is told."""
+        with self.desktop.sleeping_manager():
+            self.one.ask(f"special Early 300 300 {TITLED} {NORMAL} 0", "opened Early")
+            self.one.ask("frame Early 520 340 400 300", "placed Early")
+        early = self.desktop.wait_for_window("Early")
+        wait_for("the window is where it was placed", lambda: self.desktop.geometry(early) == (520, 340, 400, 300))
+        # A click comes after all that the host has said about the frame.
+        self.click(540, 360, "Early")
+        self.one.tell("where Early")
+        self.one.expect_exactly("Early at 520,340 to 919,639")
+        told = [line for line in self.one.lines() if line.startswith(("Early moved", "Early resized"))]
+        asked = ["Early moved 520,300", "Early moved 520,340", "Early resized 399,149", "Early resized 399,299"]
+        check(told == asked, f"of frames it was told {told}")
+        self.close("Early")
+
     def behind(self):
         for place, title in enumerate(("Low", "Middle", "High")):
             self.open(title, 500 + 20 * place, 500 + 20 * place)
@@ -131,7 +147,8 @@ class Session:
 
 def use_windows(desktop, program, _):
     session = Session(desktop, program)
-    for part in (session.modal, session.modal_above, session.floating, session.flags, session.behind):
+    for part in (session.modal, session.modal_above, session.floating, session.flags, session.early,
+                 session.behind):
         part()
         print(part.__name__, "done", flush=True)
 

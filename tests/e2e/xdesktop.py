@@ -4,6 +4,7 @@
 Nothing here waits for a time: every wait is for an event, up to a limit.
 """
 
+import contextlib
 import ctypes
 import mmap
 import os
@@ -20,6 +21,8 @@ from picture import Picture
 
 # No wait is meant to come near this, on the slowest of machines.
 LIMIT = 40
+# Between two looks at what is waited for; most things come soon.
+SHORTEST_PAUSE, LONGEST_PAUSE = 0.001, 0.02
 TOOLS = ("Xvfb", "openbox", "xdotool", "xclip")
 PR_SET_PDEATHSIG = 1
 AWAY = (1000, 740)
@@ -49,13 +52,15 @@ def missing_tools(more=()):
 def wait_for(what, answer):
     """Asks until \\a answer gives something true, and returns that."""
     end = time.monotonic() + LIMIT
+    pause = SHORTEST_PAUSE
     while True:
         result = answer()
         if result:
             return result
         if time.monotonic() > end:
             raise Failure(f"this did not come about within {LIMIT} s: {what}")
-        time.sleep(0.02)
+        time.sleep(pause)
+        pause = min(2 * pause, LONGEST_PAUSE)
 
 
 class Desktop:
@@ -69,6 +74,7 @@ class Desktop:
             self.environment.pop(name, None)
         self.children = []
         self.screen = None
+        self.manager = None
 
     def __enter__(self):
         try:
@@ -139,7 +145,7 @@ class Desktop:
     def start_window_manager(self):
         settings = self.folder / "openbox.xml"
         settings.write_text(WINDOW_MANAGER_SETTINGS)
-        manager = self.start(["openbox", "--sm-disable", "--config-file", settings], "openbox")
+        manager = self.manager = self.start(["openbox", "--sm-disable", "--config-file", settings], "openbox")
 
         def manages():
             if manager.poll() is not None:
@@ -149,11 +155,20 @@ class Desktop:
 
         wait_for("a window manager that manages", manages)
 
+    @contextlib.contextmanager
+    def sleeping_manager(self):
+        """The window manager does what it is asked after the block only."""
+        self.manager.send_signal(signal.SIGSTOP)
+        try:
+            yield
+        finally:
+            self.manager.send_signal(signal.SIGCONT)
+
     # Windows and input
 
-    def run(self, command, **options):
+    def run(self, command, environment=None, **options):
         return subprocess.run(
-            command, env=self.environment, timeout=LIMIT, text=True, stdout=subprocess.PIPE, stderr=subprocess.PIPE,
+            command, env=environment or self.environment, timeout=LIMIT, text=True, stdout=subprocess.PIPE, stderr=subprocess.PIPE,
             check=False, **options)
 
     def try_xdotool(self, *words):

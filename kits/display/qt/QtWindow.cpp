@@ -240,6 +240,9 @@ QtWindow::ShowWindow()
 	}
 	if ((fStyle.flags & B_AVOID_FRONT) == 0)
 		raise();
+	// The host answers with the frame that the window is shown with, maybe only after the program has asked for others.
+	if (handle() == nullptr)
+		fRequested.push_back(geometry());
 	setVisible(true);
 	CheckScale();
 }
