@@ -219,17 +219,19 @@ QtDisplay::WindowOf(const StackedWindow* stacked) const
 
 
 void
-QtDisplay::ReportFrame(StackedWindow* window, BRect frame, bool askedFor)
+QtDisplay::ReportFrame(StackedWindow* window, BRect frame, FrameReport report)
 {
 	BRect old = fHub.Frame(window);
 	fHub.SetFrame(window, frame);
-	if (frame.LeftTop() != old.LeftTop()) {
+	const bool always = report == FrameReport::kAlways;
+	const bool askedFor = report == FrameReport::kAskedFor;
+	if (always || frame.LeftTop() != old.LeftTop()) {
 		auto message = std::make_unique<BMessage>(B_WINDOW_MOVED);
 		message->AddPoint("where", frame.LeftTop());
 		message->AddBool(kAskedFor, askedFor);
 		fHub.Deliver(window, std::move(message));
 	}
-	if (frame.Width() != old.Width() || frame.Height() != old.Height()) {
+	if (always || frame.Width() != old.Width() || frame.Height() != old.Height()) {
 		auto message = std::make_unique<BMessage>(B_WINDOW_RESIZED);
 		message->AddInt32("width", frame.IntegerWidth());
 		message->AddInt32("height", frame.IntegerHeight());

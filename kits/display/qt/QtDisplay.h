@@ -26,6 +26,9 @@ namespace BPrivate {
 class QtHostWindow;
 class QtWindow;
 
+/// What is told of a frame: what the program itself asked for, only what differs from the frame that the hub has, or all.
+enum class FrameReport { kAskedFor, kWhenNew, kAlways };
+
 class QtDisplay : public Display {
 public:
 	/// \a managesFocus: the platform has no window manager.
@@ -82,8 +85,8 @@ public:
 	bool Has(const QtHostWindow* window) const;
 	/// Null when it has gone.
 	QtWindow* WindowOf(const StackedWindow* stacked) const;
-	/// Tells the hub and, by messages, the window where it is now. \a askedFor: as its program wanted.
-	void ReportFrame(StackedWindow* window, BRect frame, bool askedFor);
+	/// Tells the hub and, by messages, the window where it is now.
+	void ReportFrame(StackedWindow* window, BRect frame, FrameReport report);
 	/// The program's window at a place of the screen; not known where the host does not tell.
 	std::optional<StackedWindow*> WindowUnder(QPoint globalPosition) const;
 	/// Above which window \a window belongs.

@@ -70,7 +70,7 @@ void
 QtHostWindow::SetFrame(BRect frame)
 {
 	WithWindow([&](QtWindow& window) {
-		fDisplay.ReportFrame(&fStacked, frame, true);
+		fDisplay.ReportFrame(&fStacked, frame, FrameReport::kAskedFor);
 		window.Place(frame);
 	});
 }

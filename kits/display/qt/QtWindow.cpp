@@ -127,7 +127,8 @@ QtWindow::QtWindow(QtDisplay& display, std::shared_ptr<Surface> surface, Stacked
 	  fStacked(stacked),
 	  fIsMinimized(false),
 	  fIsZoomed(false),
-	  fIsAway(false)
+	  fIsAway(false),
+	  fHasToldUnasked(false)
 {
 	setSurfaceType(QSurface::RasterSurface);
 	Apply(stacked->style);
@@ -411,7 +412,8 @@ QtWindow::GeometryChanged()
 	CheckScale();
 	QRect now = geometry();
 	auto asked = std::find(fRequested.begin(), fRequested.end(), now);
-	if (asked != fRequested.end()) {
+	bool isUnasked = asked == fRequested.end();
+	if (!isUnasked) {
 		// Word of an older request: the program has asked for something else since.
 		bool isNewest = asked + 1 == fRequested.end();
 		fRequested.erase(fRequested.begin(), asked + 1);
@@ -419,8 +421,13 @@ QtWindow::GeometryChanged()
 			return;
 	} else
 		fRequested.clear();
-	if (isVisible())
-		fDisplay.ReportFrame(fStacked, RectOf(now), false);
+	if (!isVisible())
+		return;
+	// The window may hear of a frame that nobody asked for after it has asked for this one, so it has to hear of this
+	// one again.
+	fDisplay.ReportFrame(fStacked, RectOf(now),
+		isUnasked || fHasToldUnasked ? FrameReport::kAlways : FrameReport::kWhenNew);
+	fHasToldUnasked = isUnasked;
 }
 
 

@@ -81,6 +81,8 @@ private:
 	bool fIsAway;
 	/// What was asked of the host and not yet seen to happen, oldest first.
 	std::vector<QRect> fRequested;
+	/// The frame reported last was the host's choice.
+	bool fHasToldUnasked;
 };
 
 } // namespace BPrivate
