@@ -8,11 +8,11 @@ All input is the X server's. The gallery's robot only looks: it tells where thin
 the window's foot says came of their use.
 """
 
-import os
 import sys
 import time
 
 from exchange import Program, check, main
+from watched import Watched
 from xdesktop import wait_for
 
 STATUS = "svStatus"
@@ -20,41 +20,12 @@ STATUS = "svStatus"
 SOURCE = (900, 100)
 
 
-class Gallery(Program):
-    """The running gallery with a robot that carries out each line when it is told."""
-
+class Gallery(Watched):
     def __init__(self, desktop, program):
-        self.pipe_path = desktop.folder / "robot"
-        os.mkfifo(self.pipe_path)
-        # Both ends, so that neither waits for the other.
-        self.pipe = os.open(self.pipe_path, os.O_RDWR)
-        super().__init__(desktop, [program], "gallery", environment={"BE_ROBOT_SCRIPT": str(self.pipe_path)})
-        self.desktop = desktop
-        self.tell("limit 20")
-
-    def tell(self, command):
-        os.write(self.pipe, (command + "\n").encode())
-
-    def look_at(self, title):
-        """What is asked from now on is about this window."""
-        self.tell(f'wait-window "{title}"')
-        self.ask("print-windows", f"window: {title}")
-        self.desktop.wait_for_window(title)
-
-    def expect_no_window(self, title):
-        self.tell(f'wait-no-window "{title}"')
-        self.desktop.wait_for_no_window(title)
-
-    def expect_text(self, view, text):
-        self.tell(f'expect-view "{view}" "{text}"')
-        self.ask(f'print-view "{view}"', f"{view}: {text}")
+        super().__init__(desktop, [program], "gallery")
 
     def expect_status(self, text):
         self.expect_text(STATUS, text)
-
-    def frame(self, name, kind="print-frame"):
-        answer = self.ask(f'{kind} "{name}"', f"{name}: ")
-        return [float(word) for word in answer[len(name) + 2:].split()]
 
     def click(self, view, right=None, down=None):
         """In the view's middle, or so far from its left and upper side."""
@@ -72,7 +43,7 @@ class Gallery(Program):
 
     def close(self):
         """By its shortcut, after the robot has left."""
-        os.close(self.pipe)
+        self.stop_watching()
         self.keys("ctrl+q")
         wait_for("the gallery ends", lambda: self.process.poll() is not None)
         check(self.process.returncode == 0, f"the gallery ended with {self.process.returncode}")

@@ -1,0 +1,138 @@
+# SPDX-License-Identifier: MIT
+"""The pointer and the keys of an X server, many a millisecond: all events go through one connection.
+
+The server sends them to the windows in their order, so what follows waits only where another window has to be there first.
+"""
+
+import ctypes
+
+from xdesktop import wait_for
+
+BUTTON, BUTTON_MASK = 1, 0x100
+# XWindowAttributes as ints, with room to spare: five of them, three pointers and a number come before the place of the
+# state of mapping.
+ATTRIBUTES, MAP_STATE, VIEWABLE = ctypes.c_int * 64, 23, 2
+POINTER_ROOT = 1  # in place of a window: none has the focus by itself
+NAMED_KEYS = {"ctrl": "Control_L", "shift": "Shift_L", "alt": "Alt_L"}
+
+
+class Input:
+    """One connection to the server of a desktop."""
+
+    def __init__(self, desktop):
+        self.x = ctypes.CDLL("libX11.so.6")
+        self.test = ctypes.CDLL("libXtst.so.6")
+        self.x.XOpenDisplay.restype = ctypes.c_void_p
+        self.x.XDefaultRootWindow.restype = ctypes.c_ulong
+        self.x.XStringToKeysym.restype = ctypes.c_ulong
+        self.x.XkbKeycodeToKeysym.restype = ctypes.c_ulong
+        # A window may go while it is asked about; that is no reason to end.
+        self.ignore = ctypes.CFUNCTYPE(ctypes.c_int, ctypes.c_void_p, ctypes.c_void_p)(lambda *_: 0)
+        self.x.XSetErrorHandler(self.ignore)
+        self.display = ctypes.c_void_p(self.x.XOpenDisplay(desktop.environment["DISPLAY"].encode()))
+        self.root = ctypes.c_ulong(self.x.XDefaultRootWindow(self.display))
+        self.codes = {}
+
+    def flush(self):
+        self.x.XSync(self.display, 0)
+
+    # The pointer
+
+    def move(self, x, y):
+        self.test.XTestFakeMotionEvent(self.display, -1, int(x), int(y), ctypes.c_ulong(0))
+
+    def press(self, down):
+        self.test.XTestFakeButtonEvent(self.display, BUTTON, int(down), ctypes.c_ulong(0))
+
+    def is_pressed(self):
+        numbers = [ctypes.c_int() for _ in range(4)]
+        windows = [ctypes.c_ulong() for _ in range(2)]
+        mask = ctypes.c_uint()
+        self.x.XQueryPointer(self.display, self.root, *map(ctypes.byref, [*windows, *numbers, mask]))
+        return mask.value & BUTTON_MASK != 0
+
+    def click(self, x, y):
+        """Until the release is on its way to its window: the window manager holds the pointer while it looks at a press,
+        and keys would get past it."""
+        self.move(x, y)
+        self.press(True)
+        self.press(False)
+        wait_for("the button is released", lambda: not self.is_pressed())
+
+    # Keys
+
+    def code(self, symbol):
+        """The key's code, and whether it needs Shift."""
+        if symbol not in self.codes:
+            code = self.x.XKeysymToKeycode(self.display, ctypes.c_ulong(symbol)) & 0xff
+            plain = self.x.XkbKeycodeToKeysym(self.display, ctypes.c_ubyte(code), 0, 0)
+            self.codes[symbol] = code, plain != symbol
+        return self.codes[symbol]
+
+    def key_event(self, code, down):
+        self.test.XTestFakeKeyEvent(self.display, code, int(down), ctypes.c_ulong(0))
+
+    def tap(self, code, held=()):
+        for modifier in held:
+            self.key_event(modifier, True)
+        self.key_event(code, True)
+        self.key_event(code, False)
+        for modifier in reversed(held):
+            self.key_event(modifier, False)
+
+    def named(self, name):
+        return self.x.XStringToKeysym(name.encode())
+
+    def key(self, *keys):
+        """Each by its X name, with "ctrl+", "shift+" or "alt+" before it."""
+        for key in keys:
+            *modifiers, name = key.split("+")
+            held = [self.code(self.named(NAMED_KEYS[modifier]))[0] for modifier in modifiers]
+            self.tap(self.code(self.named(name))[0], held)
+        self.flush()
+
+    def type(self, text):
+        shift = self.code(self.named("Shift_L"))[0]
+        for character in text:
+            code, shifted = self.code(ord(character))
+            self.tap(code, [shift] if shifted else [])
+        self.flush()
+
+    # Windows
+
+    def active_window(self):
+        """The window that has the server's keyboard focus: what is pressed now follows that news to its program."""
+        window, revert = ctypes.c_ulong(), ctypes.c_int()
+        self.x.XGetInputFocus(self.display, ctypes.byref(window), ctypes.byref(revert))
+        return window.value
+
+    def title(self, window):
+        name = ctypes.c_char_p()
+        if window <= POINTER_ROOT or not self.x.XFetchName(self.display, ctypes.c_ulong(window), ctypes.byref(name)):
+            return ""
+        title = (name.value or b"").decode(errors="replace")
+        self.x.XFree(name)
+        return title
+
+    def wait_for_active(self, title):
+        wait_for(f"the window \"{title}\" is active", lambda: self.title(self.active_window()) == title)
+
+    def is_shown(self, title):
+        """Whether a window of this title is on the screen by itself, as menus are, without a frame around it."""
+        root, parent, count = ctypes.c_ulong(), ctypes.c_ulong(), ctypes.c_uint()
+        windows = ctypes.POINTER(ctypes.c_ulong)()
+        if not self.x.XQueryTree(
+                self.display, self.root, ctypes.byref(root), ctypes.byref(parent), ctypes.byref(windows),
+                ctypes.byref(count)):
+            return False
+        titled = [window for window in windows[:count.value] if self.title(window) == title]
+        self.x.XFree(windows)
+        return any(self.is_viewable(window) for window in titled)
+
+    def is_viewable(self, window):
+        attributes = ATTRIBUTES()
+        found = self.x.XGetWindowAttributes(self.display, ctypes.c_ulong(window), ctypes.byref(attributes))
+        return found and attributes[MAP_STATE] == VIEWABLE
+
+    def wait_until_shown(self, title):
+        wait_for(f"a window \"{title}\" is shown", lambda: self.is_shown(title))
