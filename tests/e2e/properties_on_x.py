@@ -120,7 +120,7 @@ class Designer(Watched):
         """Where the item of the open menu is."""
         place = self.middle(item, "print-item-frame")
         self.input.wait_until_shown(MENU)
-        # The robot answers when the menu has handled what it was sent: its first item may still have to be selected.
+        # The robot answers when the menu has handled what it was sent: an item may still have to be selected.
         self.ask("print-windows", "window: Properties")
         return place
 
@@ -295,9 +295,9 @@ class Keys:
     def pick(self, row, one, choice):
         self.select(row)
         self.input.key("space")
-        # Opened by a key, the menu begins at its first item.
         self.designer.wait_for_menu(one.choices[choice])
-        self.input.key(*["Down"] * choice, "Return")
+        # It begins at the present choice.
+        self.input.key("Home", *["Down"] * choice, "Return")
         self.designer.wait_until_menu_closed()
         self.input.key("shift+Tab")
 

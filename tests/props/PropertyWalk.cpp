@@ -363,8 +363,9 @@ PropertyWalk::EditByKeys(TComponent* component, const std::string& name, int rou
 		{
 			size_t index;
 			expected = NextChoice(component, name, &index);
-			// Opened by a key, the menu begins at its first item.
+			// The menu begins at the present choice.
 			robot.Key("space");
+			robot.Key("home");
 			for (size_t i = 0; i < index; i++)
 				robot.Key("down");
 			robot.Key("enter");
