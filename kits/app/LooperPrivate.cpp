@@ -47,6 +47,13 @@ LooperAccess::LoopersOfKind(looper_kind kind, bigtime_t timeout)
 }
 
 
+status_t
+LooperAccess::LockIfThere(const BLooper* looper, bigtime_t timeout)
+{
+	return BLooper::LockPortOf(looper, timeout);
+}
+
+
 void
 LooperAccess::BeginUserWait(BLooper* looper)
 {

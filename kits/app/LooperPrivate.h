@@ -48,6 +48,8 @@ struct LooperAccess {
 	static int32 Token(const BHandler* handler);
 	/// The handler with \a token if it belongs to \a looper now, else NULL. \a looper locked.
 	static BHandler* HandlerFor(const BLooper* looper, int32 token);
+	/// As BLooper::LockWithTimeout(), for a looper that may be gone: B_BAD_VALUE then. Touches the looper's port only.
+	static status_t LockIfThere(const BLooper* looper, bigtime_t timeout);
 	/// Whether Run() or Loop() was called.
 	static bool IsRunning(const BLooper* looper);
 

@@ -226,8 +226,12 @@ bool
 Robot::SettleWindow(BWindow* window, bigtime_t limit)
 {
 	const bigtime_t end = system_time() + limit;
-	while (window->LockWithTimeout(std::min(limit, kWaitStep)) != B_OK) {
-		if (LooperAccess::IsInUserWait(window))
+	while (true) {
+		const status_t status = LooperAccess::LockIfThere(window, std::min(limit, kWaitStep));
+		if (status == B_OK)
+			break;
+		// A window that has gone meanwhile has nothing left to do.
+		if (status == B_BAD_VALUE || LooperAccess::IsInUserWait(window))
 			return true;
 		if (system_time() >= end)
 			return false;
