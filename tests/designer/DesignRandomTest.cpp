@@ -10,9 +10,17 @@
 #include <random>
 #include <set>
 
+#include "app/MainWindow.h"
 #include "app/WindowGuard.h"
+#include "codegen/CodeGenerator.h"
+#include "codegen/HandlerNames.h"
+#include "model/AppComponent.h"
+#include "model/DesignMessages.h"
 #include "model/Property.h"
 #include "model/PropertyStore.h"
+#include "project/Project.h"
+#include "project/ProjectOperation.h"
+#include "props/StringList.h"
 #include "support/Printers.h"
 
 namespace {
@@ -23,7 +31,12 @@ constexpr const char* kEdges[] = {"Left", "Top", "Right", "Bottom"};
 
 /// The usual test run has time for few; PLIM_RANDOM_ACTIONS says how many, PLIM_RANDOM_SEED which.
 constexpr int kUsualActions = 40;
-constexpr int kActionsBetweenSaves = 20;
+
+/// What users may type as a label, a name excepted.
+constexpr const char* kTexts[] = {"", "Label", "a \"quoted\" \\ text", "%s %d $VALUE", "\xc3\x84\xe2\x82\xac", "0"};
+
+/// The command that no menu has.
+constexpr uint32 kDuplicate = 7;
 
 
 int
@@ -121,43 +134,136 @@ protected:
 			}
 			return "drag to the other form";
 		}
-		if (kind < 88) {
+		if (kind < 87) {
 			const char* commands[] = {"Copy", "Cut", "Delete"};
 			const char* command = commands[Number(3)];
 			if (SomeComponent(false, &where) && !ChooseFromMenu(where, command))
 				return std::string("no menu for ") + command;
 			return command;
 		}
-		if (kind < 95) {
+		if (kind < 91) {
 			fRobot.MoveTo(BPoint(Number(300), Number(300)));
-			std::set<TComponent*> before = Components();
-			fRobot.Key("command+v");
-			fRobot.Settle();
-			for (TComponent* component : Components()) {
-				if (before.count(component) == 0)
-					fPasted.insert(component);
-			}
+			NotePasted([this] { fRobot.Key("command+v"); });
 			return "paste";
 		}
-		if (kind < 98) {
+		if (kind < 92) {
 			if (SomeComponent(false, &where)) {
 				fRobot.Click(where);
-				const char* edge = kEdges[Number(4)];
-				TComponent* shown = Shown();
-				Locked([&] {
-					if (Form()->View()->Lists(shown))
-						shown->FindProperty(edge)->Editor()->SetValue(
-							std::to_string(Number(250) + 20).c_str(), true);
+				NotePasted([this] {
+					Locked([this] {
+						BMessage duplicate(kDuplicate);
+						Form()->HandleComponentContextMessage(&duplicate);
+					});
 				});
-				fEdited.insert(shown);
 			}
-			return "edit";
+			return "duplicate";
+		}
+		if (kind < 96) {
+			if (!SomeComponent(false, &where))
+				return "edit";
+			fRobot.Click(where);
+			return Edit(Shown());
+		}
+		if (kind < 97) {
+			if (SomeComponent(false, &where)) {
+				fRobot.Click(where);
+				SetValue(Shown(), "Name", "Renamed" + std::to_string(++fNames));
+			}
+			return "rename";
+		}
+		if (kind < 98) {
+			fRobot.Key("command+s");
+			fRobot.Settle();
+			EXPECT_FALSE(IsModified() && HasFile());
+			return "save";
+		}
+		if (kind < 99) {
+			Generate();
+			return "generate";
 		}
 		Answer(Number(4) > 0 ? 1 : 0);
 		if (!ChooseFromMenu(BPoint(298, 298), "Delete all components"))
 			fRobot.Key("escape");
 		Answer(0);
 		return "delete all";
+	}
+
+	/// Runs \a paste; what is new on the form then tells the frame that was copied.
+	void NotePasted(const std::function<void()>& paste)
+	{
+		const std::set<TComponent*> before = Components();
+		paste();
+		fRobot.Settle();
+		for (TComponent* component : Components()) {
+			if (before.count(component) == 0)
+				fPasted.insert(component);
+		}
+	}
+
+	/// As the property window does it.
+	void SetValue(TComponent* component, const char* name, const std::string& value)
+	{
+		Locked([&] {
+			if (!Form()->View()->Lists(component))
+				return;
+			component->FindProperty(name)->Editor()->SetValue(value.c_str(), true);
+			fEdited.insert(component);
+		});
+		fRobot.Settle();
+	}
+
+	/// Gives a property of \a component that value which its editor would let the user choose or type.
+	std::string Edit(TComponent* component)
+	{
+		std::string name;
+		std::string value;
+		Locked([&] {
+			if (!Form()->View()->Lists(component))
+				return;
+			TProperty* property = component->PropertyAt(Number(component->CountProperties()));
+			name = property->Name();
+			TStringList choices;
+			if (property->Editor()->Type() == PET_PICKLIST) {
+				property->Editor()->GetValuePickList(&choices);
+				value = choices.StringAt(Number(choices.CountItems()));
+			} else if (property->Editor()->Type() == PET_STRING)
+				value = property->IsQuoted() ? kTexts[Number(std::size(kTexts))]
+											 : std::to_string(Number(250) + 20);
+		});
+		if (!value.empty() && name != "Name")
+			SetValue(component, name.c_str(), value);
+		return "edit " + name + " to " + value;
+	}
+
+	bool HasFile() const
+	{
+		bool hasFile = false;
+		Locked([&] { hasFile = *Form()->Filename() != '\0'; });
+		return hasFile;
+	}
+
+	/// Generates all sources, which have each component of the forms.
+	void Generate()
+	{
+		TProject* project = MainWindow()->ProjectWindow()->Project();
+		const std::string folder = fFolder / "sources";
+		{
+			TProjectOperation operation(project);
+			ASSERT_TRUE(operation.IsBegun());
+			project->App()->SetPropertyValue("GenerationPath", folder.c_str());
+			TCodeGenerator generator;
+			generator.SetAppComponent(project->App());
+			generator.GenerateApp();
+		}
+		for (TDesignForm* form : fForms) {
+			WindowGuard guard(form);
+			char base[256];
+			const std::string source = Content(folder + "/" + BaseFormFilename(form, base) + ".fcp");
+			for (int32 i = 0; i < form->CountComponents(); i++) {
+				const std::string name = form->ComponentAt(i)->ComponentName();
+				EXPECT_NE(source.find("  // create " + name + "\n"), std::string::npos) << name;
+			}
+		}
 	}
 
 	std::set<TComponent*> Components() const
@@ -274,6 +380,9 @@ protected:
 		const std::string second = SaveAgain(first, "second.frm");
 		EXPECT_TRUE(!isTold || Content(first) == Content(second)) << what;
 		EXPECT_TRUE(Content(second) == Content(SaveAgain(second, "third.frm"))) << what;
+		// Saving by command must find a file that is the form's own.
+		WindowGuard guard(form);
+		form->SetFilename((fFolder / (std::string(form->ComponentName()) + ".frm")).c_str());
 	}
 
 	const int fSeed;
@@ -281,6 +390,7 @@ protected:
 	TDesignForm* fForms[2];
 	std::set<TComponent*> fPasted;
 	std::set<TComponent*> fEdited;
+	int fNames = 0;
 };
 
 
@@ -294,9 +404,7 @@ TEST_F(DesignRandomTest, AnythingInAnyOrderKeepsAllInStep)
 		for (TDesignForm* form : fForms)
 			CheckForm(form, what);
 		CheckInspector(what);
-		if (i % kActionsBetweenSaves == kActionsBetweenSaves - 1) {
-			for (TDesignForm* form : fForms)
-				CheckDocument(form, what);
-		}
+		for (TDesignForm* form : fForms)
+			CheckDocument(form, what);
 	}
 }
