@@ -440,9 +440,40 @@ BRegion::Combine(const BRegion& other, Operation operation)
 		}
 	};
 
-	RowIterator first(rectsOf(*this));
-	RowIterator second(rectsOf(other));
+	const std::span<const clipping_rect> own = rectsOf(*this);
+	auto above = [](std::span<const clipping_rect> rects, int32 top) {
+		return static_cast<size_t>(
+			std::partition_point(rects.begin(), rects.end(),
+				[top](const clipping_rect& rect) { return rect.bottom < top; })
+			- rects.begin());
+	};
+	auto upTo = [](std::span<const clipping_rect> rects, int32 bottom) {
+		return static_cast<size_t>(
+			std::partition_point(rects.begin(), rects.end(),
+				[bottom](const clipping_rect& rect) { return rect.top <= bottom; })
+			- rects.begin());
+	};
+
+	// A window's views each ask for their part of it, and each add to what is to be drawn: what is not in the same rows
+	// is left as it is, or out. The nearest row stays in, as it may become one with the new ones.
+	size_t head = above(own, other.fBounds.top);
+	size_t tail = std::max(head, upTo(own, other.fBounds.bottom));
+	if (operation != kIntersection) {
+		for (size_t row = head; head > 0 && own[head - 1].top == own[row - 1].top;)
+			head--;
+		for (size_t row = tail; tail < own.size() && own[tail].top == own[row].top;)
+			tail++;
+	}
+	std::span<const clipping_rect> others = rectsOf(other);
+	if (operation != kUnion) {
+		const size_t from = above(others, fBounds.top);
+		others = others.subspan(from, std::max(from, upTo(others, fBounds.bottom)) - from);
+	}
+	RowIterator first(own.subspan(head, tail - head));
+	RowIterator second(others);
 	std::vector<clipping_rect> result;
+	if (operation != kIntersection)
+		result.assign(own.begin(), own.begin() + static_cast<ptrdiff_t>(head));
 	std::vector<Interval> band, previousBand;
 	size_t previousStart = 0;
 	int64 previousBottom = std::numeric_limits<int64>::min();
@@ -492,6 +523,8 @@ BRegion::Combine(const BRegion& other, Operation operation)
 			second.Next();
 	}
 
+	if (operation != kIntersection)
+		result.insert(result.end(), own.begin() + static_cast<ptrdiff_t>(tail), own.end());
 	fRects.swap(result);
 	UpdateBounds();
 }
