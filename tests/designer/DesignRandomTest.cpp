@@ -33,7 +33,8 @@ constexpr const char* kEdges[] = {"Left", "Top", "Right", "Bottom"};
 constexpr int kUsualActions = 40;
 
 /// What users may type as a label, a name excepted.
-constexpr const char* kTexts[] = {"", "Label", "a \"quoted\" \\ text", "%s %d $VALUE", "\xc3\x84\xe2\x82\xac", "0"};
+constexpr const char* kTexts[] = {
+	"", "Label", "a \"quoted\" \\ text", "%s %d $VALUE", "\xc3\x84\xe2\x82\xac", "0"};
 
 /// The command that no menu has.
 constexpr uint32 kDuplicate = 7;
@@ -258,7 +259,8 @@ protected:
 		for (TDesignForm* form : fForms) {
 			WindowGuard guard(form);
 			char base[256];
-			const std::string source = Content(folder + "/" + BaseFormFilename(form, base) + ".fcp");
+			const std::string source =
+				Content(folder + "/" + BaseFormFilename(form, base) + ".fcp");
 			for (int32 i = 0; i < form->CountComponents(); i++) {
 				const std::string name = form->ComponentAt(i)->ComponentName();
 				EXPECT_NE(source.find("  // create " + name + "\n"), std::string::npos) << name;
