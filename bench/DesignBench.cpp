@@ -1,12 +1,16 @@
 // SPDX-License-Identifier: MIT
-// Working on a large form: placing one more component, selecting, and drawing all of them anew.
+// Working on a large form: placing one more component, selecting, drawing all of them anew, and the outlines of drags.
 
 #include <cstdlib>
+#include <functional>
 #include <iostream>
+#include <vector>
 
 #include <benchmark/benchmark.h>
 
 #include <Application.h>
+#include <Handler.h>
+#include <Messenger.h>
 #include <OS.h>
 
 #include "ButtonForm.h"
@@ -14,30 +18,81 @@
 #include "app/WindowGuard.h"
 #include "designer/DesignForm.h"
 #include "designer/DesignFormView.h"
+#include "display/Display.h"
+#include "display/PixelBuffer.h"
 #include "model/Diagnostics.h"
 #include "palette/PaletteCatalog.h"
 
 namespace {
 
-/// A form that is shown and has that many buttons, locked while it lives.
-class LockedForm {
+/// So large that 1,000 buttons are to be seen.
+constexpr float kWidth = 2215;
+constexpr float kHeight = 1319;
+
+/// Runs tasks in the thread of the window that it is added to.
+class Worker : public BHandler {
 public:
-	explicit LockedForm(int32 count)
-		: fForm(new TDesignForm("Form1", FORM_SHOWN)),
-		  fGuard(fForm)
+	void MessageReceived(BMessage* message) override
 	{
-		PlaceButtons(fForm, count);
-		fForm->ResizeTo(790, 700);
-		fForm->UpdateIfNeeded();
+		void* task;
+		if (message->FindPointer("task", &task) == B_OK)
+			(*static_cast<const std::function<void()>*>(task))();
+		else
+			BHandler::MessageReceived(message);
+	}
+};
+
+
+/// A form that is shown at the screen's corner and has that many buttons.
+class ShownForm {
+public:
+	explicit ShownForm(int32 count)
+		: fForm(new TDesignForm("Form1", FORM_SHOWN))
+	{
+		{
+			WindowGuard guard(fForm);
+			fForm->AddHandler(&fWorker);
+			PlaceButtons(fForm, count);
+			fForm->ResizeTo(kWidth, kHeight);
+			fForm->MoveTo(0, 0);
+			fForm->Activate();
+		}
+		// What shows the window, and what that causes in turn.
+		for (int round = 0; round < 3; round++)
+			Run([] {});
 	}
 
-	~LockedForm() { fForm->Quit(); }
+	~ShownForm()
+	{
+		fForm->Lock();
+		fForm->RemoveHandler(&fWorker);
+		fForm->Quit();
+	}
+
+	/// Runs \a task in the window's thread and waits until what it changed is drawn. Input that came before, and be it a
+	/// whole drag, has been handled then.
+	void Run(const std::function<void()>& task)
+	{
+		const std::function<void()> all = [&] {
+			task();
+			fForm->UpdateIfNeeded();
+		};
+		BMessage message('task');
+		message.AddPointer("task", &all);
+		BMessage reply;
+		BMessenger(&fWorker).SendMessage(&message, &reply);
+	}
 
 	TDesignForm* operator->() const { return fForm; }
 
+	static void Point(BPoint where, uint32 buttons)
+	{
+		BPrivate::Display::Get().InjectPointer(where, buttons);
+	}
+
 private:
 	TDesignForm* fForm;
-	WindowGuard fGuard;
+	Worker fWorker;
 };
 
 
@@ -45,7 +100,8 @@ private:
 void
 PlaceOne(benchmark::State& state)
 {
-	LockedForm form(static_cast<int32>(state.range(0)));
+	ShownForm form(static_cast<int32>(state.range(0)));
+	WindowGuard guard(form.operator->());
 	TPaletteEntry* entry = PaletteCatalog().FindPalEntry("TButton");
 	for (auto _ : state) {
 		PaletteCatalog().SetDropEntry(entry);
@@ -62,35 +118,113 @@ PlaceOne(benchmark::State& state)
 }
 
 
+/// What the screen shows around \a where.
+std::vector<uint32>
+ScreenAround(BPoint where)
+{
+	BPrivate::Picture picture;
+	BPrivate::Display::Get().ReadScreen(
+		BRect(where - BPoint(90, 40), where + BPoint(90, 40)), &picture);
+	return picture.pixels;
+}
+
+
+/// From a pointer's motion until the outline is drawn at its new place.
+///
+/// What the press at \a start takes hold of follows the pointer; with \a places it begins a rubber band.
+void
+MotionToOutline(benchmark::State& state, BPoint start, bool places)
+{
+	ShownForm form(static_cast<int32>(state.range(0)));
+	form.Run([] {});
+	const BPoint far(500, 400);
+	const std::vector<uint32> before = ScreenAround(far);
+	if (places)
+		PaletteCatalog().SetDropEntry(PaletteCatalog().FindPalEntry("TButton"));
+	ShownForm::Point(start, 1);
+	// The window's thread begins the drag, and may then sit in a loop.
+	bool follows = false;
+	for (int32 i = 0; i < 100 && !follows; i++) {
+		snooze(20000);
+		ShownForm::Point(far + BPoint(i % 2, 0), 1);
+		follows = !before.empty() && ScreenAround(far) != before;
+	}
+	if (!follows)
+		state.SkipWithError("no outline follows the pointer");
+
+	int32 step = 0;
+	for (auto _ : state) {
+		step++;
+		const BPoint where = start + BPoint(20 + step * 37 % 600, 20 + step * 23 % 500);
+		ShownForm::Point(where, 1);
+		// The display's thread draws the outline before it takes the next input.
+		ShownForm::Point(where, 1);
+	}
+	PaletteCatalog().SetDropEntry(nullptr);
+	ShownForm::Point(start, 0);
+	form.Run([] {});
+}
+
+
+/// A rubber band, from the press to the drawn component that it places, below the others.
+void
+PlaceByMouse(benchmark::State& state)
+{
+	ShownForm form(static_cast<int32>(state.range(0)));
+	TPaletteEntry* entry = PaletteCatalog().FindPalEntry("TButton");
+	const int32 before = form->CountComponents();
+	BPoint place(2, kHeight - 22);
+	for (auto _ : state) {
+		PaletteCatalog().SetDropEntry(entry);
+		ShownForm::Point(place, 1);
+		ShownForm::Point(place + BPoint(20, 15), 1);
+		ShownForm::Point(place + BPoint(20, 15), 0);
+		form.Run([] {});
+		place.x += 24;
+	}
+	int32 after = 0;
+	form.Run([&] { after = form->CountComponents(); });
+	if (after != before + static_cast<int32>(state.iterations()))
+		state.SkipWithError("not every rubber band placed a component");
+}
+
+
 /// A click on a component when another is selected, up to the drawn window.
 void
 SelectOne(benchmark::State& state)
 {
-	LockedForm form(static_cast<int32>(state.range(0)));
+	ShownForm form(static_cast<int32>(state.range(0)));
 	int32 next = 0;
 	for (auto _ : state) {
-		TComponent* component = form->ComponentAt(next++ % 2);
-		component->DesignerSelect(true);
-		form->ComponentSelected(component);
-		form->UpdateIfNeeded();
+		form.Run([&] {
+			TComponent* component = form->ComponentAt(next++ % 2);
+			component->DesignerSelect(true);
+			form->ComponentSelected(component);
+		});
 	}
 }
 
 
-/// All components selected and drawn, then none selected and drawn.
+/// All components selected and drawn, or none selected and drawn, by turns.
 void
-SelectAllAndNone(benchmark::State& state)
+SelectAllOrNone(benchmark::State& state)
 {
-	LockedForm form(static_cast<int32>(state.range(0)));
-	for (auto _ : state) {
-		for (const bool selected : {true, false}) {
-			for (int32 i = 0; i < form->CountComponents(); i++)
-				form->ComponentAt(i)->DesignerSelect(selected);
-			form->View()->RepaintChildren();
-			form->UpdateIfNeeded();
-		}
-	}
-	state.SetItemsProcessed(state.iterations() * 2 * state.range(0));
+	ShownForm form(static_cast<int32>(state.range(0)));
+	const BPoint corner(8, 8);
+	const std::vector<uint32> before = ScreenAround(corner);
+	bool selected = false;
+	const std::function<void()> selectOrNot = [&] {
+		selected = !selected;
+		for (int32 i = 0; i < form->CountComponents(); i++)
+			form->ComponentAt(i)->DesignerSelect(selected);
+		form->View()->RepaintChildren();
+	};
+	form.Run(selectOrNot);
+	if (before.empty() || ScreenAround(corner) == before)
+		state.SkipWithError("what is selected is not marked");
+	for (auto _ : state)
+		form.Run(selectOrNot);
+	state.SetItemsProcessed(state.iterations() * state.range(0));
 }
 
 BENCHMARK(PlaceOne)
@@ -98,15 +232,42 @@ BENCHMARK(PlaceOne)
 	->Range(10, 1000)
 	->Unit(benchmark::kMicrosecond)
 	->UseRealTime();
+BENCHMARK(PlaceByMouse)
+	->Arg(10)
+	->Arg(1000)
+	->Iterations(30)
+	->Unit(benchmark::kMillisecond)
+	->MeasureProcessCPUTime()
+	->UseRealTime();
+BENCHMARK_CAPTURE(MotionToOutline, rubber_band, BPoint(2, 2), true)
+	->Arg(10)
+	->Arg(1000)
+	->Unit(benchmark::kMillisecond)
+	->MeasureProcessCPUTime()
+	->UseRealTime();
+BENCHMARK_CAPTURE(MotionToOutline, drag, BPoint(40, 20), false)
+	->Arg(10)
+	->Arg(1000)
+	->Unit(benchmark::kMillisecond)
+	->MeasureProcessCPUTime()
+	->UseRealTime();
+BENCHMARK_CAPTURE(MotionToOutline, resize, BPoint(86, 30), false)
+	->Arg(10)
+	->Arg(1000)
+	->Unit(benchmark::kMillisecond)
+	->MeasureProcessCPUTime()
+	->UseRealTime();
 BENCHMARK(SelectOne)
 	->RangeMultiplier(10)
 	->Range(10, 1000)
 	->Unit(benchmark::kMillisecond)
+	->MeasureProcessCPUTime()
 	->UseRealTime();
-BENCHMARK(SelectAllAndNone)
+BENCHMARK(SelectAllOrNone)
 	->RangeMultiplier(10)
 	->Range(10, 1000)
 	->Unit(benchmark::kMillisecond)
+	->MeasureProcessCPUTime()
 	->UseRealTime();
 
 } // namespace
