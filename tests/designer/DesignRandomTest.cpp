@@ -6,6 +6,7 @@
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
+#include <iostream>
 #include <iterator>
 #include <random>
 #include <set>
@@ -15,7 +16,7 @@
 #include "codegen/CodeGenerator.h"
 #include "codegen/HandlerNames.h"
 #include "model/AppComponent.h"
-#include "model/DesignMessages.h"
+#include "model/Diagnostics.h"
 #include "model/Property.h"
 #include "model/PropertyStore.h"
 #include "project/Project.h"
@@ -31,6 +32,7 @@ constexpr const char* kEdges[] = {"Left", "Top", "Right", "Bottom"};
 
 /// The usual test run has time for few; PLIM_RANDOM_ACTIONS says how many, PLIM_RANDOM_SEED which.
 constexpr int kUsualActions = 40;
+constexpr int kActionsBetweenReports = 250;
 
 /// What users may type as a label, a name excepted.
 constexpr const char* kTexts[] = {
@@ -65,6 +67,10 @@ protected:
 		  fForms{Form(), NewForm()}
 	{
 	}
+
+	/// Thousands of forms saved and loaded would tell gigabytes.
+	static void SetUpTestSuite() { ShowDiagnostics(false); }
+	static void TearDownTestSuite() { ShowDiagnostics(true); }
 
 	int Number(int below) { return std::uniform_int_distribution<int>(0, below - 1)(fRandom); }
 
@@ -408,5 +414,7 @@ TEST_F(DesignRandomTest, AnythingInAnyOrderKeepsAllInStep)
 		CheckInspector(what);
 		for (TDesignForm* form : fForms)
 			CheckDocument(form, what);
+		if (i % kActionsBetweenReports == kActionsBetweenReports - 1)
+			std::cerr << i + 1 << " actions" << std::endl;
 	}
 }
