@@ -413,6 +413,8 @@ QtWindow::GeometryChanged()
 	QRect now = geometry();
 	auto asked = std::find(fRequested.begin(), fRequested.end(), now);
 	bool isUnasked = asked == fRequested.end();
+	// In the middle of the answers to what was asked for: an answer is still to come.
+	bool isOutOfTurn = isUnasked && !fRequested.empty();
 	if (!isUnasked) {
 		// Word of an older request: the program has asked for something else since.
 		bool isNewest = asked + 1 == fRequested.end();
@@ -426,8 +428,8 @@ QtWindow::GeometryChanged()
 	// The window may hear of a frame that nobody asked for after it has asked for this one, so it has to hear of this
 	// one again.
 	fDisplay.ReportFrame(fStacked, RectOf(now),
-		isUnasked || fHasToldUnasked ? FrameReport::kAlways : FrameReport::kWhenNew);
-	fHasToldUnasked = isUnasked;
+		isOutOfTurn || fHasToldUnasked ? FrameReport::kAlways : FrameReport::kWhenNew);
+	fHasToldUnasked = isOutOfTurn || (fHasToldUnasked && isUnasked);
 }
 
 

@@ -81,7 +81,7 @@ private:
 	bool fIsAway;
 	/// What was asked of the host and not yet seen to happen, oldest first.
 	std::vector<QRect> fRequested;
-	/// The frame reported last was the host's choice.
+	/// A frame was reported that came out of turn, and no answer to a request since.
 	bool fHasToldUnasked;
 };
 
