@@ -5,7 +5,6 @@
 #include <Box.h>
 
 #include "Choices.h"
-#include "DesignView.h"
 
 namespace {
 

@@ -4,7 +4,6 @@
 
 #include <Button.h>
 
-#include "DesignView.h"
 
 namespace {
 

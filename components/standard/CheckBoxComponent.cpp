@@ -4,7 +4,6 @@
 
 #include <CheckBox.h>
 
-#include "DesignView.h"
 
 namespace {
 

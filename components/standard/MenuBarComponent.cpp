@@ -5,7 +5,6 @@
 #include <Window.h>
 #include <ormi/views/MenuItems.h>
 
-#include "DesignView.h"
 
 namespace {
 

@@ -5,7 +5,6 @@
 #include <ormi/views/MenuItems.h>
 
 #include "Choices.h"
-#include "DesignView.h"
 
 namespace {
 

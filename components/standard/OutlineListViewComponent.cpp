@@ -4,7 +4,6 @@
 
 #include <ormi/views/ItemList.h>
 
-#include "DesignView.h"
 
 namespace {
 

@@ -4,7 +4,6 @@
 
 #include <ormi/views/FileButton.h>
 
-#include "DesignView.h"
 
 namespace {
 

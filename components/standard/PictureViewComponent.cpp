@@ -4,7 +4,6 @@
 
 #include <ormi/views/PicturePane.h>
 
-#include "DesignView.h"
 
 namespace {
 

@@ -4,7 +4,6 @@
 
 #include <View.h>
 
-#include "DesignView.h"
 
 namespace {
 

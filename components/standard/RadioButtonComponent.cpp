@@ -4,7 +4,6 @@
 
 #include <RadioButton.h>
 
-#include "DesignView.h"
 
 namespace {
 

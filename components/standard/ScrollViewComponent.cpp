@@ -7,7 +7,6 @@
 #include <ormi/views/Containers.h>
 
 #include "Choices.h"
-#include "DesignView.h"
 
 namespace {
 

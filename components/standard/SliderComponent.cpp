@@ -4,7 +4,6 @@
 
 #include <ormi/views/Gauges.h>
 
-#include "DesignView.h"
 
 namespace {
 

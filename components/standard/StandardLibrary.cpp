@@ -2,7 +2,6 @@
 // The standard component library: its entries, and the functions that the designer looks up.
 
 #include <ComponentKit.h>
-#include <View.h>
 #include <image.h>
 
 #include "BoxComponent.h"
@@ -27,20 +26,10 @@
 
 namespace {
 
-/// Makes components of the class \a Class, which is constructed from its designer and its frame.
 template <class Class>
-class TStandardEntry : public TPaletteEntry {
+class TStandardEntry : public TClassEntry<Class> {
 public:
-	using TPaletteEntry::TPaletteEntry;
-
-	TComponent* CreateComponent(BView* parent, TFormDesigner* designer, BRect frame) override
-	{
-		if (parent == nullptr)
-			return nullptr;
-		TComponent* component = new Class(designer, frame);
-		parent->AddChild(component->DTView());
-		return component;
-	}
+	using TClassEntry<Class>::TClassEntry;
 
 	const char* Copyright() const override { return "The standard components of Plimworks"; }
 };

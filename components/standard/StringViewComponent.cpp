@@ -5,7 +5,6 @@
 #include <StringView.h>
 
 #include "Choices.h"
-#include "DesignView.h"
 
 namespace {
 

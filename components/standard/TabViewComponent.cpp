@@ -7,7 +7,6 @@
 #include <String.h>
 #include <ormi/views/Containers.h>
 
-#include "DesignView.h"
 
 namespace {
 

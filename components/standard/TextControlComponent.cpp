@@ -4,7 +4,6 @@
 
 #include <TextControl.h>
 
-#include "DesignView.h"
 
 namespace {
 

@@ -5,12 +5,12 @@
 
 #include <utility>
 
-#include <ComponentKit.h>
 #include <Font.h>
 #include <InterfaceDefs.h>
 #include <Message.h>
 #include <View.h>
-#include <ormi/views/FrameKeeper.h>
+
+#include "model/Component.h"
 
 /// Gives \a view the colours and the font that \a component has as properties, and that the program
 /// will have: when it gets into a window, a view takes its parent's.
@@ -19,6 +19,9 @@ void ShowLook(TComponent* component, BView* view);
 /// \a font, but one of the system's three in the size that \a component has as a property: the program
 /// sets the size after the font.
 BFont InDesignedSize(TComponent* component, const BFont* font);
+
+/// Gives \a view \a frame (in its parent's coordinates) back, if it sized itself by its font.
+void RestoreFrame(BView* view, BRect frame);
 
 /// Takes \a view and what is in it out of the keyboard's reach.
 void TakeFromKeyboard(BView* view);
@@ -30,7 +33,7 @@ bool OfferDesignMessage(TComponent* component, BMessage* message);
 
 /// A view of class \a View that looks like itself but does not act like it: what the mouse does to it
 /// goes to its component, and it never takes the keyboard. Its frame is what the user drew: it does not
-/// size itself. The selection is drawn over what is in it.
+/// size itself. The selection is drawn over what is in it. Component libraries make their components' views with it.
 ///
 /// It refers to the component only inside its hooks, so the component may be deleted first.
 template <class View>
@@ -47,8 +50,9 @@ public:
 
 	void AttachedToWindow() override
 	{
-		Ormi::FrameKeeper keeper(this);
+		const BRect frame = this->Frame();
 		View::AttachedToWindow();
+		RestoreFrame(this, frame);
 		ShowLook(fComponent, this);
 	}
 
@@ -60,9 +64,10 @@ public:
 
 	void SetFont(const BFont* font, uint32 mask = B_FONT_ALL) override
 	{
-		Ormi::FrameKeeper keeper(this);
+		const BRect frame = this->Frame();
 		const BFont sized = InDesignedSize(fComponent, font);
 		View::SetFont(&sized, mask);
+		RestoreFrame(this, frame);
 	}
 
 	void DrawAfterChildren(BRect updateRect) override

@@ -1,12 +1,17 @@
 // SPDX-License-Identifier: MIT
 
-#include "DesignView.h"
+#include "model/DesignView.h"
 
 #include <cstdlib>
 #include <cstring>
 
 #include <Message.h>
 #include <Window.h>
+
+#include "model/ColorText.h"
+#include "model/ComponentOwner.h"
+#include "model/DesignMessages.h"
+#include "model/Property.h"
 
 namespace {
 
@@ -60,6 +65,16 @@ InDesignedSize(TComponent* component, const BFont* font)
 	if (isSystems && size != nullptr && atoi(size) > 0)
 		sized.SetSize(atoi(size));
 	return sized;
+}
+
+
+void
+RestoreFrame(BView* view, BRect frame)
+{
+	if (view->Frame() == frame)
+		return;
+	view->MoveTo(frame.LeftTop());
+	view->ResizeTo(frame.Width(), frame.Height());
 }
 
 
