@@ -22,6 +22,7 @@
 #include "palette/ComponentPalette.h"
 #include "palette/ComponentPaletteView.h"
 #include "palette/LibraryLoader.h"
+#include "palette/LibraryTrial.h"
 #include "palette/PaletteCatalog.h"
 #include "project/Project.h"
 #include "project/ProjectOperation.h"
@@ -249,7 +250,8 @@ void
 PlimApp::LoadComponentPalette()
 {
 	ComponentPalette* palette = MainWindow()->Palette();
-	TLibraryLoader loader(&PaletteCatalog(), palette->View());
+	TLibraryTrial trial;
+	TLibraryLoader loader(&PaletteCatalog(), palette->View(), &trial);
 	BPath folder;
 	// Without the folder there are no components; the designer starts all the same.
 	if (FindComponentsFolder(&folder) == B_OK)

@@ -2,41 +2,45 @@
 
 #include "palette/LibraryLoader.h"
 
+#include <string>
+#include <vector>
+
 #include <Application.h>
 #include <Directory.h>
 #include <Entry.h>
 #include <Path.h>
 #include <Roster.h>
-#include <image.h>
+#include <String.h>
 
 #include "model/Diagnostics.h"
+#include "palette/ComponentLibrary.h"
+#include "palette/LibraryTrial.h"
 #include "palette/PaletteCatalog.h"
 #include "palette/PaletteEntry.h"
 
 namespace {
 
-typedef bool (*init_library)(image_id image);
-typedef void (*uninit_library)();
-typedef uint32 (*count_components)();
-typedef TPaletteEntry* (*entry_at)(uint32 index);
-
-/// Looks up the code symbol \a name in \a image; false when it is missing.
-template <typename Function>
-bool
-FindFunction(image_id image, const char* name, Function* function)
+/// The paths of the entries in \a directory, in its order.
+std::vector<std::string>
+PathsIn(BDirectory* directory)
 {
-	void* address = nullptr;
-	if (get_image_symbol(image, name, B_SYMBOL_TYPE_TEXT, &address) != B_OK)
-		return false;
-	*function = reinterpret_cast<Function>(address);
-	return true;
+	std::vector<std::string> paths;
+	BEntry entry;
+	BPath path;
+	while (directory->GetNextEntry(&entry, true) == B_OK) {
+		if (entry.GetPath(&path) == B_OK)
+			paths.push_back(path.Path());
+	}
+	directory->Rewind();
+	return paths;
 }
 
 } // namespace
 
-TLibraryLoader::TLibraryLoader(TPaletteCatalog* catalog, BView* palette)
+TLibraryLoader::TLibraryLoader(TPaletteCatalog* catalog, BView* palette, TLibraryTrial* trial)
 	: fCatalog(catalog),
 	  fPalette(palette),
+	  fTrial(trial),
 	  fEntryCount(0),
 	  fColumnHeight(0)
 {
@@ -49,6 +53,8 @@ TLibraryLoader::LoadFolder(const char* folder)
 	BDirectory directory(folder);
 	if (directory.InitCheck() != B_OK)
 		return directory.InitCheck();
+	if (fTrial != nullptr)
+		fTrial->TryAll(PathsIn(&directory));
 
 	BEntry entry;
 	while (directory.GetNextEntry(&entry, true) == B_OK) {
@@ -66,44 +72,56 @@ TLibraryLoader::LoadFolder(const char* folder)
 void
 TLibraryLoader::LoadLibrary(const char* path)
 {
-	const image_id image = load_add_on(path);
-	if (image < B_OK)
+	std::string reason;
+	if (fTrial != nullptr && !fTrial->IsSafe(path, &reason)) {
+		PrintDiagnostic("Component library %s is left out: %s\n", path, reason.c_str());
+		return;
+	}
+
+	TComponentLibrary library(path);
+	if (library.Load() != B_OK)
 		return;
 	PrintDiagnostic("load_add_on(%s) success\n", path);
 
-	init_library init;
-	uninit_library uninit;
-	count_components count;
-	entry_at entryAt;
-	if (!FindFunction(image, "InitComponentLib", &init)
-		|| !FindFunction(image, "UnInitComponentLib", &uninit)
-		|| !FindFunction(image, "CountComponents", &count)
-		|| !FindFunction(image, "EntryAt", &entryAt)) {
+	if (!library.FindFunctions()) {
 		PrintDiagnostic("get_image_symbol() failed\n");
-		unload_add_on(image);
+		library.Unload();
 		return;
 	}
 
-	if (!init(image)) {
-		PrintDiagnostic("Failed to initialize component library %s\n", path);
-		unload_add_on(image);
+	BString difference;
+	if (!library.IsForThisDesigner(&difference)) {
+		PrintDiagnostic(
+			"Component library %s was built for another designer: %s\n", path, difference.String());
+		library.Unload();
 		return;
 	}
-	PrintDiagnostic(
-		"InitComponentLib() success\n%ld Components in %s\n", static_cast<long>(count()), path);
-	AddEntries(count, entryAt);
+
+	if (!library.Init()) {
+		PrintDiagnostic("Failed to initialize component library %s\n", path);
+		library.Unload();
+		return;
+	}
+	PrintDiagnostic("InitComponentLib() success\n%ld Components in %s\n",
+		static_cast<long>(library.CountComponents()), path);
+	AddEntries(library, path);
 }
 
 
 void
-TLibraryLoader::AddEntries(uint32 (*count)(), TPaletteEntry* (*entryAt)(uint32 index))
+TLibraryLoader::AddEntries(const TComponentLibrary& library, const char* path)
 {
-	for (uint32 i = 0; i < count(); i++) {
-		TPaletteEntry* entry = entryAt(i);
+	for (uint32 i = 0; i < library.CountComponents(); i++) {
+		TPaletteEntry* entry = library.EntryAt(i);
 		if (entry == nullptr) {
 			PrintDiagnostic("Failed to create palette entry %ld\n", static_cast<long>(i));
 			continue;
 		}
+		// Both get a button, but a form knows its components by their class alone.
+		if (fCatalog->FindPalEntry(entry->ClassName()) != nullptr)
+			PrintDiagnostic(
+				"Warning: Another library offers the class '%s' of %s; forms get that one's\n",
+				entry->ClassName(), path);
 
 		BPoint size(0, 0);
 		if (fPalette != nullptr) {

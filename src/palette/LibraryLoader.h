@@ -7,19 +7,23 @@
 
 class BPath;
 class BView;
+class TComponentLibrary;
+class TLibraryTrial;
 class TPaletteCatalog;
-class TPaletteEntry;
 
 /// Loads component libraries and collects their palette entries.
 ///
 /// A library is an add-on image that exports, unmangled,
 /// `bool InitComponentLib(image_id)`, `void UnInitComponentLib()`, `uint32 CountComponents()` and
 /// `TPaletteEntry* EntryAt(uint32 index)`. What cannot be used is reported on standard output and left
-/// out. Loaded libraries stay loaded until the program ends.
+/// out. Loaded libraries stay loaded until the program ends. A library that tells what it was built for (see
+/// LibraryBuild.h) is left out, too, when that is another designer.
 class TLibraryLoader {
 public:
-	/// \a catalog gets the entries. \a palette, if any, gets their buttons, in one column.
-	explicit TLibraryLoader(TPaletteCatalog* catalog, BView* palette = nullptr);
+	/// \a catalog gets the entries. \a palette, if any, gets their buttons, in one column. \a trial, if any, is asked
+	/// which libraries may be loaded. Neither is owned.
+	explicit TLibraryLoader(
+		TPaletteCatalog* catalog, BView* palette = nullptr, TLibraryTrial* trial = nullptr);
 
 	/// Loads each library in \a folder, in the folder's own order; B_ENTRY_NOT_FOUND without a folder.
 	status_t LoadFolder(const char* folder);
@@ -30,10 +34,11 @@ public:
 
 private:
 	void LoadLibrary(const char* path);
-	void AddEntries(uint32 (*count)(), TPaletteEntry* (*entryAt)(uint32 index));
+	void AddEntries(const TComponentLibrary& library, const char* path);
 
 	TPaletteCatalog* fCatalog;
 	BView* fPalette;
+	TLibraryTrial* fTrial;
 	int32 fEntryCount;
 	float fColumnHeight;
 };
