@@ -7,11 +7,11 @@ set(plimworks_cmake_dir ${CMAKE_INSTALL_LIBDIR}/cmake/Plimworks)
 
 # Programs and libraries
 
-foreach(program plimworks plimgen)
+foreach(program plimworks plimgen plimcheck)
   if(TARGET ${program})
     set_target_properties(${program} PROPERTIES
       INSTALL_RPATH "$ORIGIN/../${CMAKE_INSTALL_LIBDIR}")
-    install(TARGETS ${program} RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})
+    install(TARGETS ${program} EXPORT PlimworksTargets RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})
   endif()
 endforeach()
 install(TARGETS be ormi EXPORT OrmiTargets LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR})
@@ -21,7 +21,8 @@ if(TARGET be_display_qt)
   install(TARGETS be_display_qt LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR})
 endif()
 
-# Component libraries
+# The paths to the libraries are the same in the build folder and installed. Paths to be replaced when
+# installing end with an empty entry, in which the loader looks for every library at every start.
 
 get_property(component_dirs DIRECTORY ${PROJECT_SOURCE_DIR}/components PROPERTY SUBDIRECTORIES)
 foreach(dir IN LISTS component_dirs)
@@ -29,19 +30,12 @@ foreach(dir IN LISTS component_dirs)
   foreach(library IN LISTS libraries)
     get_target_property(type ${library} TYPE)
     if(type STREQUAL "MODULE_LIBRARY")
-      set_target_properties(${library} PROPERTIES
-        INSTALL_RPATH "$ORIGIN/../../${CMAKE_INSTALL_LIBDIR}")
       list(APPEND component_libraries ${library})
-      install(TARGETS ${library} LIBRARY DESTINATION ${CMAKE_INSTALL_BINDIR}/Components)
     endif()
   endforeach()
 endforeach()
-
-# The paths to the libraries are the same in the build folder and installed. Paths to be replaced when
-# installing end with an empty entry, in which the loader looks for every library at every start.
-
 if(CMAKE_INSTALL_LIBDIR STREQUAL "lib")
-  foreach(target plimworks plimgen be ormi plim be_display_qt ${component_libraries})
+  foreach(target plimworks plimgen plimcheck be ormi plim be_display_qt ${component_libraries})
     if(TARGET ${target})
       set_target_properties(${target} PROPERTIES BUILD_WITH_INSTALL_RPATH ON)
     endif()
@@ -60,26 +54,43 @@ endif()
 install(DIRECTORY ${PROJECT_SOURCE_DIR}/src/model DESTINATION ${PLIM_INSTALL_INCLUDEDIR}/designer
   FILES_MATCHING PATTERN "*.h")
 install(DIRECTORY ${PROJECT_SOURCE_DIR}/src/props DESTINATION ${PLIM_INSTALL_INCLUDEDIR}/designer
-  FILES_MATCHING PATTERN "*Property.h" PATTERN "PropertyEditor.h" PATTERN "StringList.h")
+  FILES_MATCHING PATTERN "*Property.h" PATTERN "PropertyEditor.h" PATTERN "StringList.h"
+  PATTERN "DialogParts.h" PATTERN "PendingEdit.h" PATTERN "PropertyModalEdit.h" PATTERN "PropertyWatch.h")
 install(FILES ${PROJECT_SOURCE_DIR}/src/app/TypedMessage.h
   DESTINATION ${PLIM_INSTALL_INCLUDEDIR}/designer/app)
-install(FILES ${PROJECT_SOURCE_DIR}/src/palette/PaletteEntry.h
+install(FILES ${PROJECT_SOURCE_DIR}/src/palette/ClassEntry.h
+  ${PROJECT_SOURCE_DIR}/src/palette/LibraryBuild.h ${PROJECT_SOURCE_DIR}/src/palette/PaletteEntry.h
   DESTINATION ${PLIM_INSTALL_INCLUDEDIR}/designer/palette)
 
 # The CMake packages
 
 include(CMakePackageConfigHelpers)
+# Where the package finds what belongs to it, from the folder that it is in; first for the build folder.
+set(PLIMWORKS_ROOT ".")
+set(PLIMWORKS_COMPONENTS bin/Components)
+set(PLIMWORKS_RUNTIME include)
+set(PLIMWORKS_FUNCTIONS ${PROJECT_SOURCE_DIR}/cmake/PlimworksLibrary.cmake)
+configure_file(${PROJECT_SOURCE_DIR}/cmake/PlimworksConfig.cmake.in
+  ${PROJECT_BINARY_DIR}/PlimworksConfig.cmake @ONLY)
+file(RELATIVE_PATH PLIMWORKS_ROOT ${CMAKE_INSTALL_FULL_LIBDIR}/cmake/Plimworks ${CMAKE_INSTALL_PREFIX})
+set(PLIMWORKS_COMPONENTS ${CMAKE_INSTALL_BINDIR}/Components)
+set(PLIMWORKS_RUNTIME ${PLIM_INSTALL_INCLUDEDIR})
+set(PLIMWORKS_FUNCTIONS "\${CMAKE_CURRENT_LIST_DIR}/PlimworksLibrary.cmake")
+configure_file(${PROJECT_SOURCE_DIR}/cmake/PlimworksConfig.cmake.in
+  ${PROJECT_BINARY_DIR}/installed/PlimworksConfig.cmake @ONLY)
+configure_file(${PROJECT_SOURCE_DIR}/cmake/OrmiConfig.cmake.in ${PROJECT_BINARY_DIR}/OrmiConfig.cmake @ONLY)
+install(FILES ${PROJECT_BINARY_DIR}/OrmiConfig.cmake DESTINATION ${ormi_cmake_dir})
+install(FILES ${PROJECT_BINARY_DIR}/installed/PlimworksConfig.cmake
+  ${PROJECT_SOURCE_DIR}/cmake/PlimworksLibrary.cmake ${PROJECT_SOURCE_DIR}/cmake/PlimworksLibrary.cpp
+  DESTINATION ${plimworks_cmake_dir})
 foreach(package Ormi Plimworks)
   string(TOLOWER ${package} lower)
-  configure_file(${PROJECT_SOURCE_DIR}/cmake/${package}Config.cmake.in
-    ${PROJECT_BINARY_DIR}/${package}Config.cmake @ONLY)
   write_basic_package_version_file(${PROJECT_BINARY_DIR}/${package}ConfigVersion.cmake
     COMPATIBILITY SameMinorVersion)
   export(EXPORT ${package}Targets NAMESPACE ${package}::
     FILE ${PROJECT_BINARY_DIR}/${package}Targets.cmake)
   install(EXPORT ${package}Targets NAMESPACE ${package}:: DESTINATION ${${lower}_cmake_dir})
-  install(FILES ${PROJECT_BINARY_DIR}/${package}Config.cmake
-    ${PROJECT_BINARY_DIR}/${package}ConfigVersion.cmake DESTINATION ${${lower}_cmake_dir})
+  install(FILES ${PROJECT_BINARY_DIR}/${package}ConfigVersion.cmake DESTINATION ${${lower}_cmake_dir})
 endforeach()
 
 # ormi.pc
@@ -106,7 +117,7 @@ endfunction()
 
 get_kit_dirs(${PROJECT_SOURCE_DIR}/kits/include kit_dirs)
 write_ormi_pc(${PROJECT_BINARY_DIR}/pkgconfig/ormi.pc ${PROJECT_BINARY_DIR} "\${prefix}/lib"
-  ${PROJECT_SOURCE_DIR}/ormi/include ${kit_dirs})
+  ${PROJECT_SOURCE_DIR}/ormi/include ${PLIM_COMPONENT_RUNTIME_DIRS} ${PLIM_BUILD_RUNTIME_DIR} ${kit_dirs})
 
 # The installed one finds its prefix from where it lies, so that an installation may be moved.
 file(RELATIVE_PATH pc_to_prefix ${CMAKE_INSTALL_FULL_LIBDIR}/pkgconfig ${CMAKE_INSTALL_PREFIX})

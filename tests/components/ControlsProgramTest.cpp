@@ -84,6 +84,10 @@ const placement kForm[] = {
 	{"Pages", "TTabView", BRect(410, 325, 630, 410), "", {{"Tabs", "Alpha|Beta"}}},
 	{"OnAlpha", "TCheckBox", BRect(15, 40, 100, 60), "Pages", {{"Label", "Alpha's"}}},
 	{"OnBeta", "TCheckBox", BRect(110, 40, 200, 60), "Pages", {{"Label", "Beta's"}, {"Page", "1"}}},
+	{"Speed", "TGauge", BRect(440, 415, 530, 505), "",
+		{{"Maximum", "240"}, {"Value", "90"}, {"Unit", "km/h"}, {"Ticks", "8"},
+			{"Zones", "0..120 {60,160,60,255}|120..240 {200,50,50,255}"}}},
+	{"Hour", "TClock", BRect(545, 420, 625, 500), "", {{"Time", "16:45:20"}, {"Running", "false"}}},
 	{"Icon", "TPictureButton", BRect(210, 330, 290, 380), "", {{"OffFile", kPicture}}},
 };
 
@@ -109,7 +113,7 @@ protected:
 		Locked([&] {
 			fApp.AddComponent(fForm);
 			const std::pair<const char*, const char*> kValues[] = {
-				{"Left", "100"}, {"Top", "100"}, {"Right", "739"}, {"Bottom", "519"}};
+				{"Left", "100"}, {"Top", "100"}, {"Right", "739"}, {"Bottom", "609"}};
 			for (const auto& [name, value] : kValues) {
 				fForm->SetPropertyValue(name, value);
 			}
@@ -285,15 +289,17 @@ type "y"
 click 100 350
 click 230 345
 click 490 338
+click 480 450
+click 580 460
 click-view "Beta's"
 quit
 )");
 	EXPECT_EQ(ran.code, 0) << ran.output;
-	for (const char* event :
-		{"PushClick", "TickChange", "SecondChange", "FieldChange", "FieldEnter", "CaptionClick",
-			"FrameClick", "PlainClick", "RowsSelect", "RowsInvoke", "TreeExpand", "TreeSelect",
-			"ChoiceChange", "MenusInvoke", "RangeModify", "RangeChange", "ProgressClick",
-			"TintChange", "NotesChange", "PhotoClick", "IconClick", "PagesChange", "OnBetaChange"})
+	for (const char* event : {"PushClick", "TickChange", "SecondChange", "FieldChange",
+			 "FieldEnter", "CaptionClick", "FrameClick", "PlainClick", "RowsSelect", "RowsInvoke",
+			 "TreeExpand", "TreeSelect", "ChoiceChange", "MenusInvoke", "RangeModify",
+			 "RangeChange", "ProgressClick", "TintChange", "NotesChange", "PhotoClick", "IconClick",
+			 "PagesChange", "OnBetaChange", "SpeedClick", "HourClick"})
 		EXPECT_NE(("\n" + ran.output).find(std::string("\n") + event + "\n"), std::string::npos)
 			<< event << " of\n"
 			<< ran.output;

@@ -1,0 +1,105 @@
+// SPDX-License-Identifier: MIT
+
+#include "ZonesEditor.h"
+
+#include <ScrollView.h>
+#include <StringView.h>
+#include <TextView.h>
+
+#include "ZonesText.h"
+
+namespace {
+
+constexpr float kWidth = 300;
+constexpr float kTextHeight = 110;
+constexpr float kLineHeight = 16;
+
+/// The dialog: zones are lines of a text. It stays open while one of them cannot be read.
+class ZonesWin : public TPropertyModalEdit {
+public:
+	ZonesWin(const char* value, const TPendingEdit& edit)
+		: TPropertyModalEdit(BRect(0, 0, kWidth, 100), "Zones", value, edit),
+		  fLines(nullptr),
+		  fHint(nullptr)
+	{
+	}
+
+	void InitWindow() override
+	{
+		BView* ground = AddDialogGround(this);
+		BRect frame(kDialogSpace, kDialogSpace, kWidth - kDialogSpace, kDialogSpace + kLineHeight);
+		fHint = new BStringView(frame, "lblHint", "A line for each: 0..60 {60,160,60,255}");
+		ground->AddChild(fHint);
+
+		frame.top = frame.bottom + kDialogSpace;
+		frame.bottom = frame.top + kTextHeight;
+		frame.right -= B_V_SCROLL_BAR_WIDTH;
+		fLines = new BTextView(frame, "tvZones", frame.OffsetToCopy(0, 0).InsetByCopy(4, 4),
+			B_FOLLOW_ALL_SIDES, B_WILL_DRAW | B_NAVIGABLE);
+		ground->AddChild(new BScrollView("svZones", fLines, B_FOLLOW_ALL_SIDES, 0, false, true));
+		AddDialogButtons(this, ground, BPoint(kWidth, frame.bottom), PME_OK, PME_CANCEL);
+		// Enter begins the next line.
+		SetDefaultButton(nullptr);
+	}
+
+	void InitControls() override
+	{
+		BString lines(Text());
+		lines.ReplaceAll("|", "\n");
+		fLines->SetText(lines.String());
+		fLines->MakeFocus();
+	}
+
+	void MessageReceived(BMessage* message) override
+	{
+		std::vector<Gauges::zone> zones;
+		if (message->what == PME_OK && !ReadZones(fLines->Text(), '\n', &zones))
+			fHint->SetText("Not like this: 0..60 {60,160,60,255}");
+		else
+			TPropertyModalEdit::MessageReceived(message);
+	}
+
+	void OnApply() override
+	{
+		std::vector<Gauges::zone> zones;
+		ReadZones(fLines->Text(), '\n', &zones);
+		SetText(ZonesText(zones, '|').String());
+	}
+
+private:
+	BTextView* fLines;
+	BStringView* fHint;
+};
+
+} // namespace
+
+TZonesEditor::TZonesEditor(TComponent* component, TProperty* property)
+	: TPropertyEditor(component, property, PET_MODAL)
+{
+}
+
+
+bool
+TZonesEditor::ModalEdit()
+{
+	const TPendingEdit edit(this);
+	BString value;
+	if (!edit.Read(&value))
+		return false;
+	ZonesWin* dialog = new ZonesWin(value.String(), edit);
+	dialog->InitWindow();
+	dialog->InitControls();
+	dialog->Show();
+	return true;
+}
+
+
+const char*
+TZonesEditor::GetDisplayValue() const
+{
+	std::vector<Gauges::zone> zones;
+	ReadZones(GetValue(), '|', &zones);
+	fShown = "";
+	fShown << static_cast<int32>(zones.size()) << (zones.size() == 1 ? " zone" : " zones");
+	return fShown.String();
+}
