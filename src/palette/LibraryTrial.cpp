@@ -130,6 +130,7 @@ RecordInTheCache()
 TLibraryTrial::TLibraryTrial(const char* program, const char* record)
 	: fProgram(access(program, X_OK) == 0 ? program : ""),
 	  fRecord(record),
+	  fPatience(kPatience),
 	  fGood(kRecordCode)
 {
 	ReadRecord();
@@ -160,7 +161,7 @@ TLibraryTrial::TryAll(const std::vector<std::string>& paths)
 			trials.push_back({path, process});
 	}
 
-	const bigtime_t end = system_time() + kPatience;
+	const bigtime_t end = system_time() + fPatience;
 	std::vector<std::string> good;
 	for (const trial& tried : trials) {
 		int status = 0;

@@ -23,6 +23,9 @@ public:
 	/// With the program beside the running one, and the record in the user's cache.
 	TLibraryTrial();
 
+	/// The longest time that libraries have for a trial, in microseconds; 20 seconds to begin with.
+	void SetPatience(bigtime_t patience) { fPatience = patience; }
+
 	/// Tries those of \a paths that are not known to be good, all at a time, and waits for them.
 	void TryAll(const std::vector<std::string>& paths);
 
@@ -35,6 +38,7 @@ private:
 
 	std::string fProgram;
 	std::string fRecord;
+	bigtime_t fPatience;
 	BMessage fGood;                                // for each path the stamp of its file
 	std::map<std::string, std::string> fDangerous; // path and reason
 };

@@ -47,8 +47,12 @@ LoadFailure(status_t status)
 			return "it needs a function or a variable that is nowhere";
 		case B_MISSING_LIBRARY:
 			return "it needs a library that is not there";
+		case B_ENTRY_NOT_FOUND:
+			return "there is no such file";
+		case B_PERMISSION_DENIED:
+			return "it may not be read";
 		default:
-			return strerror(status);
+			return "it could not be loaded";
 	}
 }
 

@@ -15,7 +15,8 @@
 
 namespace {
 
-const std::string kProgram = PLIM_BUILD_DIR "/bin/plimworks";
+const std::string kPrograms = PLIM_BUILD_DIR "/bin/";
+const std::string kProgram = kPrograms + "plimworks";
 const std::string kLibraries = PLIM_BUILD_DIR "/tests/libraries/";
 
 /// Runs the designer with a home, and settings, of its own.
@@ -25,7 +26,8 @@ protected:
 	std::string ProgramWith(const std::vector<std::string>& libraries)
 	{
 		const std::string folder = fFolder.Make("program");
-		std::filesystem::copy_file(kProgram, folder + "/plimworks");
+		for (const char* program : {"plimworks", "plimcheck"})
+			std::filesystem::copy_file(kPrograms + program, folder + "/" + program);
 		for (const std::string& library : libraries) {
 			fFolder.Make("program/Components");
 			std::filesystem::copy(kLibraries + library, folder + "/Components",
@@ -168,11 +170,13 @@ TEST_F(PlimworksTest, APaletteOfTwentyEntriesKeepsItsSizeAndScrolls)
 TEST_F(PlimworksTest, ALibraryThatCannotBeUsedIsLeftOut)
 {
 	const command_result result = RunScript("wait-window Components\nclick-view First\nquit\n", "",
-		ProgramWith({"no_uninit", "refuses_init", "missing_entry"}));
+		ProgramWith({"no_uninit", "refuses_init", "crashes", "missing_entry"}));
 	ExpectCleanEnd(result);
 	EXPECT_TRUE(Contains(result.output, "get_image_symbol() failed\n"));
 	EXPECT_TRUE(Contains(result.output, "Failed to initialize component library "));
 	EXPECT_TRUE(Contains(result.output, "Failed to create palette entry 1\n"));
+	EXPECT_TRUE(Contains(result.output, "test_library_crashes.so is left out: it crashed"))
+		<< result.output;
 	EXPECT_LT(StoredFrame("PaletteFrame").Height(), 100);
 }
 

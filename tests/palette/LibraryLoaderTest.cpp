@@ -5,6 +5,7 @@
 #include <gtest/gtest.h>
 
 #include <filesystem>
+#include <fstream>
 
 #include <Application.h>
 #include <Box.h>
@@ -23,7 +24,8 @@ protected:
 	static void SetUpTestSuite()
 	{
 		setenv("BE_DISPLAY", "none", 1);
-		static BApplication sApplication("application/x-vnd.Plimworks-PaletteTest");
+		if (be_app == nullptr)
+			new BApplication("application/x-vnd.Plimworks-PaletteTest");
 	}
 
 	static std::string Library(const std::string& name)
@@ -92,6 +94,79 @@ TEST_F(LibraryLoaderTest, AMissingEntryIsToldAndTheOthersAreLoaded)
 }
 
 
+TEST_F(LibraryLoaderTest, AnExceptionInALibraryIsAFailureOfTheLibraryAlone)
+{
+	TLibraryLoader loader(&fCatalog);
+	std::string output = Load(loader, Library("throws"));
+	const std::string path = Library("throws") + "/test_library_throws.so";
+	EXPECT_EQ(output,
+		"load_add_on(" + path + ") success\nFailed to initialize component library " + path + "\n");
+	EXPECT_EQ(fCatalog.CountPalEntries(), 0);
+
+	output = Load(loader, Library("entry_throws"));
+	EXPECT_NE(output.find("Failed to create palette entry 1\n"), std::string::npos) << output;
+	EXPECT_EQ(fCatalog.CountPalEntries(), 2);
+}
+
+
+TEST_F(LibraryLoaderTest, AnEntryWithoutANameIsTold)
+{
+	TLibraryLoader loader(&fCatalog);
+	const std::string output = Load(loader, Library("nameless"));
+	EXPECT_NE(output.find("Failed to create palette entry 1\n"), std::string::npos) << output;
+	EXPECT_EQ(fCatalog.CountPalEntries(), 2);
+	EXPECT_NE(fCatalog.FindPalEntry("TThird"), nullptr);
+}
+
+
+TEST_F(LibraryLoaderTest, ALibraryThatPrintsIsLoaded)
+{
+	TLibraryLoader loader(&fCatalog);
+	const std::string output = Load(loader, Library("prints"));
+	EXPECT_NE(output.find("a line of the library's own\n"), std::string::npos) << output;
+	EXPECT_EQ(fCatalog.CountPalEntries(), 3);
+}
+
+
+TEST_F(LibraryLoaderTest, ALibraryOfAnotherDesignerIsToldAndLeftOut)
+{
+	const struct {
+		const char* library;
+		const char* difference;
+	} kCases[] = {
+		{"other_build", "interface 42, libstdc++, and not interface 1, libstdc++"},
+		{"other_classes", "its classes have other sizes"},
+		{"other_record", "the record of its build is another one"},
+	};
+	for (const auto& row : kCases) {
+		TLibraryLoader loader(&fCatalog);
+		const std::string output = Load(loader, Library(row.library));
+		const std::string path = Library(row.library) + "/test_library_" + row.library + ".so";
+		EXPECT_EQ(output,
+			"load_add_on(" + path + ") success\nComponent library " + path
+				+ " was built for another designer: " + row.difference + "\n");
+		EXPECT_EQ(fCatalog.CountPalEntries(), 0) << row.library;
+	}
+}
+
+
+TEST_F(LibraryLoaderTest, OfTwoLibrariesWithTheSameClassesTheFirstIsUsedAndTheOtherTold)
+{
+	TLibraryLoader loader(&fCatalog);
+	Load(loader, Library("good"));
+	TPaletteEntry* first = fCatalog.FindPalEntry("TFirst");
+	const std::string output = Load(loader, Library("prints"));
+	for (const char* name : {"TFirst", "TSecond", "TThird"})
+		EXPECT_NE(
+			output.find("Warning: Another library offers the class '" + std::string(name) + "' of "
+				+ Library("prints") + "/test_library_prints.so; forms get that one's\n"),
+			std::string::npos)
+			<< output;
+	EXPECT_EQ(fCatalog.CountPalEntries(), 6);
+	EXPECT_EQ(fCatalog.FindPalEntry("TFirst"), first);
+}
+
+
 TEST_F(LibraryLoaderTest, AMissingFolderLoadsNothing)
 {
 	TLibraryLoader loader(&fCatalog);
@@ -106,6 +181,17 @@ TEST_F(LibraryLoaderTest, FilesThatAreNoLibrariesAreSkippedSilently)
 	TemporaryFolder folder;
 	folder.Write("readme.txt", "no library");
 	folder.Make("folder");
+	folder.Make("folder.so");
+	folder.Write("text.so", "no library either");
+	folder.Write("empty.so");
+	folder.Write("magic.so", "\177ELF");
+	folder.Link(folder / "nowhere", "dangling.so");
+	folder.Link(folder / "loop.so", "loop.so");
+	std::ifstream library(Library("good") + "/test_library_good.so", std::ios::binary);
+	std::string half(5000, '\0');
+	library.read(half.data(), static_cast<std::streamsize>(half.size()));
+	folder.Write("half.so", half);
+	std::filesystem::copy("/proc/self/exe", folder / "program.so");
 	TLibraryLoader loader(&fCatalog);
 	EXPECT_EQ(Load(loader, folder.Path()), "");
 	EXPECT_EQ(fStatus, B_OK);
