@@ -14,6 +14,21 @@ constexpr float kWidth = 300;
 constexpr float kTextHeight = 110;
 constexpr float kLineHeight = 16;
 
+/// The lines. A tab goes on to the buttons.
+class LinesView : public BTextView {
+public:
+	using BTextView::BTextView;
+
+	void KeyDown(const char* bytes, int32 numBytes) override
+	{
+		if (numBytes == 1 && *bytes == B_TAB)
+			BView::KeyDown(bytes, numBytes);
+		else
+			BTextView::KeyDown(bytes, numBytes);
+	}
+};
+
+
 /// The dialog: zones are lines of a text. It stays open while one of them cannot be read.
 class ZonesWin : public TPropertyModalEdit {
 public:
@@ -34,7 +49,7 @@ public:
 		frame.top = frame.bottom + kDialogSpace;
 		frame.bottom = frame.top + kTextHeight;
 		frame.right -= B_V_SCROLL_BAR_WIDTH;
-		fLines = new BTextView(frame, "tvZones", frame.OffsetToCopy(0, 0).InsetByCopy(4, 4),
+		fLines = new LinesView(frame, "tvZones", frame.OffsetToCopy(0, 0).InsetByCopy(4, 4),
 			B_FOLLOW_ALL_SIDES, B_WILL_DRAW | B_NAVIGABLE);
 		ground->AddChild(new BScrollView("svZones", fLines, B_FOLLOW_ALL_SIDES, 0, false, true));
 		AddDialogButtons(this, ground, BPoint(kWidth, frame.bottom), PME_OK, PME_CANCEL);

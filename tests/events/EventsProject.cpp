@@ -34,6 +34,7 @@ const setting kSettings[] = {
 	{"TSlider", "Value", "50"},
 	{"TTextControl", "Text", "text"},
 	{"TColorControl", "CellSize", "3"},
+	{"TClock", "Running", "false"},
 };
 
 // Columns and rows of the main form, below its menu bar.
@@ -79,6 +80,22 @@ Tick(TComponent* component, source_dialect dialect, project_event about,
 }
 
 
+/// Those of the standard library first, wherever it lies in its folder: scripts know their places.
+std::vector<const char*>
+ClassesInOrder()
+{
+	std::vector<const char*> classes;
+	std::vector<const char*> others;
+	for (int32 i = 0; i < PaletteCatalog().CountPalEntries(); i++) {
+		const TPaletteEntry* entry = PaletteCatalog().PalEntryAt(i);
+		const bool isStandard = strstr(entry->Copyright(), "standard") != nullptr;
+		(isStandard ? classes : others).push_back(entry->ClassName());
+	}
+	classes.insert(classes.end(), others.begin(), others.end());
+	return classes;
+}
+
+
 bool
 DesignMain(TDesignForm* form, source_dialect dialect, std::vector<project_event>* events)
 {
@@ -87,8 +104,7 @@ DesignMain(TDesignForm* form, source_dialect dialect, std::vector<project_event>
 	SetFrame(form, frame);
 	Tick(form, dialect, {"Main", "", "TForm", frame, nullptr, true}, events);
 	int32 cell = 0;
-	for (int32 i = 0; i < PaletteCatalog().CountPalEntries(); i++) {
-		const char* className = PaletteCatalog().PalEntryAt(i)->ClassName();
+	for (const char* className : ClassesInOrder()) {
 		BRect frame = kBar;
 		if (strcmp(className, "TMenuBar") != 0) {
 			frame = kCell.OffsetByCopy(

@@ -43,6 +43,9 @@ const std::map<std::string, std::string> kActions = {
 		"BMessage dragged('drag'); PictureView1->DragMessage(&dragged, PictureView1->Frame());"},
 	{"Main.MenuBar1.OnInvoke", "Do(item->Label());"},
 	{"Events.OnReadyToRun", "SetPulseRate(100000);"},
+	{"Main.Gauge1.OnClick", "Gauge1->SetValue(Gauge1->Value() + 10);"},
+	{"Main.Clock1.OnClick",
+		"Clock1->SetRunning(true);\n  Clock1->Pulse();\n  Clock1->SetRunning(false);"},
 	{"Note.Close.OnClick", "PostMessage(B_QUIT_REQUESTED);"},
 	{"Note.Vanish.OnClick", "Quit();"},
 };

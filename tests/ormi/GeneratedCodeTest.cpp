@@ -64,7 +64,7 @@ PlaceAll(TDesignForm* form, source_dialect dialect)
 	std::vector<const char*> classes;
 	for (int32 i = 0; i < PaletteCatalog().CountPalEntries(); i++)
 		classes.push_back(PaletteCatalog().PalEntryAt(i)->ClassName());
-	ASSERT_EQ(classes.size(), 19u);
+	ASSERT_EQ(classes.size(), 21u);
 
 	std::vector<TComponent*> containers;
 	float top = 10;

@@ -15,6 +15,7 @@ namespace {
 const std::set<std::string> kUnseen = {"Name", "Visible", "Flags", "ResizingMode"};
 const std::map<std::string, std::set<std::string>> kUnseenOfClass = {
 	{"TButton", {"Default"}},
+	{"TClock", {"Running"}},
 	{"TListView", {"ListType"}},
 	{"TOutlineListView", {"ListType"}},
 	{"TPictureButton", {"Behavior", "OnFile"}},

@@ -33,6 +33,8 @@ DialogFor(const std::string& name)
 {
 	if (name == "WindowFlags")
 		return "Window Flags";
+	if (name == "Zones")
+		return name;
 	return IsColor(name) ? "Color" : "View Flags";
 }
 
@@ -275,6 +277,8 @@ PropertyWalk::NewText(TComponent* component, const std::string& name, int round)
 		return std::to_string(60 * round);
 	if (name == "Value")
 		return std::to_string(40 + round);
+	if (name == "Time")
+		return "04:3" + std::to_string(round) + ":10";
 	if (name == "Minimum" || name == "Divider")
 		return std::to_string((name == "Divider" ? 50 : 0) + 10 * round);
 	WindowGuard guard(form);
@@ -379,8 +383,17 @@ PropertyWalk::EditByKeys(TComponent* component, const std::string& name, int rou
 			StrToRGBColor(ValueOf(component, name).c_str(), &color);
 			robot.Key("space");
 			EXPECT_TRUE(robot.WaitForWindow(dialog.c_str()));
-			robot.Key("tab");
-			if (dialog == "Color") {
+			if (dialog == "Zones") {
+				// It begins in its text.
+				robot.Key("command+a");
+				robot.Type(("0..5" + std::to_string(round) + " {0,0,200,255}").c_str());
+				robot.Key("tab");
+				robot.Key("tab");
+			} else
+				robot.Key("tab");
+			if (dialog == "Zones") {
+				// The button OK.
+			} else if (dialog == "Color") {
 				for (int i = 0; i < 3; i++)
 					robot.Key(color.red < 128 ? "right" : "left");
 			} else
