@@ -212,7 +212,7 @@ TLibraryTrial::WriteRecord(const std::vector<std::string>& paths)
 		fGood.RemoveName(path.c_str());
 		fGood.AddString(path.c_str(), StampOf(path.c_str()).c_str());
 	}
-	TReplacementFile file(fRecord.c_str());
+	TReplacementFile file(fRecord.c_str(), REPLACE_UNSYNCED);
 	if (file.InitCheck() == B_OK && fGood.Flatten(file.Stream()) == B_OK)
-		file.Replace(REPLACE_UNSYNCED);
+		file.Replace();
 }
