@@ -36,6 +36,20 @@ protected:
 		fRobot.Settle();
 	}
 
+	/// What the property window shows for it.
+	std::string Shown(const char* property)
+	{
+		fRobot.Settle();
+		WindowGuard guard(Inspector());
+		auto* list = dynamic_cast<BListView*>(Inspector()->FindView("lvProperties"));
+		for (int32 i = 0; i < list->CountItems(); i++) {
+			const auto* row = static_cast<TPropertyListItem*>(list->ItemAt(i));
+			if (strcmp(row->Name(), property) == 0)
+				return row->DisplayValue();
+		}
+		return "?";
+	}
+
 	void OpenZones()
 	{
 		Invoke("Zones");
@@ -85,6 +99,7 @@ TEST_F(GaugesOnSurfaceTest, ZonesAreEditedInADialogThatStaysOpenUntilTheyCanBeRe
 	const std::string zones = Value(gauge, "Zones");
 	const WindowPicture before = PictureOfForm();
 
+	EXPECT_EQ(Shown("Zones"), "3 zones");
 	OpenZones();
 	EXPECT_EQ(fRobot.Text("tvZones"),
 		"0..60 {60,160,60,255}\n60..80 {230,170,40,255}\n80..100 {200,50,50,255}");
@@ -94,6 +109,7 @@ TEST_F(GaugesOnSurfaceTest, ZonesAreEditedInADialogThatStaysOpenUntilTheyCanBeRe
 	EnterZones("0..50 {0,0,200,255}\n50..100 {0,200,200,255}");
 	ASSERT_TRUE(fRobot.WaitForNoWindow("Zones"));
 	EXPECT_EQ(Value(gauge, "Zones"), "0..50 {0,0,200,255}|50..100 {0,200,200,255}");
+	EXPECT_EQ(Shown("Zones"), "2 zones");
 	EXPECT_FALSE(PictureOfForm().SameIn(before, BRect(20, 20, 140, 140)));
 
 	OpenZones();

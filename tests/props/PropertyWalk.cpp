@@ -250,6 +250,8 @@ void
 PropertyWalk::WaitForEndOf(const std::string& dialog)
 {
 	ASSERT_TRUE(robot.WaitForNoWindow(dialog.c_str()));
+	// As the dialog does it where there is a main window.
+	window->UpdateDisplayValues();
 	ASSERT_TRUE(robot.WaitForWindow("Properties"));
 	robot.Settle();
 }
