@@ -29,6 +29,7 @@
 #include "model/Property.h"
 #include "palette/PaletteCatalog.h"
 #include "palette/PaletteEntry.h"
+#include "props/ForgottenEditors.h"
 
 namespace {
 
@@ -419,10 +420,13 @@ TDesignFormView::DeleteAllComponents()
 		RemoveComponent(component);
 		components.push_back(component);
 	}
+	std::unique_ptr<TForgottenEditors> editors = std::make_unique<TForgottenEditors>();
 	for (TComponent* component : components) {
 		component->DeletedFromFormDesigner();
+		editors->Add(component);
 		delete component;
 	}
+	Inspector::Bury(std::move(editors));
 	for (BView* view : views)
 		delete view;
 	SetModified(true);
@@ -488,8 +492,11 @@ TDesignFormView::DeleteComponent(TComponent* component)
 		view->RemoveSelf();
 	RemoveComponent(component);
 	component->DeletedFromFormDesigner();
+	std::unique_ptr<TForgottenEditors> editors = std::make_unique<TForgottenEditors>();
+	editors->Add(component);
 	delete component;
 	delete view;
+	Inspector::Bury(std::move(editors));
 	SetModified(true);
 	return true;
 }

@@ -9,9 +9,11 @@
 
 #include "designer/DesignForm.h"
 #include "designer/FormHost.h"
+#include "designer/Inspector.h"
 #include "model/Diagnostics.h"
 #include "palette/PaletteCatalog.h"
 #include "palette/PaletteEntry.h"
+#include "props/ForgottenEditors.h"
 
 namespace {
 
@@ -39,7 +41,11 @@ TDesignFormView::TDesignFormView(BRect frame, TDesignForm* form)
 
 TDesignFormView::~TDesignFormView()
 {
+	std::unique_ptr<TForgottenEditors> editors = std::make_unique<TForgottenEditors>();
+	for (int32 i = 0; i < TFormDesigner::CountComponents(); i++)
+		editors->Add(TFormDesigner::ComponentAt(i));
 	TFormDesigner::ClearComponents(true);
+	Inspector::Bury(std::move(editors));
 }
 
 

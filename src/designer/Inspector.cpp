@@ -7,6 +7,7 @@
 
 #include "app/MainWindow.h"
 #include "app/WindowGuard.h"
+#include "props/ForgottenEditors.h"
 #include "props/PropertyWin.h"
 
 namespace {
@@ -125,6 +126,17 @@ Forget(const std::vector<const TComponent*>& components, const BView* designView
 		if (window->DesignView() == designView)
 			window->SetDesignView(nullptr);
 	});
+}
+
+
+void
+Bury(std::unique_ptr<TForgottenEditors> editors)
+{
+	PropertyWin* window = Window();
+	if (window != nullptr)
+		window->Bury(std::move(editors));
+	else
+		editors->Spare();
 }
 
 

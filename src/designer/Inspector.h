@@ -3,10 +3,12 @@
 
 #pragma once
 
+#include <memory>
 #include <vector>
 
 class BView;
 class TComponent;
+class TForgottenEditors;
 
 /// What is shown in the property window. In programs without one the operations do nothing.
 ///
@@ -35,6 +37,10 @@ void LeaveForm(const TComponent* form, const std::vector<const TComponent*>& com
 /// Lets go of a form that is about to be destroyed, or has been: shows nothing if one of \a components is shown, and
 /// forgets \a designView if that is the design view. Either may be gone: addresses are only compared.
 void Forget(const std::vector<const TComponent*>& components, const BView* designView);
+
+/// Has \a editors destroyed when the window has done what it is about to do with any of them. Takes no lock. Without
+/// a window they are left alone.
+void Bury(std::unique_ptr<TForgottenEditors> editors);
 
 /// Brings the shown values up to date, soon. Takes no lock.
 void Refresh();

@@ -4,6 +4,7 @@
 #include "model/BlockPool.h"
 
 #include <atomic>
+#include <functional>
 #include <mutex>
 #include <new>
 #include <thread>
@@ -21,6 +22,12 @@ constexpr size_t kChunkSize = 64 * 1024;
 struct BlockHeader {
 	size_t units; // 0: the block is the heap's
 };
+
+/// What lies at the beginning of a chunk, in its first unit.
+struct ChunkHeader {
+	ChunkHeader* previous;
+};
+static_assert(sizeof(ChunkHeader) <= kUnit - sizeof(BlockHeader));
 
 struct FreeBlock {
 	FreeBlock* next;
@@ -44,6 +51,7 @@ private:
 // sanitizers it lies idle.
 ShortLock sLock;
 [[maybe_unused]] FreeBlock* sFree[kLargestUnits + 1];
+ChunkHeader* sLastChunk = nullptr;
 char* sChunk = nullptr;
 char* sChunkEnd = nullptr;
 
@@ -61,8 +69,11 @@ CutBlock(size_t units)
 {
 	const size_t size = units * kUnit;
 	if (static_cast<size_t>(sChunkEnd - sChunk) < size) {
-		sChunk = static_cast<char*>(::operator new(kChunkSize)) + kUnit;
-		sChunkEnd = sChunk + kChunkSize - kUnit;
+		ChunkHeader* chunk = static_cast<ChunkHeader*>(::operator new(kChunkSize));
+		chunk->previous = sLastChunk;
+		sLastChunk = chunk;
+		sChunk = reinterpret_cast<char*>(chunk) + kUnit;
+		sChunkEnd = reinterpret_cast<char*>(chunk) + kChunkSize;
 	}
 	void* block = sChunk;
 	sChunk += size;
@@ -94,6 +105,20 @@ TBlockPool::Allocate(size_t size)
 	sFree[units] = block->next;
 	return block;
 #endif
+}
+
+
+bool
+TBlockPool::Owns(const void* block)
+{
+	const std::less<const void*> isBefore;
+	const std::lock_guard<ShortLock> lock(sLock);
+	for (const ChunkHeader* chunk = sLastChunk; chunk != nullptr; chunk = chunk->previous) {
+		if (!isBefore(block, chunk)
+			&& isBefore(block, reinterpret_cast<const char*>(chunk) + kChunkSize))
+			return true;
+	}
+	return false;
 }
 
 

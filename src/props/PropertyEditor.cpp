@@ -11,6 +11,7 @@
 #include "model/Component.h"
 #include "model/ComponentOwner.h"
 #include "model/Property.h"
+#include "props/ForgottenEditors.h"
 
 
 TPropertyEditor::TPropertyEditor(TComponent* component, TProperty* property, TPropEditType type)
@@ -21,7 +22,10 @@ TPropertyEditor::TPropertyEditor(TComponent* component, TProperty* property, TPr
 }
 
 
-TPropertyEditor::~TPropertyEditor() {}
+TPropertyEditor::~TPropertyEditor()
+{
+	TForgottenEditors::EditorGone(this);
+}
 
 
 void*

@@ -22,7 +22,7 @@ enum TPropEditType {
 /// The editor of one property of one component.
 ///
 /// It has no text of its own: its value is the property's. Nobody owns it: it lives on when component
-/// and property are gone. Component libraries derive from it: the order of the fields and of the virtual
+/// and property are gone, until the designer, having deleted the component, deletes it as well. Component libraries derive from it: the order of the fields and of the virtual
 /// operations is a binary interface. Use it in the thread of the form that the component lives on, or
 /// with that form's window locked.
 class TPropertyEditor {

@@ -22,6 +22,7 @@
 #include "props/EscapeFilter.h"
 #include "props/EventListItem.h"
 #include "props/EventView.h"
+#include "props/ForgottenEditors.h"
 #include "props/PickListProperty.h"
 #include "props/PropView.h"
 #include "props/PropertyListItem.h"
@@ -36,6 +37,7 @@ constexpr float kHeight = 300;
 constexpr const char* kFrameSetting = "PropertyWinFrame";
 
 constexpr uint32 kMsgRefresh = 'rfsh';
+constexpr uint32 kMsgBury = 'bury';     // "editors" (pointer): the receiver's
 constexpr bigtime_t kFrameTime = 16000; // microseconds
 
 template <typename Row>
@@ -93,6 +95,12 @@ PropertyWin::MessageReceived(BMessage* message)
 {
 	if (message->what == kMsgRefresh) {
 		RefreshInThisFrame();
+		return;
+	}
+	if (message->what == kMsgBury) {
+		void* editors;
+		if (message->FindPointer("editors", &editors) == B_OK)
+			delete static_cast<TForgottenEditors*>(editors);
 		return;
 	}
 
@@ -228,6 +236,18 @@ PropertyWin::UpdateDisplayValues()
 {
 	if (!fRefreshWaits.exchange(true) && PostMessage(kMsgRefresh) != B_OK)
 		fRefreshWaits = false;
+}
+
+
+void
+PropertyWin::Bury(std::unique_ptr<TForgottenEditors> editors)
+{
+	BMessage message(kMsgBury);
+	message.AddPointer("editors", editors.get());
+	if (PostMessage(&message) != B_OK)
+		editors->Spare();
+	else
+		editors.release();
 }
 
 

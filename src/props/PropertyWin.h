@@ -14,6 +14,7 @@
 class BMessageRunner;
 class TEditorPanes;
 class TEventView;
+class TForgottenEditors;
 class TPropView;
 class TabView;
 struct TComponentRows;
@@ -63,6 +64,10 @@ public:
 	/// thread, no lock needed.
 	virtual void UpdateDisplayValues();
 
+	/// Destroys \a editors in the window's own thread, after the message that it is handling, with which it may still
+	/// be about to use one. Any thread, no lock needed.
+	void Bury(std::unique_ptr<TForgottenEditors> editors);
+
 	/// The view whose window is locked around edits: that of the form that the component lives on, or null.
 	virtual void SetDesignView(BView* view);
 
@@ -107,7 +112,8 @@ private:
 	TComponent* fComponent;
 	BLooper* fRowsLock; // that of the window of the form that the rows were read from
 	TPropertyWatch fProperty;
-	// Of the current property. Editors are never destroyed, so this one may be asked for its type at any time.
+	// Of the current property. An editor is destroyed in this window's thread only (Bury()), and its property before
+	// it, so as long as the property was there in this message, this one may be asked for its type.
 	TPropertyEditor* fEditor;
 	BLooper* fPropertyLock;
 	uint32 fPropertyCount; // what fShownCount was when the property became the current one
