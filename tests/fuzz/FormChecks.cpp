@@ -6,27 +6,23 @@
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
+#include <filesystem>
 #include <string>
 
 #include <Application.h>
 #include <String.h>
 
 #include "app/Dialogs.h"
+#include "codegen/CodeGenerator.h"
+#include "codegen/ProjectCheck.h"
 #include "designer/DesignForm.h"
 #include "designer/LoadReport.h"
+#include "fuzz/Require.h"
 #include "model/AppComponent.h"
 #include "palette/LibraryLoader.h"
 #include "palette/PaletteCatalog.h"
 #include "project/Project.h"
 #include "support/TemporaryFolder.h"
-
-#define REQUIRE(condition)                                                                         \
-	do {                                                                                           \
-		if (!(condition)) {                                                                        \
-			fprintf(stderr, "%s:%d: does not hold: %s\n", __FILE__, __LINE__, #condition);         \
-			abort();                                                                               \
-		}                                                                                          \
-	} while (false)
 
 namespace {
 
@@ -70,6 +66,22 @@ std::string
 Bytes(const uint8_t* bytes, size_t size)
 {
 	return std::string(reinterpret_cast<const char*>(bytes), size);
+}
+
+
+/// The folder of a project, with the forms of the example in it.
+const TemporaryFolder&
+FolderWithForms()
+{
+	static const TemporaryFolder sFolder;
+	static const bool sIsFilled = [] {
+		for (const char* name : {"MainForm.frm", "NoteForm.frm"})
+			std::filesystem::copy(
+				PLIM_SOURCE_DIR "/examples/hello/" + std::string(name), sFolder / name);
+		return true;
+	}();
+	REQUIRE(sIsFilled);
+	return sFolder;
 }
 
 
@@ -151,5 +163,38 @@ CheckProjectBytes(const uint8_t* bytes, size_t size)
 	REQUIRE(again.LoadFromFile(saved.c_str()));
 	REQUIRE(again.CountForms() == 0);
 	REQUIRE(strcmp(again.App()->ComponentName(), project.App()->ComponentName()) == 0);
+	return true;
+}
+
+
+bool
+CheckWholeProject(const uint8_t* bytes, size_t size)
+{
+	const TemporaryFolder& folder = FolderWithForms();
+	const std::string path = folder.Write("project.plim", Bytes(bytes, size));
+	TProject project(FORM_HIDDEN);
+	TLoadReport report;
+	const bool loaded = project.LoadFromFile(path.c_str(), &report);
+	CheckReport(report);
+	REQUIRE(project.App()->CountComponents() == project.CountForms());
+	if (!loaded) {
+		REQUIRE(project.CountForms() == 0);
+		return false;
+	}
+	for (int32 i = 0; i < project.CountForms(); i++)
+		REQUIRE(!TProject::IsChanged(project.FormAt(i)));
+
+	TProjectCheck check(project.App(), path.c_str());
+	for (const project_problem& problem : check.Run())
+		REQUIRE(!problem.text.empty());
+
+	TCodeGenerator generator;
+	generator.Writer().SetDryRun(true);
+	generator.SetAppComponent(project.App());
+	// Not where the document says.
+	generator.SetGenerationPath((folder / "sources").c_str());
+	generator.GenerateApp();
+	REQUIRE(!generator.Writer().Files().empty());
+	REQUIRE(!std::filesystem::exists(folder / "sources"));
 	return true;
 }

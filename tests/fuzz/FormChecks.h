@@ -19,4 +19,8 @@ bool CheckFormBytes(const uint8_t* bytes, size_t size);
 /// looked for, too, but never written.
 bool CheckProjectBytes(const uint8_t* bytes, size_t size);
 
+/// Loads the bytes as a project file beside which the forms of the example lie, looks for problems in it, and
+/// generates it without writing. Documents are only read. Returns whether it loaded.
+bool CheckWholeProject(const uint8_t* bytes, size_t size);
+
 #endif // TESTS_FUZZ_FORM_CHECKS_H

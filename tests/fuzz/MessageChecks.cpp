@@ -19,14 +19,7 @@
 #include <String.h>
 
 #include "app/MessagePrivate.h"
-
-#define REQUIRE(condition)                                                                         \
-	do {                                                                                           \
-		if (!(condition)) {                                                                        \
-			fprintf(stderr, "%s:%d: does not hold: %s\n", __FILE__, __LINE__, #condition);         \
-			abort();                                                                               \
-		}                                                                                          \
-	} while (false)
+#include "fuzz/Require.h"
 
 namespace {
 
