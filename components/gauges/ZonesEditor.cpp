@@ -10,7 +10,7 @@
 
 namespace {
 
-constexpr float kWidth = 300;
+constexpr float kWidth = 350;
 constexpr float kTextHeight = 110;
 constexpr float kLineHeight = 16;
 
@@ -50,8 +50,8 @@ public:
 		frame.bottom = frame.top + kTextHeight;
 		frame.right -= B_V_SCROLL_BAR_WIDTH;
 		fLines = new LinesView(frame, "tvZones", frame.OffsetToCopy(0, 0).InsetByCopy(4, 4),
-			B_FOLLOW_ALL_SIDES, B_WILL_DRAW | B_NAVIGABLE);
-		ground->AddChild(new BScrollView("svZones", fLines, B_FOLLOW_ALL_SIDES, 0, false, true));
+			B_FOLLOW_NONE, B_WILL_DRAW | B_NAVIGABLE);
+		ground->AddChild(new BScrollView("svZones", fLines, B_FOLLOW_NONE, 0, false, true));
 		AddDialogButtons(this, ground, BPoint(kWidth, frame.bottom), PME_OK, PME_CANCEL);
 		// Enter begins the next line.
 		SetDefaultButton(nullptr);
@@ -69,7 +69,7 @@ public:
 	{
 		std::vector<Gauges::zone> zones;
 		if (message->what == PME_OK && !ReadZones(fLines->Text(), '\n', &zones))
-			fHint->SetText("Not like this: 0..60 {60,160,60,255}");
+			fHint->SetText("A line cannot be read. Write: 0..60 {60,160,60,255}");
 		else
 			TPropertyModalEdit::MessageReceived(message);
 	}

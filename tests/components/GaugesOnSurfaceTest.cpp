@@ -104,7 +104,8 @@ TEST_F(GaugesOnSurfaceTest, ZonesAreEditedInADialogThatStaysOpenUntilTheyCanBeRe
 	EXPECT_EQ(fRobot.Text("tvZones"),
 		"0..60 {60,160,60,255}\n60..80 {230,170,40,255}\n80..100 {200,50,50,255}");
 	EnterZones("0..50 blue");
-	EXPECT_TRUE(fRobot.WaitForText("lblHint", "Not like this: 0..60 {60,160,60,255}"));
+	EXPECT_TRUE(
+		fRobot.WaitForText("lblHint", "A line cannot be read. Write: 0..60 {60,160,60,255}"));
 	EXPECT_EQ(Value(gauge, "Zones"), zones);
 	EnterZones("0..50 {0,0,200,255}\n50..100 {0,200,200,255}");
 	ASSERT_TRUE(fRobot.WaitForNoWindow("Zones"));
