@@ -38,8 +38,9 @@ struct HostSizeLimits {
 };
 
 
-/// In a report of a move or size (bool): SetFrame() asked for it, so that the caller knows of it already.
-inline const char* const kAskedFor = "be:asked";
+/// In a report of a move or size (int32): how often MoveTo(), or ResizeTo(), had been called by then. A report with another
+/// number than the caller's is older than its last request.
+inline const char* const kTimesAsked = "be:times_asked";
 
 
 /// Who hears from a host window. The calls come from the display's thread, or from a thread that injects
@@ -58,8 +59,8 @@ public:
 	/// the window. While a button is held its moves and its release go to the window of the press.
 	/// B_KEY_DOWN, B_KEY_UP, B_UNMAPPED_KEY_DOWN, B_UNMAPPED_KEY_UP, B_MODIFIERS_CHANGED: as in the API,
 	/// to the active window.
-	/// B_WINDOW_ACTIVATED: "active". B_WINDOW_MOVED: "where". B_WINDOW_RESIZED: "width", "height". Both have
-	/// kAskedFor when they come of SetFrame().
+	/// B_WINDOW_ACTIVATED: "active". B_WINDOW_MOVED: "where". B_WINDOW_RESIZED: "width", "height". Both come
+	/// of the host's or the user's doing only, and have kTimesAsked.
 	/// B_MINIMIZE: "minimize" (the host already did it). B_ZOOM: the host's zoom button; the new frame has
 	/// come as a move and a resize before.
 	/// B_SCREEN_CHANGED: "frame", "mode". B_QUIT_REQUESTED: the close button.
@@ -86,7 +87,9 @@ public:
 	/// Takes the window off the screen; the client hears nothing from here on.
 	virtual ~HostWindow() = default;
 
-	virtual void SetFrame(BRect frame) = 0;
+	/// Asks for a place or a size. Nothing is reported where the host does as asked.
+	virtual void MoveTo(BPoint leftTop) = 0;
+	virtual void ResizeTo(BSize size) = 0;
 	virtual void SetTitle(const char* title) = 0;
 	virtual void SetStyle(const HostWindowStyle& style) = 0;
 	virtual void SetSizeLimits(const HostSizeLimits& limits) = 0;

@@ -10,7 +10,8 @@ namespace BPrivate {
 
 NoneWindow::NoneWindow(
 	InputHub& hub, BRect frame, const HostWindowStyle& style, HostWindowClient* client)
-	: fHub(hub)
+	: fHub(hub),
+	  fFrame(frame)
 {
 	fStacked.client = client;
 	fStacked.frame = frame;
@@ -26,30 +27,20 @@ NoneWindow::~NoneWindow()
 
 
 void
-NoneWindow::SetFrame(BRect frame)
+NoneWindow::MoveTo(BPoint leftTop)
 {
-	ReportFrame(frame, true);
+	std::lock_guard<std::mutex> lock(fFrameMutex);
+	fFrame.MoveTo(leftTop);
+	fHub.SetFrame(&fStacked, fFrame.Known());
 }
 
 
 void
-NoneWindow::ReportFrame(BRect frame, bool askedFor)
+NoneWindow::ResizeTo(BSize size)
 {
-	BRect old = fHub.Frame(&fStacked);
-	fHub.SetFrame(&fStacked, frame);
-	if (frame.LeftTop() != old.LeftTop()) {
-		auto message = std::make_unique<BMessage>(B_WINDOW_MOVED);
-		message->AddPoint("where", frame.LeftTop());
-		message->AddBool(kAskedFor, askedFor);
-		fHub.Deliver(&fStacked, std::move(message));
-	}
-	if (frame.Width() != old.Width() || frame.Height() != old.Height()) {
-		auto message = std::make_unique<BMessage>(B_WINDOW_RESIZED);
-		message->AddInt32("width", frame.IntegerWidth());
-		message->AddInt32("height", frame.IntegerHeight());
-		message->AddBool(kAskedFor, askedFor);
-		fHub.Deliver(&fStacked, std::move(message));
-	}
+	std::lock_guard<std::mutex> lock(fFrameMutex);
+	fFrame.ResizeTo(size);
+	fHub.SetFrame(&fStacked, fFrame.Known());
 }
 
 
@@ -186,7 +177,10 @@ NoneWindow::SetPointerGrab(bool grab)
 void
 NoneWindow::InjectFrame(BRect frame)
 {
-	ReportFrame(frame, false);
+	std::lock_guard<std::mutex> lock(fFrameMutex);
+	const BRect before = fFrame.Known();
+	fFrame.HostHas(frame);
+	TellFrame(fHub, &fStacked, fFrame, before);
 }
 
 

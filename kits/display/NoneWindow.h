@@ -3,7 +3,10 @@
 #ifndef DISPLAY_NONE_WINDOW_H
 #define DISPLAY_NONE_WINDOW_H
 
+#include <mutex>
+
 #include "display/InputHub.h"
+#include "display/SharedFrame.h"
 
 namespace BPrivate {
 
@@ -12,7 +15,8 @@ public:
 	NoneWindow(InputHub& hub, BRect frame, const HostWindowStyle& style, HostWindowClient* client);
 	~NoneWindow() override;
 
-	void SetFrame(BRect frame) override;
+	void MoveTo(BPoint leftTop) override;
+	void ResizeTo(BSize size) override;
 	void SetTitle(const char* title) override;
 	void SetStyle(const HostWindowStyle& style) override;
 	void SetSizeLimits(const HostSizeLimits& limits) override;
@@ -37,10 +41,11 @@ public:
 	void InjectZoom() override;
 
 private:
-	void ReportFrame(BRect frame, bool askedFor);
-
 	InputHub& fHub;
 	StackedWindow fStacked;
+	/// Taken before the hub's lock.
+	std::mutex fFrameMutex;
+	SharedFrame fFrame;
 };
 
 } // namespace BPrivate

@@ -21,10 +21,6 @@ WindowClient::WindowClient(port_id port)
 void
 WindowClient::Deliver(std::unique_ptr<BMessage> message)
 {
-	// The window has told itself, and may have gone on to another frame since.
-	if (message->GetBool(kAskedFor, false))
-		return;
-
 	switch (message->what) {
 		case B_WINDOW_MOVED:
 		case B_WINDOW_RESIZED:

@@ -221,6 +221,10 @@ void
 WindowData::FrameReported(BMessage* message)
 {
 	bool fromHost = message->GetBool(kFromHost, false);
+	// The window has asked for something else since the host told of this, and is told what comes of that.
+	const int32 timesAsked = message->what == B_WINDOW_MOVED ? movesAsked : sizesAsked;
+	if (fromHost && message->GetInt32(kTimesAsked, timesAsked) != timesAsked)
+		return;
 	BMessage* newer = window->MessageQueue()->FindMessage(message->what);
 	if (fromHost && newer != nullptr && newer->GetBool(kFromHost, false))
 		return;

@@ -123,8 +123,9 @@ BWindow::MoveTo(float x, float y)
 	BPoint where(std::round(x), std::round(y));
 	if (where != fData->frame.LeftTop()) {
 		fData->AdoptFrame(fData->frame.OffsetToCopy(where));
+		fData->movesAsked++;
 		if (fData->host != nullptr)
-			fData->host->SetFrame(fData->frame);
+			fData->host->MoveTo(where);
 		fData->PostMoved();
 	}
 	Unlock();
@@ -149,8 +150,9 @@ BWindow::ResizeTo(float width, float height)
 	BSize size = fData->Limited(std::round(width), std::round(height));
 	if (size != fData->frame.Size()) {
 		fData->AdoptFrame(BRect(fData->frame.LeftTop(), size));
+		fData->sizesAsked++;
 		if (fData->host != nullptr)
-			fData->host->SetFrame(fData->frame);
+			fData->host->ResizeTo(size);
 		fData->PostResized();
 	}
 	Unlock();

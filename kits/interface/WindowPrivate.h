@@ -71,6 +71,9 @@ public:
 	BWindow* window;
 	std::string title;
 	BRect frame;
+	/// How often the host was asked for a place, and for a size.
+	int32 movesAsked = 0;
+	int32 sizesAsked = 0;
 	BRect frameBeforeZoom;
 	window_look look = B_TITLED_WINDOW_LOOK;
 	window_feel feel = B_NORMAL_WINDOW_FEEL;

@@ -22,6 +22,7 @@
 
 #include "display/qt/CursorShapes.h"
 #include "display/qt/DropData.h"
+#include "display/qt/HostEcho.h"
 #include "display/qt/KeyTranslation.h"
 #include "display/qt/QtCanvas.h"
 #include "display/qt/QtHostWindow.h"
@@ -71,6 +72,10 @@ QtDisplay::QtDisplay(bool managesFocus)
 }
 
 
+// Never called for one that has started.
+QtDisplay::~QtDisplay() = default;
+
+
 bool
 QtDisplay::Start(const std::string& platforms)
 {
@@ -82,6 +87,8 @@ void
 QtDisplay::Connect()
 {
 	ConnectScreens();
+	if (QGuiApplication::platformName() == QLatin1String("xcb"))
+		fEcho = std::make_unique<HostEcho>();
 	auto application = static_cast<QGuiApplication*>(QCoreApplication::instance());
 	QObject::connect(application, &QGuiApplication::focusWindowChanged, application,
 		[this](QWindow* window) { FocusChanged(window); });
@@ -215,29 +222,6 @@ QtDisplay::WindowOf(const StackedWindow* stacked) const
 			return window->Window();
 	}
 	return nullptr;
-}
-
-
-void
-QtDisplay::ReportFrame(StackedWindow* window, BRect frame, FrameReport report)
-{
-	BRect old = fHub.Frame(window);
-	fHub.SetFrame(window, frame);
-	const bool always = report == FrameReport::kAlways;
-	const bool askedFor = report == FrameReport::kAskedFor;
-	if (always || frame.LeftTop() != old.LeftTop()) {
-		auto message = std::make_unique<BMessage>(B_WINDOW_MOVED);
-		message->AddPoint("where", frame.LeftTop());
-		message->AddBool(kAskedFor, askedFor);
-		fHub.Deliver(window, std::move(message));
-	}
-	if (always || frame.Width() != old.Width() || frame.Height() != old.Height()) {
-		auto message = std::make_unique<BMessage>(B_WINDOW_RESIZED);
-		message->AddInt32("width", frame.IntegerWidth());
-		message->AddInt32("height", frame.IntegerHeight());
-		message->AddBool(kAskedFor, askedFor);
-		fHub.Deliver(window, std::move(message));
-	}
 }
 
 

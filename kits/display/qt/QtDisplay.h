@@ -23,16 +23,15 @@ class QWindow;
 
 namespace BPrivate {
 
+class HostEcho;
 class QtHostWindow;
 class QtWindow;
-
-/// What is told of a frame: what the program itself asked for, only what differs from the frame that the hub has, or all.
-enum class FrameReport { kAskedFor, kWhenNew, kAlways };
 
 class QtDisplay : public Display {
 public:
 	/// \a managesFocus: the platform has no window manager.
 	explicit QtDisplay(bool managesFocus);
+	~QtDisplay() override;
 
 	/// False when Qt cannot have any of \a platforms.
 	bool Start(const std::string& platforms);
@@ -85,8 +84,8 @@ public:
 	bool Has(const QtHostWindow* window) const;
 	/// Null when it has gone.
 	QtWindow* WindowOf(const StackedWindow* stacked) const;
-	/// Tells the hub and, by messages, the window where it is now.
-	void ReportFrame(StackedWindow* window, BRect frame, FrameReport report);
+	/// Null where the host does at once what it is asked.
+	HostEcho* Echo() const { return fEcho.get(); }
 	/// The program's window at a place of the screen; not known where the host does not tell.
 	std::optional<StackedWindow*> WindowUnder(QPoint globalPosition) const;
 	/// Above which window \a window belongs.
@@ -128,6 +127,8 @@ private:
 	std::vector<BRect> fScreens;
 
 	// Display thread only
+	/// Left to the server in the end: Qt destroys no windows once the program is on its way out.
+	std::unique_ptr<HostEcho> fEcho;
 	std::shared_ptr<const CursorShape> fApplicationCursor;
 	bool fCursorHidden;
 	bool fCursorObscured;

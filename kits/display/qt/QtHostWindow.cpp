@@ -67,12 +67,16 @@ QtHostWindow::WithWindow(const std::function<void(QtWindow&)>& task) const
 
 
 void
-QtHostWindow::SetFrame(BRect frame)
+QtHostWindow::MoveTo(BPoint leftTop)
 {
-	WithWindow([&](QtWindow& window) {
-		fDisplay.ReportFrame(&fStacked, frame, FrameReport::kAskedFor);
-		window.Place(frame);
-	});
+	WithWindow([&](QtWindow& window) { window.MoveTo(leftTop); });
+}
+
+
+void
+QtHostWindow::ResizeTo(BSize size)
+{
+	WithWindow([&](QtWindow& window) { window.ResizeTo(size); });
 }
 
 

@@ -28,7 +28,8 @@ public:
 	/// Display thread: the host's window goes now, this object stays.
 	void Detach();
 
-	void SetFrame(BRect frame) override;
+	void MoveTo(BPoint leftTop) override;
+	void ResizeTo(BSize size) override;
 	void SetTitle(const char* title) override;
 	void SetStyle(const HostWindowStyle& style) override;
 	void SetSizeLimits(const HostSizeLimits& limits) override;

@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <optional>
 
 #include <QGuiApplication>
 #include <QKeyEvent>
@@ -19,6 +20,7 @@
 
 #include "display/InputHub.h"
 #include "display/qt/DropData.h"
+#include "display/qt/HostEcho.h"
 #include "display/qt/KeyTranslation.h"
 #include "display/qt/QtDisplay.h"
 #include "display/qt/Surface.h"
@@ -128,11 +130,11 @@ QtWindow::QtWindow(QtDisplay& display, std::shared_ptr<Surface> surface, Stacked
 	  fIsMinimized(false),
 	  fIsZoomed(false),
 	  fIsAway(false),
-	  fHasToldUnasked(false)
+	  fFrame(stacked->frame)
 {
 	setSurfaceType(QSurface::RasterSurface);
 	Apply(stacked->style);
-	Place(stacked->frame);
+	setGeometry(GeometryOf(stacked->frame));
 	scale = static_cast<float>(devicePixelRatio());
 }
 
@@ -141,6 +143,14 @@ BRect
 QtWindow::RectOf(const QRect& geometry)
 {
 	return BRect(geometry.left(), geometry.top(), geometry.right(), geometry.bottom());
+}
+
+
+QRect
+QtWindow::GeometryOf(BRect frame)
+{
+	return QRect(static_cast<int>(frame.left), static_cast<int>(frame.top),
+		std::max(frame.IntegerWidth() + 1, 1), std::max(frame.IntegerHeight() + 1, 1));
 }
 
 
@@ -215,17 +225,48 @@ QtWindow::ApplyLimits()
 
 
 void
-QtWindow::Place(BRect frame)
+QtWindow::MoveTo(BPoint leftTop)
 {
-	QRect wanted(static_cast<int>(frame.left), static_cast<int>(frame.top),
-		std::max(frame.IntegerWidth() + 1, 1), std::max(frame.IntegerHeight() + 1, 1));
+	fFrame.MoveTo(leftTop);
+	fDisplay.Hub().SetFrame(fStacked, fFrame.Known());
+	AskHost();
+}
+
+
+void
+QtWindow::ResizeTo(BSize size)
+{
+	fFrame.ResizeTo(size);
+	fDisplay.Hub().SetFrame(fStacked, fFrame.Known());
 	ApplyLimits();
-	if (wanted == (fRequested.empty() ? geometry() : fRequested.back()))
+	AskHost();
+}
+
+
+// One request at a time, see SharedFrame.
+void
+QtWindow::AskHost()
+{
+	if (fFrame.IsAsking())
 		return;
-	// The host answers for a hidden window, too, and maybe only after it was shown.
-	if (handle() != nullptr)
-		fRequested.push_back(wanted);
-	setGeometry(wanted);
+	setGeometry(GeometryOf(fFrame.Known()));
+	// A host has nothing to say before there is a window.
+	if (handle() == nullptr || fDisplay.Echo() == nullptr)
+		return;
+	fFrame.BeginAsking();
+	fDisplay.Echo()->WhenAnswered(this, [this] { HostAnswered(); });
+}
+
+
+void
+QtWindow::HostAnswered()
+{
+	const BRect before = fFrame.Known();
+	const bool asksAgain =
+		fFrame.EndAsking(isVisible() ? std::optional<BRect>(RectOf(geometry())) : std::nullopt);
+	TellFrame(fDisplay.Hub(), fStacked, fFrame, before);
+	if (asksAgain)
+		AskHost();
 }
 
 
@@ -241,11 +282,11 @@ QtWindow::ShowWindow()
 	}
 	if ((fStyle.flags & B_AVOID_FRONT) == 0)
 		raise();
-	// The host answers with the frame that the window is shown with, maybe only after the program has asked for others.
-	if (handle() == nullptr)
-		fRequested.push_back(geometry());
 	setVisible(true);
 	CheckScale();
+	// What the host told of a hidden window was not heard, and it may have nothing new to tell.
+	if (fDisplay.Echo() != nullptr)
+		fDisplay.Echo()->WhenAnswered(this, [this] { GeometryChanged(); });
 }
 
 
@@ -319,7 +360,7 @@ QtWindow::ZoomByUser()
 BRect
 QtWindow::FrameWithBorder() const
 {
-	return RectOf(frameGeometry());
+	return RectOf(GeometryOf(fFrame.Known()).marginsAdded(frameMargins()));
 }
 
 
@@ -410,26 +451,11 @@ void
 QtWindow::GeometryChanged()
 {
 	CheckScale();
-	QRect now = geometry();
-	auto asked = std::find(fRequested.begin(), fRequested.end(), now);
-	bool isUnasked = asked == fRequested.end();
-	// In the middle of the answers to what was asked for: an answer is still to come.
-	bool isOutOfTurn = isUnasked && !fRequested.empty();
-	if (!isUnasked) {
-		// Word of an older request: the program has asked for something else since.
-		bool isNewest = asked + 1 == fRequested.end();
-		fRequested.erase(fRequested.begin(), asked + 1);
-		if (!isNewest)
-			return;
-	} else
-		fRequested.clear();
 	if (!isVisible())
 		return;
-	// The window may hear of a frame that nobody asked for after it has asked for this one, so it has to hear of this
-	// one again.
-	fDisplay.ReportFrame(fStacked, RectOf(now),
-		isOutOfTurn || fHasToldUnasked ? FrameReport::kAlways : FrameReport::kWhenNew);
-	fHasToldUnasked = isOutOfTurn || (fHasToldUnasked && isUnasked);
+	const BRect before = fFrame.Known();
+	fFrame.HostHas(RectOf(geometry()));
+	TellFrame(fDisplay.Hub(), fStacked, fFrame, before);
 }
 
 
@@ -569,8 +595,14 @@ QtWindow::HandleState()
 	if (zoomed != fIsZoomed) {
 		fIsZoomed = zoomed;
 		// The host tells of the new frame before or after the state, in one step or two.
-		QTimer::singleShot(kZoomDelay, this,
-			[this] { fDisplay.Hub().Deliver(fStacked, std::make_unique<BMessage>(B_ZOOM)); });
+		const auto tell = [this] {
+			GeometryChanged();
+			fDisplay.Hub().Deliver(fStacked, std::make_unique<BMessage>(B_ZOOM));
+		};
+		if (fDisplay.Echo() != nullptr)
+			fDisplay.Echo()->WhenAnswered(this, tell);
+		else
+			QTimer::singleShot(kZoomDelay, this, tell);
 	}
 
 	bool minimized = (windowStates() & Qt::WindowMinimized) != 0;

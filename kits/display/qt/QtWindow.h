@@ -5,12 +5,12 @@
 
 #include <atomic>
 #include <memory>
-#include <vector>
 
 #include <QBackingStore>
 #include <QWindow>
 
 #include "display/HostWindow.h"
+#include "display/SharedFrame.h"
 
 class QDragMoveEvent;
 class QDropEvent;
@@ -30,7 +30,8 @@ public:
 	StackedWindow* Stacked() const { return fStacked; }
 	void Apply(const HostWindowStyle& style);
 	void SetLimits(const HostSizeLimits& limits);
-	void Place(BRect frame);
+	void MoveTo(BPoint leftTop);
+	void ResizeTo(BSize size);
 	void ShowWindow();
 	void HideWindow();
 	/// A floating window goes while another program is active, and comes back.
@@ -48,6 +49,7 @@ public:
 
 	BRect FrameWithBorder() const;
 	static BRect RectOf(const QRect& geometry);
+	static QRect GeometryOf(BRect frame);
 	/// B_PRIMARY_MOUSE_BUTTON, ...
 	static uint32 ButtonsOf(Qt::MouseButtons pressed);
 
@@ -62,6 +64,8 @@ protected:
 	void moveEvent(QMoveEvent* event) override;
 
 private:
+	void AskHost();
+	void HostAnswered();
 	void GeometryChanged();
 	void ApplyLimits();
 	void HandleMouse(QMouseEvent* event);
@@ -79,10 +83,7 @@ private:
 	bool fIsMinimized;
 	bool fIsZoomed;
 	bool fIsAway;
-	/// What was asked of the host and not yet seen to happen, oldest first.
-	std::vector<QRect> fRequested;
-	/// A frame was reported that came out of turn, and no answer to a request since.
-	bool fHasToldUnasked;
+	SharedFrame fFrame;
 };
 
 } // namespace BPrivate

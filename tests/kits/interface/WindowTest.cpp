@@ -9,6 +9,8 @@
 #include <Screen.h>
 
 #include "InterfaceFixture.h"
+#include "display/HostWindow.h"
+#include "interface/WindowPrivate.h"
 #include "support/Printers.h"
 
 namespace {
@@ -281,6 +283,46 @@ TEST_F(WindowTest, MovesAndResizesReachTheHooksLater)
 	window->Unlock();
 	Settle(window);
 	window->Lock();
+	EXPECT_EQ(std::count(window->log.begin(), window->log.end(), "moved"), 1);
+	EXPECT_EQ(std::count(window->log.begin(), window->log.end(), "resized"), 1);
+	window->Unlock();
+	Quit(window);
+}
+
+
+// The window's thread gets to the user's move only after the program has gone on.
+TEST_F(WindowTest, APlaceThatTheProgramAsksForOutlivesAnOlderMoveOfTheUser)
+{
+	auto* window = new HookWindow;
+	window->Show();
+	window->Lock();
+	window->log.clear();
+	BPrivate::WindowData::Of(window).host->InjectFrame(BRect(10, 20, 210, 120));
+	window->MoveTo(50, 60);
+	window->Unlock();
+	Settle(window);
+	window->Lock();
+	EXPECT_EQ(window->Frame(), BRect(50, 60, 250, 160));
+	EXPECT_EQ(window->DecoratorFrame(), window->Frame());
+	EXPECT_EQ(std::count(window->log.begin(), window->log.end(), "moved"), 1);
+	window->Unlock();
+	Quit(window);
+}
+
+
+TEST_F(WindowTest, AMoveOfTheUserOutlivesASizeThatTheProgramAsksFor)
+{
+	auto* window = new HookWindow;
+	window->Show();
+	window->Lock();
+	window->log.clear();
+	BPrivate::WindowData::Of(window).host->InjectFrame(BRect(10, 20, 210, 120));
+	window->ResizeTo(250, 150);
+	window->Unlock();
+	Settle(window);
+	window->Lock();
+	EXPECT_EQ(window->Frame(), BRect(10, 20, 260, 170));
+	EXPECT_EQ(window->DecoratorFrame(), window->Frame());
 	EXPECT_EQ(std::count(window->log.begin(), window->log.end(), "moved"), 1);
 	EXPECT_EQ(std::count(window->log.begin(), window->log.end(), "resized"), 1);
 	window->Unlock();
