@@ -127,10 +127,37 @@ class Session:
         self.click(540, 360, "Early")
         self.one.tell("where Early")
         self.one.expect_exactly("Early at 520,340 to 919,639")
-        told = [line for line in self.one.lines() if line.startswith(("Early moved", "Early resized"))]
-        asked = ["Early moved 520,300", "Early moved 520,340", "Early resized 399,149", "Early resized 399,299"]
-        check(told == asked, f"of frames it was told {told}")
+        self.check_told_of_requests("Early")
         self.close("Early")
+
+    def check_told_of_requests(self, title):
+        told = [line for line in self.one.lines() if line.startswith((f"{title} moved", f"{title} resized"))]
+        asked = ["moved 520,300", "moved 520,340", "resized 399,149", "resized 399,299"]
+        check(told == [f"{title} {one}" for one in asked], f"of frames it was told {told}")
+
+    def crossing(self):
+        """What others do with a window meets on its way what its program asks for."""
+        title = "Crossing"
+        window = self.open(title, 300, 300)
+        self.click(320, 320, title)
+        with self.desktop.sleeping_manager():
+            self.desktop.xdotool("windowmove", window, 100, 100)
+            self.one.ask(f"frame {title} 520 340 400 300", f"placed {title}")
+        wait_for("the window is where it was placed", lambda: self.desktop.geometry(window) == (520, 340, 400, 300))
+        self.click(540, 360, title)
+        self.check_told_of_requests(title)
+
+        # It asks for a size only, so that the place is the others'.
+        with self.desktop.sleeping_manager():
+            self.one.tell(f"limits {title} 249 249")
+            self.one.expect_all(f"limited {title}", f"{title} resized 249,249")
+            self.desktop.xdotool("windowmove", window, 200, 200)
+        self.one.expect_exactly(f"{title} moved 200,200")
+        wait_for("the window has the size", lambda: self.desktop.geometry(window) == (200, 200, 250, 250))
+        self.click(420, 420, title)
+        self.one.tell(f"where {title}")
+        self.one.expect_exactly(f"{title} at 200,200 to 449,449")
+        self.close(title)
 
     def behind(self):
         for place, title in enumerate(("Low", "Middle", "High")):
@@ -148,7 +175,7 @@ class Session:
 def use_windows(desktop, program, _):
     session = Session(desktop, program)
     for part in (session.modal, session.modal_above, session.floating, session.flags, session.early,
-                 session.behind):
+                 session.crossing, session.behind):
         part()
         print(part.__name__, "done", flush=True)
 
