@@ -15,6 +15,7 @@ import sys
 from design_on_x import Form
 from plimworks_on_x import FILE_MENU, GENERATED, QUESTION, Session
 from xdesktop import AWAY, wait_for
+from xinput import Input
 from xtest import check, run, step
 
 WHOLE_LIMIT = 220
@@ -65,6 +66,7 @@ class Designer(Session):
 
     def __init__(self, *arguments):
         super().__init__(*arguments)
+        self.input = Input(self.desktop)
         self.pictures_so_far = 0
         self.places = {}
         self.seen = 0
@@ -92,13 +94,15 @@ class Designer(Session):
     # Windows
 
     def drag_frame(self, window, grip, distance):
-        """Holds the pointer until the window manager has followed it."""
+        """Holds the pointer until the window manager has followed it, and keeps it there until that lets go of it."""
         before = self.desktop.xdotool("getwindowgeometry", window)
         end = (grip[0] + distance[0], grip[1] + distance[1])
         self.desktop.xdotool("mousemove", *grip, "mousedown", 1, "mousemove", *end)
         wait_for("the window follows the pointer",
                  lambda: self.desktop.xdotool("mousemove", *end, "getwindowgeometry", window) != before)
-        self.desktop.xdotool("mouseup", 1, "mousemove", *AWAY)
+        self.desktop.xdotool("mouseup", 1)
+        self.input.wait_until_let_go()
+        self.desktop.xdotool("mousemove", *AWAY)
 
     def move_window(self, window, place):
         """By its title bar."""
@@ -162,7 +166,8 @@ class Designer(Session):
         """A double click on the row, which the window tells by a message of the code."""
         self.listen()
         place = (INSPECTOR[0] + first[0], INSPECTOR[1] + first[1] + row * ROW)
-        self.desktop.xdotool("mousemove", *place, "click", "--repeat", 2, "--delay", 20, 1, "mousemove", *AWAY)
+        self.input.double_click(*place)
+        self.desktop.xdotool("mousemove", *AWAY)
         self.expect_told(f"BMessage({code})")
 
     def edit(self, kind, picture=None, **values):

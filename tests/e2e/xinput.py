@@ -12,6 +12,7 @@ BUTTON, BUTTON_MASK = 1, 0x100
 # XWindowAttributes as ints, with room to spare: five of them, three pointers and a number come before the place of the
 # state of mapping.
 ATTRIBUTES, MAP_STATE, VIEWABLE = ctypes.c_int * 64, 23, 2
+ASYNCHRONOUS, GRAB_SUCCESS = 1, 0
 POINTER_ROOT = 1  # in place of a window: none has the focus by itself
 NAMED_KEYS = {"ctrl": "Control_L", "shift": "Shift_L", "alt": "Alt_L"}
 
@@ -58,6 +59,26 @@ class Input:
         self.press(True)
         self.press(False)
         wait_for("the button is released", lambda: not self.is_pressed())
+
+    def double_click(self, x, y):
+        """Its presses are no longer apart than the server needs, however busy the machine is."""
+        self.move(x, y)
+        for down in (True, False, True, False):
+            self.press(down)
+        wait_for("the button is released", lambda: not self.is_pressed())
+
+    def wait_until_let_go(self):
+        """Until no other program holds the pointer: a window manager that moves a window follows it up to then, even when
+        the button is up already."""
+        def can_be_held():
+            held = self.x.XGrabPointer(
+                self.display, self.root, 0, 0, ASYNCHRONOUS, ASYNCHRONOUS, ctypes.c_ulong(0), ctypes.c_ulong(0),
+                ctypes.c_ulong(0))
+            if held == GRAB_SUCCESS:
+                self.x.XUngrabPointer(self.display, ctypes.c_ulong(0))
+                self.flush()
+            return held == GRAB_SUCCESS
+        wait_for("the pointer is let go", can_be_held)
 
     # Keys
 
