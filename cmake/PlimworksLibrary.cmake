@@ -9,7 +9,8 @@
 # The library is built into the folder Components of the build folder (Plimworks_OUTPUT_DIR says another one), which
 # plimgen --components takes, and is installed where the designer looks for it: into Plimworks_COMPONENTS_DIR, with the
 # headers in Plimworks_RUNTIME_DIR, where generated programs find them beside <Ormi.h>. The target NAME_runtime is for
-# programs in the same project that use the headers before they are installed.
+# programs in the same project that use the headers before they are installed. Plimworks_LIBRARY_COMPONENT and
+# Plimworks_RUNTIME_COMPONENT, where they are set, name the components of the installation that the two belong to.
 #
 # The library tells the designer what it was built for: one with other classes leaves it out and says so.
 
@@ -36,7 +37,11 @@ function(plimworks_add_component_library name)
   endif()
   set_target_properties(${name} PROPERTIES PREFIX "" LIBRARY_OUTPUT_DIRECTORY ${output}
     INSTALL_RPATH "${Plimworks_COMPONENTS_RPATH}")
-  install(TARGETS ${name} LIBRARY DESTINATION ${Plimworks_COMPONENTS_DIR})
+  set(component "")
+  if(Plimworks_LIBRARY_COMPONENT)
+    set(component COMPONENT ${Plimworks_LIBRARY_COMPONENT})
+  endif()
+  install(TARGETS ${name} LIBRARY DESTINATION ${Plimworks_COMPONENTS_DIR} ${component})
 
   if(arg_RUNTIME)
     get_filename_component(runtime ${arg_RUNTIME} ABSOLUTE)
@@ -44,6 +49,11 @@ function(plimworks_add_component_library name)
     target_include_directories(${name}_runtime INTERFACE ${runtime})
     target_link_libraries(${name}_runtime INTERFACE Ormi::ormi)
     target_include_directories(${name} PRIVATE ${runtime})
-    install(DIRECTORY ${runtime}/ DESTINATION ${Plimworks_RUNTIME_DIR} FILES_MATCHING PATTERN "*.h")
+    set(component "")
+    if(Plimworks_RUNTIME_COMPONENT)
+      set(component COMPONENT ${Plimworks_RUNTIME_COMPONENT})
+    endif()
+    install(DIRECTORY ${runtime}/ DESTINATION ${Plimworks_RUNTIME_DIR} ${component}
+      FILES_MATCHING PATTERN "*.h")
   endif()
 endfunction()

@@ -128,7 +128,7 @@ TEST(DisplayChoiceTest, WithoutTheModuleBesideTheLibraryNothingIsShown)
 	auto folder =
 		std::filesystem::temp_directory_path() / ("display-choice-" + std::to_string(getpid()));
 	std::filesystem::create_directories(folder);
-	std::filesystem::copy_file(BE_LIBRARY, folder / "libbe.so");
+	std::filesystem::copy_file(BE_LIBRARY, folder / std::filesystem::path(BE_LIBRARY).filename());
 	Result result = RunProgram("LD_LIBRARY_PATH=" + folder.string());
 	std::filesystem::remove_all(folder);
 	EXPECT_EQ(result.code, 0) << result.output;
