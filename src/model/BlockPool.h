@@ -15,8 +15,8 @@ public:
 	/// A block of \a size bytes, aligned for everything. Throws std::bad_alloc without memory.
 	static void* Allocate(size_t size);
 
-	/// Whether \a block came from Allocate(), as far as it is known: false for a large one, and for all under the
-	/// sanitizers.
+	/// Whether \a block came from Allocate(), as far as it is known: false for a large one. Under the sanitizers whether
+	/// a block of the heap begins there.
 	static bool Owns(const void* block);
 
 	/// Takes back a block of Allocate(); null is ignored.
