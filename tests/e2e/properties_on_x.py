@@ -23,8 +23,8 @@ WHOLE_LIMIT = 280
 STRING, MODAL, _, PICK = range(4)  # types of editors, as numbers in what property_program prints
 MENU = "mnuPickEdit"
 ROW = 15  # the height of a row in the property window
-# Codes of the messages that the property window prints.
-SELECTED, TYPED = "0x8", "0x5"
+# Code of a message that the property window prints.
+SELECTED = "0x8"
 # On the form, and in the property window: places without a component, and the first tab.
 GROUND = (127, 5)
 PROPERTIES_TAB = (20, 8)
@@ -146,21 +146,21 @@ class Designer(Watched):
         wait_for(f"{count} messages {code}", lambda: sum(
             line.startswith(f"BMessage({code})") for line in self.lines()[before:]) >= count)
 
-    def enter(self, type_it):
-        """Types a text and Return, until the property window takes it.
+    def enter(self, type_it, name, text):
+        """Types a text and Return, until the property has it.
 
         The window of a form that was moved tells of its new frame a little later. Then the values are shown anew, and
-        what is being typed is lost: it is typed again, as often as it takes."""
+        what is being typed is lost, or the value of before is taken: it is typed again, as often as it takes."""
         before = len(self.lines())
 
-        def is_taken():
+        def is_set():
             type_it()
-            return self.has_come(TYPED, before)
-        wait_for("a text is taken", is_taken)
+            return self.is_told(f"::SetPropertyValue('{name}', '{text}')", before)
+        wait_for(f"{name} is {text}", is_set)
 
-    def has_come(self, code, before):
+    def is_told(self, text, before):
         end = time.monotonic() + PATIENCE
-        while not any(line.startswith(f"BMessage({code})") for line in self.lines()[before:]):
+        while not any(line.endswith(text) for line in self.lines()[before:]):
             if time.monotonic() > end:
                 return False
             time.sleep(0.002)
@@ -231,7 +231,7 @@ class Mouse:
         self.designer.wait_for_messages(SELECTED, before)
         self.selected = row
 
-    def type(self, row, text):
+    def type(self, row, name, text):
         self.select(row)
 
         def type_it():
@@ -240,7 +240,7 @@ class Mouse:
             self.input.key("End", "shift+Home")
             self.input.type(text)
             self.input.key("Return")
-        self.designer.enter(type_it)
+        self.designer.enter(type_it, name, text)
 
     def pick(self, row, one, choice):
         self.select(row)
@@ -290,7 +290,7 @@ class Keys:
         self.input.key("Tab")
         self.selected = row
 
-    def type(self, row, text):
+    def type(self, row, name, text):
         self.select(row)
 
         def type_it():
@@ -298,7 +298,7 @@ class Keys:
             self.input.key("Escape")
             self.input.type(text)
             self.input.key("Return")
-        self.designer.enter(type_it)
+        self.designer.enter(type_it, name, text)
         self.input.key("shift+Tab")
 
     def pick(self, row, one, choice):
@@ -338,7 +338,7 @@ def edit_all(designer, hand, component):
     for row, one in enumerate(component.properties):
         if one.type == STRING:
             text = one.new_text(designer.turn)
-            hand.type(row, text)
+            hand.type(row, one.name, text)
             one.value = text
         elif one.type == PICK:
             choice = one.next_choice()

@@ -9,6 +9,7 @@ import sys
 
 from exchange import Program, check, main
 from xdesktop import wait_for
+from xinput import Input
 
 TITLED, MODAL_LOOK, FLOATING_LOOK = 1, 3, 7
 NORMAL, MODAL_APP, FLOATING_APP = 0, 1, 4
@@ -19,6 +20,7 @@ SIZE = 150
 class Session:
     def __init__(self, desktop, program):
         self.desktop = desktop
+        self.input = Input(desktop)
         self.one = Program(desktop, [program], "one")
         self.two = Program(desktop, [program], "two")
         for each in (self.one, self.two):
@@ -29,8 +31,11 @@ class Session:
         return self.desktop.wait_for_window(title)
 
     def click(self, x, y, answer, program=None):
-        """A click that a window has to get before anything else is pressed."""
+        """A click that a window has to get before anything else is pressed. The window manager may still have to bring it
+        to the front, or to its place."""
         program = program or self.one
+        wait_for(f"{answer} is at {x}, {y}", lambda: any(
+            self.input.is_at(window, x, y) for window in self.desktop.windows(answer)))
         since = program.seen
         self.desktop.click(x, y)
         program.expect(f"{answer} released")

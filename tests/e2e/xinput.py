@@ -155,5 +155,16 @@ class Input:
         found = self.x.XGetWindowAttributes(self.display, ctypes.c_ulong(window), ctypes.byref(attributes))
         return found and attributes[MAP_STATE] == VIEWABLE
 
+    def is_at(self, window, x, y):
+        """Whether a click there reaches the window."""
+        numbers = [ctypes.c_int() for _ in range(2)]
+        inside, found = self.root, ctypes.c_ulong()
+        while self.x.XTranslateCoordinates(
+                self.display, self.root, inside, int(x), int(y), *map(ctypes.byref, [*numbers, found])) and found.value != 0:
+            if found.value == window:
+                return True
+            inside = ctypes.c_ulong(found.value)
+        return False
+
     def wait_until_shown(self, title):
         wait_for(f"a window \"{title}\" is shown", lambda: self.is_shown(title))
