@@ -23,7 +23,7 @@ from picture import Picture
 LIMIT = 40
 # Between two looks at what is waited for; most things come soon.
 SHORTEST_PAUSE, LONGEST_PAUSE = 0.001, 0.02
-TOOLS = ("Xvfb", "openbox", "xdotool", "xclip")
+TOOLS = ("Xvfb", "openbox", "xdotool", "xclip", "xsetroot")
 PR_SET_PDEATHSIG = 1
 AWAY = (1000, 740)
 # The default theme and all keys would be the user's; a few keys are enough.
@@ -39,6 +39,8 @@ WINDOW_MANAGER_SETTINGS = """<?xml version="1.0" encoding="UTF-8"?>
   </keyboard>
 </openbox_config>
 """
+
+DESKTOP_COLOUR = "#51718f"
 
 
 class Failure(Exception):
@@ -154,6 +156,8 @@ class Desktop:
             return self.try_xdotool("get_desktop") is not None
 
         wait_for("a window manager that manages", manages)
+        # The pictures of tests are also those of the documentation.
+        self.run(["xsetroot", "-solid", DESKTOP_COLOUR])
 
     @contextlib.contextmanager
     def sleeping_manager(self):
