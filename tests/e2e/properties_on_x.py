@@ -31,7 +31,7 @@ PROPERTIES_TAB = (20, 8)
 TALL = (200, 590)
 PROJECT_PLACE = (250, 560)
 PATIENCE = 5  # seconds, before a text is typed again
-DIALOGS = {"WindowFlags": "Window Flags", "Flags": "View Flags", "Zones": "Zones"}
+DIALOGS = {"WindowFlags": "Window Flags", "Flags": "View Flags"}
 # In the dialog of colours: from the middle of the control, into the second ramp.
 RAMP_RIGHT, RAMP_DOWN = 60, -10
 
@@ -50,8 +50,6 @@ class Property:
             return str(int(self.value) + turn)
         if self.name in ("Right", "Bottom"):
             return str(int(self.value) + 2 * turn)
-        if self.name == "Time":
-            return f"0{turn}:30:15"
         if self.name == "Name":
             return f"{self.value}_{turn}"
         return f"1{turn}" if self.is_number else f"Text {turn}|{self.name}"
@@ -175,11 +173,6 @@ class Designer(Watched):
             return next((match for match in matches if match), None)
         return wait_for(f"{name} is set", found).group(1)
 
-    def add_zone(self):
-        """Types a zone before the others, where the dialog begins."""
-        self.input.type(f"{self.turn}..{self.turn + 1} {{1,2,3,255}}")
-        self.input.key("Return")
-
     # Saving
 
     def times_of_files(self):
@@ -257,8 +250,6 @@ class Mouse:
             x, y = place(one.dialog, "ccColors")
             is_middling = one.value.startswith("{1")
             self.input.click(x + (RAMP_RIGHT if is_middling else -RAMP_RIGHT), y + RAMP_DOWN)
-        elif one.dialog == "Zones":
-            self.designer.add_zone()
         else:
             self.input.click(*place(one.dialog, "Frame events" if one.name == "Flags" else "Not closable"))
         self.input.click(*place(one.dialog, "btnOK"))
@@ -314,13 +305,6 @@ class Keys:
         self.select(row)
         self.input.key("space")
         self.input.wait_for_active(one.dialog)
-        if one.dialog == "Zones":
-            # The text takes Return, the tab goes on to the buttons.
-            self.designer.add_zone()
-            self.input.key("Tab", "Tab", "Return")
-            self.designer.wait_until_dialog_closed()
-            self.input.key("shift+Tab")
-            return
         # The first press shows that Escape changes nothing.
         self.input.key("Tab", *(["Right"] * 3 if one.dialog == "Color" else ["space"]), "Escape")
         self.designer.wait_until_dialog_closed()
