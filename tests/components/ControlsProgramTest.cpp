@@ -22,11 +22,11 @@
 #include "model/AppComponent.h"
 #include "model/Event.h"
 #include "model/Property.h"
-#include "palette/LibraryLoader.h"
 #include "palette/PaletteCatalog.h"
 #include "palette/PaletteEntry.h"
 #include "support/CapturedOutput.h"
 #include "support/Command.h"
+#include "support/ComponentLibraries.h"
 #include "support/Printers.h"
 #include "support/Robot.h"
 #include "support/TemporaryFolder.h"
@@ -106,7 +106,7 @@ protected:
 	ControlsProgramTest()
 	{
 		CapturedOutput output;
-		TLibraryLoader(&PaletteCatalog()).LoadFolder(PLIM_BUILD_DIR "/bin/Components");
+		LoadComponentLibraries();
 		fApp.SetPropertyValue("Name", "Controls");
 		fApp.SetPropertyValue("GenerationPath", fFolder.Path().c_str());
 		fForm = new TDesignForm("Form1", FORM_SHOWN);

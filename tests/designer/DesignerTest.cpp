@@ -9,10 +9,10 @@
 #include <Message.h>
 
 #include "model/ViewComponent.h"
-#include "palette/LibraryLoader.h"
 #include "palette/PaletteCatalog.h"
 #include "palette/PaletteEntry.h"
 #include "support/CapturedOutput.h"
+#include "support/ComponentLibraries.h"
 #include "support/TracerComponent.h"
 
 namespace {
@@ -45,7 +45,7 @@ DesignerTest::SetUpTestSuite()
 		return;
 
 	CapturedOutput output;
-	TLibraryLoader(&PaletteCatalog()).LoadFolder(PLIM_BUILD_DIR "/bin/Components");
+	LoadComponentLibraries();
 	PaletteCatalog().AddPalEntry(&sNone);
 	PaletteCatalog().AddPalEntry(&sTracer);
 }

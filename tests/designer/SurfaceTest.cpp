@@ -16,10 +16,10 @@
 #include "app/WindowGuard.h"
 #include "model/Property.h"
 #include "palette/ComponentPalette.h"
-#include "palette/LibraryLoader.h"
 #include "palette/PaletteCatalog.h"
 #include "palette/PaletteEntry.h"
 #include "project/Project.h"
+#include "support/ComponentLibraries.h"
 
 extern "C" int32 be_count_lock_violations();
 
@@ -70,7 +70,7 @@ SurfaceTest::SurfaceTest()
 	sAnswer = 0;
 	SetMessageBoxHook(NoteBox);
 	if (PaletteCatalog().CountPalEntries() == 0)
-		TLibraryLoader(&PaletteCatalog()).LoadFolder(PLIM_BUILD_DIR "/bin/Components");
+		LoadComponentLibraries();
 	PaletteCatalog().SetDropEntry(nullptr);
 
 	std::mutex lock;

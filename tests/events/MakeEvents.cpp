@@ -283,12 +283,14 @@ WriteList(const std::filesystem::path& folder, const std::vector<project_event>&
 
 
 int
-Make(const char* components, const std::filesystem::path& folder, source_dialect dialect)
+Make(char** components, const std::filesystem::path& folder, source_dialect dialect)
 {
-	TLibraryLoader loader(&PaletteCatalog());
-	if (loader.LoadFolder(components) != B_OK || loader.CountEntries() == 0) {
-		fprintf(stderr, "%s: no component library can be loaded from here\n", components);
-		return 1;
+	for (; *components != nullptr; components++) {
+		TLibraryLoader loader(&PaletteCatalog());
+		if (loader.LoadFolder(*components) != B_OK || loader.CountEntries() == 0) {
+			fprintf(stderr, "%s: no component library can be loaded from here\n", *components);
+			return 1;
+		}
 	}
 	// What is there would be kept.
 	for (const char* name : {"Events", "Main", "Note"}) {
@@ -316,12 +318,12 @@ int
 main(int argc, char** argv)
 {
 	source_dialect dialect;
-	if (argc != 4 || !FindDialect(argv[3], &dialect)) {
-		fprintf(stderr, "usage: %s COMPONENTS_FOLDER FOLDER classic|standard\n", argv[0]);
+	if (argc < 4 || !FindDialect(argv[2], &dialect)) {
+		fprintf(stderr, "usage: %s FOLDER classic|standard COMPONENTS_FOLDER...\n", argv[0]);
 		return 2;
 	}
 	setenv("BE_DISPLAY", "none", 1);
 	AppSettings.LeaveFileAlone();
 	BApplication app("application/x-vnd.Plimworks-MakeEvents");
-	return Make(argv[1], argv[2], dialect);
+	return Make(argv + 3, argv[1], dialect);
 }

@@ -16,11 +16,11 @@
 #include "model/AppComponent.h"
 #include "model/Event.h"
 #include "model/Property.h"
-#include "palette/LibraryLoader.h"
 #include "palette/PaletteCatalog.h"
 #include "palette/PaletteEntry.h"
 #include "project/Project.h"
 #include "support/Command.h"
+#include "support/ComponentLibraries.h"
 #include "support/TemporaryFolder.h"
 
 namespace {
@@ -148,8 +148,8 @@ class GeneratedCodeTest : public testing::Test {
 protected:
 	GeneratedCodeTest()
 	{
-		TLibraryLoader loader(&PaletteCatalog());
-		EXPECT_EQ(loader.LoadFolder(PLIM_BUILD_DIR "/bin/Components"), B_OK);
+		LoadComponentLibraries();
+		EXPECT_NE(PaletteCatalog().CountPalEntries(), 0);
 	}
 
 	BApplication fApplication{"application/x-vnd.plimworks-ormi-test"};

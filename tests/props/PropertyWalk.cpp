@@ -12,10 +12,10 @@
 #include "designer/DesignFormView.h"
 #include "model/ColorText.h"
 #include "model/PropertyStore.h"
-#include "palette/LibraryLoader.h"
 #include "palette/PaletteCatalog.h"
 #include "props/StringList.h"
 #include "props/StringProperty.h"
+#include "support/ComponentLibraries.h"
 
 namespace {
 
@@ -63,7 +63,7 @@ PropertyWalk::SetUp()
 {
 	PropertyWinTest::SetUp();
 	if (PaletteCatalog().CountPalEntries() == 0)
-		TLibraryLoader(&PaletteCatalog()).LoadFolder(PLIM_BUILD_DIR "/bin/Components");
+		LoadComponentLibraries();
 	RenewForm();
 }
 
