@@ -113,9 +113,10 @@ public:
 	/// Device pixels for each of the API's: 1, 1.5, 2, ... What the canvas must be made with.
 	virtual float Scale() const = 0;
 
-	/// Shows what \a canvas has in \a region (window coordinates). Copies the pixels under a short lock
-	/// and returns; the picture is kept, so that the host needs nobody to show it again. A canvas of
-	/// another size or scale than the last one is shown whole.
+	/// Shows what \a canvas, of Display::MakeCanvas() with a scale, has in \a region (window coordinates):
+	/// all that was drawn since it was presented last; the canvas need not keep the rest. Copies the
+	/// pixels under a short lock and returns; the picture is kept, so that the host needs nobody to show
+	/// it again. Another canvas than the last one is shown whole.
 	virtual void Present(const Canvas& canvas, const BRegion& region) = 0;
 	/// Waits until the display has shown what was presented.
 	virtual void Sync() = 0;

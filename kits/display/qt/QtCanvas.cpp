@@ -49,8 +49,8 @@ QtCanvas::QtCanvas(QtFonts& fonts, int32 width, int32 height, float scale)
 	fBuffer.width = static_cast<int32>(std::lround(fWidth * fScale));
 	fBuffer.height = static_cast<int32>(std::lround(fHeight * fScale));
 	fBuffer.bytesPerRow = fBuffer.width * 4;
-	fPixels.assign(static_cast<size_t>(fBuffer.width) * fBuffer.height, 0xffffffff);
-	fBuffer.bits = fPixels.data();
+	fPixels = std::make_shared<WindowPixels>(static_cast<size_t>(fBuffer.width) * fBuffer.height);
+	fBuffer.bits = fPixels->Drawn();
 	SetClip(nullptr);
 	SetState(CanvasState());
 }

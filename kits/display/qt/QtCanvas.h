@@ -4,12 +4,14 @@
 #define DISPLAY_QT_CANVAS_H
 
 #include <algorithm>
+#include <memory>
 #include <vector>
 
 #include <QRect>
 
 #include "display/Canvas.h"
 #include "display/PixelBuffer.h"
+#include "display/WindowPixels.h"
 #include "display/qt/Blend.h"
 
 class QPainterPath;
@@ -58,6 +60,8 @@ public:
 
 	/// The device pixels.
 	const PixelBuffer& Buffer() const { return fBuffer; }
+	/// What they are in; null when they are somebody else's.
+	const std::shared_ptr<WindowPixels>& Pixels() const { return fPixels; }
 	/// The device pixels of a rect of whole pixels of the API.
 	QRect DeviceRect(int left, int top, int right, int bottom) const;
 
@@ -98,7 +102,7 @@ private:
 	QPainterPath PathOf(const CanvasPath& path) const;
 
 	QtFonts& fFonts;
-	std::vector<uint32> fPixels;
+	std::shared_ptr<WindowPixels> fPixels;
 	PixelBuffer fBuffer;
 	const int32 fWidth;
 	const int32 fHeight;
@@ -117,6 +121,8 @@ QtCanvas::ForEachSpan(const QRect& device, Function function)
 {
 	if (!device.intersects(fClipBounds))
 		return;
+	if (fPixels != nullptr)
+		fPixels->Begin();
 	for (const QRect& clip : fClip) {
 		const int left = std::max(clip.left(), device.left());
 		const int right = std::min(clip.right(), device.right());

@@ -6,12 +6,12 @@
 #include <cmath>
 #include <optional>
 
+#include <QBackingStore>
 #include <QGuiApplication>
 #include <QKeyEvent>
 #include <QMouseEvent>
 #include <QPainter>
 #include <QScreen>
-#include <QTimer>
 #include <QWheelEvent>
 
 #include <AppDefs.h>
@@ -35,6 +35,8 @@ const int kWheelStep = 120;
 const int kLargestSize = 32767;
 // Milliseconds.
 const int kZoomDelay = 100;
+// Without a change for so long a window gives memory back.
+const int kRestDelay = 1000;
 
 
 BPoint
@@ -124,7 +126,6 @@ PaintOverlay(QPainter& painter, const InputOverlay& overlay, BPoint leftTop)
 QtWindow::QtWindow(QtDisplay& display, std::shared_ptr<Surface> surface, StackedWindow* stacked)
 	: scale(1),
 	  fDisplay(display),
-	  fBackingStore(this),
 	  fSurface(std::move(surface)),
 	  fStacked(stacked),
 	  fIsMinimized(false),
@@ -136,7 +137,12 @@ QtWindow::QtWindow(QtDisplay& display, std::shared_ptr<Surface> surface, Stacked
 	Apply(stacked->style);
 	setGeometry(GeometryOf(stacked->frame));
 	scale = static_cast<float>(devicePixelRatio());
+	fRestTimer.setSingleShot(true);
+	QObject::connect(&fRestTimer, &QTimer::timeout, this, [this] { Rest(); });
 }
+
+
+QtWindow::~QtWindow() = default;
 
 
 BRect
@@ -371,6 +377,7 @@ void
 QtWindow::ShowDamage()
 {
 	QRegion damage = fSurface->TakeDamage();
+	PlanRest();
 	if (!damage.isEmpty() && isExposed())
 		Paint(damage);
 }
@@ -383,14 +390,19 @@ QtWindow::Paint(const QRegion& wanted)
 	QRegion region = wanted & all;
 	if (region.isEmpty())
 		return;
-	if (fBackingStore.size() != size()) {
-		fBackingStore.resize(size());
+	PlanRest();
+	// After a rest the host still has the other parts; for the first picture it has asked for all of them.
+	if (fBackingStore == nullptr) {
+		fBackingStore = std::make_unique<QBackingStore>(this);
+		fBackingStore->resize(size());
+	} else if (fBackingStore->size() != size()) {
+		fBackingStore->resize(size());
 		region = all;
 	}
 
 	InputOverlay overlay = fDisplay.Hub().Overlay();
-	fBackingStore.beginPaint(region);
-	QPaintDevice* device = fBackingStore.paintDevice();
+	fBackingStore->beginPaint(region);
+	QPaintDevice* device = fBackingStore->paintDevice();
 	if (device != nullptr) {
 		QPainter painter(device);
 		painter.setClipRegion(region);
@@ -403,8 +415,33 @@ QtWindow::Paint(const QRegion& wanted)
 		});
 		PaintOverlay(painter, overlay, fDisplay.Hub().Frame(fStacked).LeftTop());
 	}
-	fBackingStore.endPaint();
-	fBackingStore.flush(region);
+	fBackingStore->endPaint();
+	fBackingStore->flush(region);
+}
+
+
+// Not a timer started anew for every change: that would cost more than the change.
+void
+QtWindow::PlanRest()
+{
+	fLastChange.start();
+	if (!fRestTimer.isActive())
+		fRestTimer.start(kRestDelay);
+}
+
+
+void
+QtWindow::Rest()
+{
+	const qint64 left = kRestDelay - fLastChange.elapsed();
+	if (left > 0) {
+		fRestTimer.start(static_cast<int>(left));
+		return;
+	}
+	fSurface->Rest();
+	// An X server has its own picture of the window by now, and takes any part of it anew; others show this one.
+	if (QGuiApplication::platformName() == QLatin1String("xcb"))
+		fBackingStore.reset();
 }
 
 

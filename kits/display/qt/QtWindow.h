@@ -6,12 +6,14 @@
 #include <atomic>
 #include <memory>
 
-#include <QBackingStore>
+#include <QElapsedTimer>
+#include <QTimer>
 #include <QWindow>
 
 #include "display/HostWindow.h"
 #include "display/SharedFrame.h"
 
+class QBackingStore;
 class QDragMoveEvent;
 class QDropEvent;
 class QMouseEvent;
@@ -26,6 +28,7 @@ struct StackedWindow;
 class QtWindow : public QWindow {
 public:
 	QtWindow(QtDisplay& display, std::shared_ptr<Surface> surface, StackedWindow* stacked);
+	~QtWindow() override;
 
 	StackedWindow* Stacked() const { return fStacked; }
 	void Apply(const HostWindowStyle& style);
@@ -66,6 +69,8 @@ protected:
 private:
 	void AskHost();
 	void HostAnswered();
+	void PlanRest();
+	void Rest();
 	void GeometryChanged();
 	void ApplyLimits();
 	void HandleMouse(QMouseEvent* event);
@@ -75,8 +80,11 @@ private:
 	void HandleDrop(QDropEvent* event);
 
 	QtDisplay& fDisplay;
-	QBackingStore fBackingStore;
+	/// What is on its way to the host. Null before the first painting, and after a rest.
+	std::unique_ptr<QBackingStore> fBackingStore;
 	std::shared_ptr<Surface> fSurface;
+	QElapsedTimer fLastChange;
+	QTimer fRestTimer;
 	StackedWindow* fStacked;
 	HostWindowStyle fStyle;
 	HostSizeLimits fLimits;

@@ -6,6 +6,7 @@
 
 #include <Region.h>
 
+#include "display/WindowPixels.h"
 #include "display/qt/QtCanvas.h"
 
 namespace BPrivate {
@@ -15,13 +16,19 @@ Surface::Take(const QtCanvas& canvas, const BRegion& region)
 {
 	const PixelBuffer& buffer = canvas.Buffer();
 	QRect all(0, 0, buffer.width, buffer.height);
+	const std::shared_ptr<WindowPixels>& pixels = canvas.Pixels();
+	if (pixels == nullptr)
+		return false;
 
 	std::lock_guard<std::mutex> lock(fMutex);
 	bool wasClean = fDamage.isEmpty();
-	if (fImage.size() != all.size() || fImage.devicePixelRatio() != canvas.Scale()) {
-		fImage = QImage(all.size(), QImage::Format_RGB32);
+	if (fPixels != pixels) {
+		fImage = QImage(reinterpret_cast<uchar*>(pixels->Finished()), buffer.width, buffer.height,
+			buffer.bytesPerRow, QImage::Format_RGB32);
 		fImage.setDevicePixelRatio(canvas.Scale());
+		fPixels = pixels;
 		CopyRect(buffer, all);
+		fPixels->End();
 		fDamage = QRegion(0, 0, canvas.Width(), canvas.Height());
 		return wasClean;
 	}
@@ -34,6 +41,7 @@ Surface::Take(const QtCanvas& canvas, const BRegion& region)
 		CopyRect(buffer, device);
 		fDamage += QRect(QPoint(rect.left, rect.top), QPoint(rect.right, rect.bottom));
 	}
+	fPixels->End();
 	return wasClean && !fDamage.isEmpty();
 }
 
@@ -71,6 +79,15 @@ Surface::Copy() const
 		picture.pixels.insert(picture.pixels.end(), row, row + picture.width);
 	}
 	return picture;
+}
+
+
+void
+Surface::Rest()
+{
+	std::lock_guard<std::mutex> lock(fMutex);
+	if (fPixels != nullptr)
+		fPixels->Rest();
 }
 
 } // namespace BPrivate

@@ -3,6 +3,7 @@
 #ifndef DISPLAY_QT_SURFACE_H
 #define DISPLAY_QT_SURFACE_H
 
+#include <memory>
 #include <mutex>
 
 #include <QImage>
@@ -15,6 +16,7 @@ class BRegion;
 namespace BPrivate {
 
 class QtCanvas;
+class WindowPixels;
 
 /// Any thread; the lock is held while pixels are copied, and no longer.
 class Surface {
@@ -36,11 +38,16 @@ public:
 
 	Picture Copy() const;
 
+	/// Nothing has changed for a while: gives back memory that drawing needs and showing does not.
+	void Rest();
+
 private:
 	void CopyRect(const PixelBuffer& from, const QRect& device);
 
 	mutable std::mutex fMutex;
-	/// Device pixels; its device pixel ratio is the canvas's scale.
+	/// The last canvas's; it may be gone.
+	std::shared_ptr<WindowPixels> fPixels;
+	/// The finished ones of these. Device pixels; its device pixel ratio is the canvas's scale.
 	QImage fImage;
 	QRegion fDamage;
 };
