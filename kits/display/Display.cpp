@@ -11,6 +11,7 @@
 #include <dlfcn.h>
 
 #include "display/DisplayModule.h"
+#include "display/FontSettings.h"
 #include "display/NoneDisplay.h"
 #include "display/RobotScript.h"
 
@@ -50,6 +51,7 @@ StopModule()
 Display*
 StartModule()
 {
+	ReadFontSettingsAhead();
 	// Most functions of Qt that it refers to are never called: they are not looked up before they are.
 	void* module = dlopen(ModulePath().c_str(), RTLD_LAZY | RTLD_LOCAL);
 	if (module == nullptr) {

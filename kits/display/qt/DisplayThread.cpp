@@ -141,7 +141,9 @@ DisplayThread::Main(const std::string& platforms, const std::function<void()>& s
 	}
 	fCondition.notify_all();
 	if (succeeded)
-		QGuiApplication::exec();
+		// Not QGuiApplication's, which only offers Qt's own widgets to screen readers before: a connection to the
+		// session bus for windows that have none.
+		QCoreApplication::exec();
 
 	{
 		std::lock_guard<std::mutex> lock(fMutex);
@@ -190,7 +192,7 @@ DisplayThread::Post(std::function<void()> task)
 
 
 bool
-DisplayThread::Run(const std::function<void()>& task)
+DisplayThread::Run(const std::function<void()>& task, const std::function<void()>& meanwhile)
 {
 	if (IsCurrent()) {
 		task();
@@ -206,6 +208,8 @@ DisplayThread::Run(const std::function<void()>& task)
 	});
 	if (!isQueued)
 		return false;
+	if (meanwhile != nullptr)
+		meanwhile();
 
 	std::unique_lock<std::mutex> lock(fMutex);
 	fCondition.wait(lock, [&] { return waiting->isDone || fRefused; });

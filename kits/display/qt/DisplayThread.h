@@ -31,7 +31,8 @@ public:
 	bool Post(std::function<void()> task);
 
 	/// Runs \a task in the thread and waits for it. False when the thread ended before it was run.
-	bool Run(const std::function<void()>& task);
+	/// \a meanwhile runs here, before the waiting.
+	bool Run(const std::function<void()>& task, const std::function<void()>& meanwhile = nullptr);
 
 	/// In the thread itself, when the host's display broke away: refuses further tasks, lets go all who
 	/// wait, and never returns to the caller.

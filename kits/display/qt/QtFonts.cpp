@@ -15,6 +15,7 @@
 #include <QString>
 #include <QStringList>
 
+#include "display/FontSettings.h"
 #include "display/Utf8.h"
 #include "display/qt/Mask.h"
 
@@ -145,6 +146,7 @@ QtFonts::ReadFamilies()
 	if (fHasFamilies)
 		return;
 	fHasFamilies = true;
+	AwaitFontSettings();
 	for (const QString& name : QFontDatabase::families()) {
 		std::string utf8 = name.toStdString();
 		if (utf8.size() <= B_FONT_FAMILY_LENGTH && !QFontDatabase::isPrivateFamily(name))

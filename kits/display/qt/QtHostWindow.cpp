@@ -8,6 +8,7 @@
 #include <Region.h>
 #include <Window.h>
 
+#include "display/FontEngine.h"
 #include "display/qt/DisplayThread.h"
 #include "display/qt/QtCanvas.h"
 #include "display/qt/QtDisplay.h"
@@ -105,9 +106,18 @@ QtHostWindow::SetSizeLimits(const HostSizeLimits& limits)
 void
 QtHostWindow::Show()
 {
-	WithWindow([&](QtWindow& window) {
-		window.ShowWindow();
+	auto show = [&] {
+		if (fWindow == nullptr)
+			return;
+		fWindow->ShowWindow();
 		fDisplay.Hub().SetVisible(&fStacked, true);
+	};
+	// The first window's text needs the font, and looking for it takes as long as the host takes for the window.
+	fDisplay.Thread().Run(show, [&] {
+		uint16 family;
+		uint16 style;
+		float size;
+		fDisplay.Fonts().GetStandardFont(kPlainFont, &family, &style, &size);
 	});
 }
 
