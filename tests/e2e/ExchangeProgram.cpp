@@ -225,6 +225,8 @@ private:
 			SetFrame(words);
 		else if (command == "where")
 			PrintFrame(words);
+		else if (command == "sync")
+			Sync(words);
 		else if (command == "put") {
 			words >> name >> value;
 			std::string bytes = ContentOf(value);
@@ -307,6 +309,18 @@ private:
 		window->Unlock();
 		Print(
 			title + " at " + PointText(frame.LeftTop()) + " to " + PointText(frame.RightBottom()));
+	}
+
+	/// By then the display has done with what it was at.
+	void Sync(std::istringstream& words)
+	{
+		std::string title;
+		words >> title;
+		BWindow* window = fWindows[title];
+		window->Lock();
+		window->Sync();
+		window->Unlock();
+		Print("synced " + title);
 	}
 
 	void SendBehind(std::istringstream& words)

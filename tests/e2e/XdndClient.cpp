@@ -3,7 +3,8 @@
 //
 // usage: xdnd_client source LEFT TOP TYPE FILE    a press in its window of 60 by 60 pixels drags the file's
 //                                                 content as TYPE; at the end it prints "finished" or "refused"
-//        xdnd_client target LEFT TOP TYPE FILE    prints "dropped" when it has written what was dropped to FILE
+//        xdnd_client target LEFT TOP TYPE FILE    prints "answered" when it has accepted what is dragged over
+//                                                 it, and "dropped" when it has written what was dropped to FILE
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
@@ -272,11 +273,16 @@ private:
 	void Handle(const XClientMessageEvent& event)
 	{
 		auto source = static_cast<Window>(event.data.l[0]);
-		if (event.message_type == AtomFor("XdndEnter"))
+		if (event.message_type == AtomFor("XdndEnter")) {
 			Say("entered");
-		else if (event.message_type == AtomFor("XdndPosition"))
+			fHasAnswered = false;
+		} else if (event.message_type == AtomFor("XdndPosition")) {
 			SendTo(source, "XdndStatus", 1, 0, 0, static_cast<long>(AtomFor("XdndActionCopy")));
-		else if (event.message_type == AtomFor("XdndLeave"))
+			XSync(sDisplay, False);
+			if (!fHasAnswered)
+				Say("answered");
+			fHasAnswered = true;
+		} else if (event.message_type == AtomFor("XdndLeave"))
 			Say("left");
 		else if (event.message_type == AtomFor("XdndDrop")) {
 			fSource = source;
@@ -307,6 +313,7 @@ private:
 	const Atom fType;
 	const char* fFile;
 	Window fSource = None;
+	bool fHasAnswered = false;
 };
 
 } // namespace

@@ -53,6 +53,13 @@ class Session:
         if button_up:
             self.pointer("mouseup", 1)
 
+    def drag_to(self, program, title, start, end):
+        """Releases over another program when that has answered that it takes what is dragged: before, it is not given."""
+        self.drag(start, end, button_up=False)
+        program.expect_exactly(f"{title} entered {DRAGGED}")
+        program.ask(f"sync {title}", f"synced {title}")
+        self.pointer("mouseup", 1)
+
     def go(self, start, end):
         steps = 8
         for i in range(1, steps + 1):
@@ -80,13 +87,11 @@ class Session:
 
     def to_another_program(self):
         self.one.forget()
-        self.drag(self.place("One", 40, 40), self.place("Other", 70, 80))
-        self.other.expect_exactly(f"Other entered {DRAGGED}")
+        self.drag_to(self.other, "Other", self.place("One", 40, 40), self.place("Other", 70, 80))
         self.other.expect_exactly(f"Other dropped {DRAGGED} at 70,80 offset 5,6")
         self.check_nothing_else()
         # And back.
-        self.drag(self.place("Other", 40, 40), self.place("Two", 30, 20))
-        self.one.expect_exactly(f"Two entered {DRAGGED}")
+        self.drag_to(self.one, "Two", self.place("Other", 40, 40), self.place("Two", 30, 20))
         self.one.expect_exactly(f"Two dropped {DRAGGED} at 30,20 offset 5,6")
 
     def over_another_program(self):
@@ -162,8 +167,10 @@ class Session:
             received.unlink(missing_ok=True)
             target = Program(self.desktop, [self.client, "target", *TARGET, kind, received], f"{title} target")
             target.expect("ready")
-            self.drag(self.place(title, 40, 40), (TARGET[0] + 20, TARGET[1] + 20))
+            self.drag(self.place(title, 40, 40), (TARGET[0] + 20, TARGET[1] + 20), button_up=False)
             target.expect("entered")
+            target.expect("answered")
+            self.pointer("mouseup", 1)
             target.expect("dropped")
             check(received.read_bytes() == content, f"as {kind} came {received.read_bytes()}")
             target.process.terminate()
