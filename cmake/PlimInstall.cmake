@@ -26,8 +26,11 @@ foreach(program plimworks plimgen plimcheck)
 endforeach()
 
 # Before version 1 each minor version may break what was linked with another one.
-foreach(library be ormi plim)
-  get_target_property(type ${library} TYPE)
+foreach(library be ormi plim plim_checked)
+  set(type "")
+  if(TARGET ${library})
+    get_target_property(type ${library} TYPE)
+  endif()
   if(type STREQUAL "SHARED_LIBRARY" AND NOT CMAKE_SYSTEM_NAME STREQUAL "Haiku")
     set_target_properties(${library} PROPERTIES VERSION ${PROJECT_VERSION}
       SOVERSION ${PROJECT_VERSION_MAJOR}.${PROJECT_VERSION_MINOR})

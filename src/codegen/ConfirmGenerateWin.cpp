@@ -82,6 +82,18 @@ LineFor(TDesignForm* form)
 }
 
 
+/// Owns its items.
+class LineList : public BListView {
+public:
+	using BListView::BListView;
+	~LineList() override
+	{
+		for (int32 i = 0; i < CountItems(); i++)
+			delete ItemAt(i);
+	}
+};
+
+
 BBox*
 MakeBox(BRect frame, const char* label)
 {
@@ -202,7 +214,7 @@ ConfirmGenerateWin::AddForms(BView* parent)
 
 	BRect frame(kBoxInset, kFirstFieldTop, box->Bounds().right - kBoxInset - B_V_SCROLL_BAR_WIDTH,
 		box->Bounds().bottom - kBoxInset);
-	BListView* list = new BListView(frame, "lvForms", B_SINGLE_SELECTION_LIST);
+	BListView* list = new LineList(frame, "lvForms", B_SINGLE_SELECTION_LIST);
 	for (int32 i = 0; i < fApp->CountComponents(); i++) {
 		TDesignForm* form = FormAt(fApp, i);
 		const BString line = form != nullptr ? LineFor(form) : BString();
