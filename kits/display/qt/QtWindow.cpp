@@ -543,6 +543,12 @@ QtWindow::event(QEvent* event)
 			HandleDrop(static_cast<QDropEvent*>(event));
 			return true;
 
+		case QEvent::FocusIn:
+		case QEvent::FocusOut:
+			// The display hears of it elsewhere. Qt would only tell screen readers, of a window without any of its
+			// own widgets, and connect to the session bus for it.
+			return true;
+
 		case QEvent::WindowStateChange:
 			HandleState();
 			return QWindow::event(event);
