@@ -53,8 +53,8 @@ struct LooperAccess {
 	/// Whether Run() or Loop() was called.
 	static bool IsRunning(const BLooper* looper);
 
-	/// The looper's thread waits for what the user does elsewhere and answers no messages, or no longer. Called by
-	/// that thread; calls nest.
+	/// The looper's thread waits for what the user does elsewhere and answers no messages, or no longer. Begun by
+	/// that thread, ended by any while it waits; calls nest.
 	static void BeginUserWait(BLooper* looper);
 	static void EndUserWait(BLooper* looper);
 	/// Any thread; \a looper may be gone.

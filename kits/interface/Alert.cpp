@@ -83,15 +83,8 @@ private:
 
 /// What the thread in Go() waits for. The alert ends it, at the latest with itself.
 struct BAlert::Outcome {
-	Outcome()
-		: ended(create_sem(0, "alert ended")),
-		  answer(-1)
-	{
-	}
-	~Outcome() { delete_sem(ended); }
-
-	const sem_id ended;
-	std::atomic<int32> answer;
+	BPrivate::UserWait wait;
+	std::atomic<int32> answer{-1};
 };
 
 
@@ -158,7 +151,7 @@ BAlert::~BAlert()
 {
 	// Whoever waits has its answer, or the alert was ended without one.
 	if (fOutcome != NULL)
-		release_sem(fOutcome->ended);
+		fOutcome->wait.End();
 }
 
 
@@ -295,14 +288,14 @@ int32
 BAlert::Go()
 {
 	const auto outcome = std::make_shared<Outcome>();
-	if (outcome->ended < B_OK)
+	if (outcome->wait.InitCheck() != B_OK)
 		return -1;
 	fOutcome = outcome;
 	Prepare();
 	Show();
 
 	// From here on the alert is its own thread's, and may be gone already.
-	BPrivate::WaitForUser(outcome->ended, "an alert");
+	outcome->wait.Wait("an alert");
 	return outcome->answer;
 }
 

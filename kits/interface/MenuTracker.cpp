@@ -39,13 +39,7 @@ const BMenu* sSessionMenu = nullptr;
 
 /// What the thread in TrackAndWait() waits for. The tracker ends it, at the latest with itself.
 struct MenuTracker::Outcome {
-	Outcome()
-		: ended(create_sem(0, "menu closed"))
-	{
-	}
-	~Outcome() { delete_sem(ended); }
-
-	const sem_id ended;
+	UserWait wait;
 	std::atomic<BMenuItem*> chosen{nullptr};
 };
 
@@ -83,7 +77,7 @@ MenuTracker::~MenuTracker()
 	}
 	// The program ends while the menu is open.
 	if (fOutcome != nullptr)
-		release_sem(fOutcome->ended);
+		fOutcome->wait.End();
 }
 
 
@@ -130,13 +124,13 @@ BMenuItem*
 MenuTracker::TrackAndWait(const MenuStart& start)
 {
 	const auto outcome = std::make_shared<Outcome>();
-	if (outcome->ended < B_OK)
+	if (outcome->wait.InitCheck() != B_OK)
 		return nullptr;
 	MenuTracker* tracker = new MenuTracker(start);
 	tracker->fOutcome = outcome;
 	Launch(tracker);
 
-	WaitForUser(outcome->ended, "a menu");
+	outcome->wait.Wait("a menu");
 	return outcome->chosen;
 }
 
@@ -298,7 +292,7 @@ MenuTracker::FinishPopUp(BMenuItem* chosen)
 	if (fOutcome != nullptr) {
 		// Who waits invokes it, in its own thread.
 		fOutcome->chosen = chosen;
-		release_sem(fOutcome->ended);
+		fOutcome->wait.End();
 		fOutcome.reset();
 		return;
 	}

@@ -17,8 +17,20 @@ constexpr bigtime_t kRepaintInterval = 50000;
 } // namespace
 
 
+UserWait::UserWait()
+	: fEnded(create_sem(0, "user wait"))
+{
+}
+
+
+UserWait::~UserWait()
+{
+	delete_sem(fEnded);
+}
+
+
 void
-WaitForUser(sem_id ended, const char* what)
+UserWait::Wait(const char* what)
 {
 	CheckWait(what);
 	BLooper* caller = BLooper::LooperForThread(find_thread(nullptr));
@@ -26,18 +38,41 @@ WaitForUser(sem_id ended, const char* what)
 	const uint32 flags = window != nullptr ? B_RELATIVE_TIMEOUT : 0;
 	const bigtime_t timeout = window != nullptr ? kRepaintInterval : B_INFINITE_TIMEOUT;
 
-	if (caller != nullptr)
-		LooperAccess::BeginUserWait(caller);
+	{
+		std::lock_guard lock(fLock);
+		if (caller != nullptr && !fIsOver) {
+			LooperAccess::BeginUserWait(caller);
+			fWaiting = caller;
+		}
+	}
 	status_t status;
 	do {
-		status = acquire_sem_etc(ended, 1, flags, timeout);
+		status = acquire_sem_etc(fEnded, 1, flags, timeout);
 		if (status == B_TIMED_OUT && window->LockWithTimeout(0) == B_OK) {
 			window->UpdateIfNeeded();
 			window->Unlock();
 		}
 	} while (status == B_TIMED_OUT || status == B_WOULD_BLOCK || status == B_INTERRUPTED);
-	if (caller != nullptr)
-		LooperAccess::EndUserWait(caller);
+	Leave();
+}
+
+
+void
+UserWait::End()
+{
+	Leave();
+	release_sem(fEnded);
+}
+
+
+void
+UserWait::Leave()
+{
+	std::lock_guard lock(fLock);
+	fIsOver = true;
+	if (fWaiting != nullptr)
+		LooperAccess::EndUserWait(fWaiting);
+	fWaiting = nullptr;
 }
 
 } // namespace BPrivate
