@@ -19,6 +19,7 @@ WANTED = {
         r"lib/libplim\.so\.\d+\.\d+",
         r"lib/libplim\.so\.\d+\.\d+\.\d+",
         r"bin/Components/standard\.so",
+        r"bin/MoreComponents/gauges\.so",
         r"share/applications/plimworks\.desktop",
         r"share/mime/packages/plimworks\.xml",
         r"share/icons/hicolor/48x48/apps/plimworks\.png",
