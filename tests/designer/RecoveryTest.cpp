@@ -158,8 +158,8 @@ TEST_F(RecoveryTest, CopiesOfARunningDesignerAreItsOwnUntilItIsKilled)
 		TRecovery recovery;
 		recovery.Keep(recovery.NewId(), MakeCopy("p", "a", "A"));
 		recovery.Flush();
-		write(ready[1], "!", 1);
-		pause();
+		if (write(ready[1], "!", 1) == 1)
+			pause();
 		_exit(0);
 	}
 	char byte;
