@@ -24,7 +24,7 @@ def findings(source, compiler, build):
     for unwanted in (f"{source}/kits", "Qt6", "libbe.so", "be_display_qt"):
         if unwanted in rules:
             yield f"{unwanted} is in what is built"
-    for wanted in ("plimworks", "plimgen", "plimcheck", "Components/standard.so", "Components/gauges.so"):
+    for wanted in ("plimworks", "plimgen", "plimcheck", "Components/standard.so", "MoreComponents/gauges.so"):
         link = re.search(rf"^build bin/{re.escape(wanted)}: .*\n((?:  .*\n)*)", rules, re.MULTILINE)
         if link is None:
             yield f"bin/{wanted} is not built"
