@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Writes a project of forms with many buttons, for bench/compare and bench/compare_start.
+// Writes a project of forms with many buttons, for bench/compare.
 //
 // usage: bench_documents COUNT FOLDER [FORMS]
 //

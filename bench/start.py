@@ -1,15 +1,11 @@
-#!/usr/bin/env python3
-"""Starts the designer beside fluid and Qt Designer on an X server of its own, and prints times and memory.
+# SPDX-License-Identifier: MIT
+"""What starting the designer takes beside fluid and Qt Designer: the part of bench/compare about starts.
 
-usage: bench/compare_start [--runs N]
-
-Each program is started N times (default 5); the best time counts. "first" is the time from the start of the process to
-its first window on the server, "painted" the time to the last change of the screen, which is when all its windows show
-what they have to show. Memory is the resident set then. No window manager runs: it would only add its own time.
-The last line is a project of 20 forms with 100 components each. Needs an optimised build, which it makes.
+The programs run on an X server of their own. "first" is the time from the start of the process to its first window on
+the server, "painted" the time to the last change of the screen, which is when all its windows show what they have to
+show. Memory is the resident set then. No window manager runs: it would only add its own time.
 """
 
-import argparse
 import ctypes
 import ctypes.util
 import mmap
@@ -23,8 +19,6 @@ import time
 import zlib
 from pathlib import Path
 
-ROOT = Path(__file__).resolve().parent.parent
-BUILD = ROOT / "build" / "release"
 FORMS = 20
 COMPONENTS = 100
 LIMIT = 120  # seconds
@@ -118,52 +112,51 @@ def best(runs, server, command, folder, windows):
     return [min(column) for column in zip(*results)]
 
 
-def find_qt_designer():
-    for path in QT_DESIGNERS:
-        if Path(path).exists():
-            return path
-    sys.exit("Qt Designer is not installed")
+def qt_designer():
+    return next((path for path in QT_DESIGNERS if Path(path).exists()), None)
 
 
-def write_project(folder):
-    subprocess.run([BUILD / "bin" / "bench_documents", str(COMPONENTS), folder, str(FORMS)], check=True,
+def starts_of(build, folder):
+    """Of each row of the table the command, and how many windows it opens."""
+    designer = build / "bin" / "plimworks"
+    subprocess.run([build / "bin" / "bench_documents", str(COMPONENTS), folder, str(FORMS)], check=True,
                    stdout=subprocess.DEVNULL)
-    return folder / "bench.plim"
+    # The designer's windows: the main one, the three tools and the forms.
+    starts = {"plimworks": ([designer], 5), "fluid": ([shutil.which("fluid")], 1),
+              "Qt Designer": ([qt_designer()], 1),
+              f"plimworks, {FORMS} x {COMPONENTS}": ([designer, folder / "bench.plim"], 4 + FORMS)}
+    for name, (command, _) in starts.items():
+        if command[0] is None:
+            print(f"left out: {name} is not installed here")
+    return {name: start for name, start in starts.items() if start[0][0] is not None}
 
 
-def main():
-    parser = argparse.ArgumentParser(description=__doc__.splitlines()[0])
-    parser.add_argument("--runs", type=int, default=5)
-    runs = parser.parse_args().runs
-
-    subprocess.run([ROOT / "scripts" / "setup", "bench"], check=True)
-    subprocess.run([ROOT / "scripts" / "build", "release", "plimworks", "bench_documents", "standard", "be_display_qt"],
-                   check=True)
-    designer = BUILD / "bin" / "plimworks"
-
+def compare(build, runs):
+    """Starts the programs of the build and the other tools, and prints what it took."""
+    if shutil.which("Xvfb") is None:
+        print("left out: starts, as Xvfb is not installed here")
+        return
     with tempfile.TemporaryDirectory(prefix="plimworks-start-") as base:
         folder = Path(base)
-        project = write_project(folder)
+        starts = starts_of(build, folder)
         server = Server(base)
         try:
-            # The windows of each start: our main window, the three tools and the form.
-            results = {
-                "plimworks": best(runs, server, [designer], folder, 5),
-                "fluid": best(runs, server, [shutil.which("fluid")], folder, 1),
-                "Qt Designer": best(runs, server, [find_qt_designer()], folder, 1),
-                f"plimworks, {FORMS} x {COMPONENTS}": best(runs, server, [designer, project], folder, 4 + FORMS),
-            }
+            results = {name: best(runs, server, command, folder, windows) for name, (command, windows) in starts.items()}
         finally:
             server.end()
+    print_starts(results)
 
-    own, fluid, qt = (results[name] for name in ("plimworks", "fluid", "Qt Designer"))
-    print(f"\n{'':>20} {'first':>10} {'painted':>10} {'memory':>10}")
+
+def print_starts(results):
+    print(f"\nstarts, on the clock, best of the runs; {FORMS} x {COMPONENTS} is a project of {FORMS} forms with {COMPONENTS}"
+          " components each\n")
+    print(f"{'':>20} {'first':>10} {'painted':>10} {'memory':>10}")
     for name, (first, painted, memory) in results.items():
         print(f"{name:>20} {first * 1000:>7.0f} ms {painted * 1000:>7.0f} ms {memory:>6.1f} MiB")
-    print(f"\nfirst window to fluid's: {own[0] / fluid[0]:.2f}x"
-          f"\nall painted to Qt Designer's first window: {own[1] / qt[0]:.2f}x"
-          f"\nmemory to Qt Designer's: {own[2] / qt[2]:.2f}x")
-
-
-if __name__ == "__main__":
-    main()
+    print()
+    own, fluid, qt = (results.get(name) for name in ("plimworks", "fluid", "Qt Designer"))
+    if fluid is not None:
+        print(f"first window to fluid's: {own[0] / fluid[0]:.2f}x")
+    if qt is not None:
+        print(f"all painted to Qt Designer's first window: {own[1] / qt[0]:.2f}x"
+              f"\nmemory to Qt Designer's: {own[2] / qt[2]:.2f}x")
