@@ -488,11 +488,8 @@ TDesignForm::FollowWindow()
 void
 TDesignForm::SelectInForm(bool formSelected)
 {
-	DesignerSelect(formSelected);
-	for (int32 i = 0; i < CountComponents(); i++)
-		ComponentAt(i)->DesignerSelect(false);
-	fDesignView->Invalidate();
-	fDesignView->RepaintChildren();
+	fDesignView->MarkForm(formSelected);
+	fDesignView->DeselectComponents(nullptr);
 }
 
 

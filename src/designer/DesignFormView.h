@@ -74,6 +74,12 @@ public:
 	/// Draws every component anew, with its selection marks.
 	void RepaintChildren();
 
+	/// Selects the form's component, or not. The frame that marks it is drawn anew when that changes.
+	void MarkForm(bool selected);
+
+	/// Deselects every component but \a kept, which may be null. Those that were selected are drawn anew.
+	void DeselectComponents(const TComponent* kept);
+
 	/// Deselects every form of the project. Locks each in turn; this window's lock is given up meanwhile.
 	void DeselectForms();
 

@@ -6,6 +6,7 @@
 #include <vector>
 
 #include <Message.h>
+#include <Region.h>
 #include <Window.h>
 
 #include "app/WindowGuard.h"
@@ -114,13 +115,11 @@ void
 TDesignFormView::SelectForm()
 {
 	DeselectForms();
-	fForm->DesignerSelect(true);
+	MarkForm(true);
 	PrintDiagnostic("%ld Components\n", static_cast<long>(TFormDesigner::CountComponents()));
 	if (!fForm->IsActive())
 		fForm->Activate();
-	for (int32 i = 0; i < TFormDesigner::CountComponents(); i++)
-		TFormDesigner::ComponentAt(i)->DesignerSelect(false);
-	RepaintChildren();
+	DeselectComponents(nullptr);
 	fForm->DesignFormActivated(true);
 }
 
@@ -132,10 +131,37 @@ TDesignFormView::DeselectForms()
 		return;
 	for (TDesignForm* form : fForm->Host()->Forms()) {
 		WindowGuard guard(form);
-		if (!guard.IsLocked() || !form->IsDesignerSelected())
+		if (guard.IsLocked())
+			form->View()->MarkForm(false);
+	}
+}
+
+
+void
+TDesignFormView::MarkForm(bool selected)
+{
+	const bool changes = fForm->IsDesignerSelected() != selected;
+	fForm->DesignerSelect(selected);
+	if (!changes)
+		return;
+	const BRect bounds = Bounds();
+	BRegion mark(bounds);
+	mark.Exclude(bounds.InsetByCopy(1, 1));
+	Invalidate(&mark);
+}
+
+
+void
+TDesignFormView::DeselectComponents(const TComponent* kept)
+{
+	for (int32 i = 0; i < TFormDesigner::CountComponents(); i++) {
+		TComponent* component = TFormDesigner::ComponentAt(i);
+		if (component == kept)
 			continue;
-		form->DesignerSelect(false);
-		form->View()->Invalidate();
+		const bool wasMarked = component->IsDesignerSelected();
+		component->DesignerSelect(false);
+		if (wasMarked && component->DTView() != nullptr)
+			component->DTView()->Invalidate();
 	}
 }
 
@@ -154,14 +180,11 @@ TDesignFormView::RepaintChildren()
 void
 TDesignFormView::ComponentSelected(TComponent* component)
 {
-	fForm->DesignerSelect(false);
-	for (int32 i = 0; i < TFormDesigner::CountComponents(); i++) {
-		TComponent* other = TFormDesigner::ComponentAt(i);
-		if (other != component)
-			other->DesignerSelect(false);
-	}
-	Invalidate();
-	RepaintChildren();
+	MarkForm(false);
+	DeselectComponents(component);
+	// The caller selected it, but may not have had it drawn.
+	if (component != nullptr && component->DTView() != nullptr)
+		component->DTView()->Invalidate();
 	Inspector::ShowUnlessShown(component, this);
 }
 

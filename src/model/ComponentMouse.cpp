@@ -91,8 +91,10 @@ TComponent::SelectAlone()
 		TComponent* other = Owner()->ComponentAt(i);
 		if (other == nullptr || other == this)
 			continue;
+		// A form may have a thousand of them: only the one that looks otherwise then is drawn anew.
+		const bool wasMarked = other->IsDesignerSelected();
 		other->DesignerSelect(false);
-		if (other->DTView() != nullptr)
+		if (wasMarked && other->DTView() != nullptr)
 			other->DTView()->Invalidate();
 	}
 

@@ -3,6 +3,8 @@
 
 #include "designer/SurfaceTest.h"
 
+#include <utility>
+
 #include <Autolock.h>
 #include <CheckBox.h>
 #include <TextControl.h>
@@ -26,8 +28,35 @@ public:
 
 } // namespace
 
+/// A view inside another that counts how often it is drawn.
+class DrawCounter : public BView {
+public:
+	DrawCounter()
+		: BView(BRect(2, 2, 12, 12), "counter", B_FOLLOW_NONE, B_WILL_DRAW)
+	{
+	}
+
+	void Draw(BRect) override { count++; }
+
+	int32 count = 0;
+};
+
 class DesignMouseTest : public SurfaceTest {
 protected:
+	DrawCounter* CountDrawing(TComponent* component) const
+	{
+		DrawCounter* counter = new DrawCounter;
+		Locked([&] { component->DTView()->AddChild(counter); });
+		return counter;
+	}
+
+	int32 TakeCount(DrawCounter* counter) const
+	{
+		int32 count;
+		Locked([&] { count = std::exchange(counter->count, 0); });
+		return count;
+	}
+
 	bool IsWaiting() const { return PaletteCatalog().DropEntry() != nullptr; }
 
 	/// Drags what is at \a from, presses Escape on the way, and goes on to \a to.
@@ -216,6 +245,33 @@ TEST_F(DesignMouseTest, AClickSelectsOneComponent)
 	EXPECT_FALSE(IsSelected(box));
 	EXPECT_TRUE(IsSelected(inside));
 	EXPECT_EQ(Shown(), inside);
+}
+
+
+TEST_F(DesignMouseTest, OnlyWhatIsMarkedOtherwiseIsDrawnAnew)
+{
+	TComponent* button = Draw("TButton", BRect(20, 30, 120, 60));
+	Draw("TButton", BRect(20, 70, 120, 100));
+	TComponent* other = Draw("TButton", BRect(20, 110, 120, 140));
+	DrawCounter* ofButton = CountDrawing(button);
+	DrawCounter* ofOther = CountDrawing(other);
+	fRobot.Click(BPoint(60, 85));
+	TakeCount(ofButton);
+	TakeCount(ofOther);
+
+	fRobot.Click(BPoint(60, 45));
+	EXPECT_GT(TakeCount(ofButton), 0);
+	EXPECT_EQ(TakeCount(ofOther), 0);
+
+	// The form's own mark is its border.
+	fRobot.Click(BPoint(200, 200));
+	EXPECT_TRUE(IsSelected(Form()));
+	EXPECT_GT(TakeCount(ofButton), 0);
+	EXPECT_EQ(TakeCount(ofOther), 0);
+
+	Draw("TButton", BRect(20, 150, 120, 180));
+	EXPECT_EQ(TakeCount(ofButton), 0);
+	EXPECT_EQ(TakeCount(ofOther), 0);
 }
 
 

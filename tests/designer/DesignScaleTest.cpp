@@ -63,3 +63,29 @@ TEST_F(DesignScaleTest, ComponentsAreDrawnWhereTheyWerePut)
 	fRobot.Drag(BPoint(147, 49), BPoint(160, 60));
 	CheckSelected(inside, BRect(31, 27, 160, 60));
 }
+
+
+TEST_F(DesignScaleTest, WhatIsMarkedOtherwiseLooksAsIfAllWereDrawnAnew)
+{
+	// Side by side, over each other, one inside another, and one whose child covers it.
+	Draw("TButton", BRect(21, 33, 121, 63));
+	Draw("TButton", BRect(122, 33, 180, 63));
+	Draw("TCheckBox", BRect(101, 50, 200, 80));
+	Draw("TBox", BRect(5, 101, 200, 190));
+	Draw("TButton", BRect(11, 111, 100, 141));
+	Draw("TTextControl", BRect(101, 121, 190, 151));
+	const BPoint clicks[] = {BPoint(40, 40), BPoint(150, 40), BPoint(111, 70), BPoint(20, 180),
+		BPoint(60, 130), BPoint(150, 130), BPoint(250, 20), BPoint(60, 130), BPoint(250, 20)};
+	for (BPoint where : clicks) {
+		fRobot.Click(where);
+		const WindowPicture picture = fRobot.Picture();
+		Locked([&] {
+			Form()->View()->Invalidate();
+			Form()->View()->RepaintChildren();
+		});
+		fRobot.Settle();
+		const WindowPicture whole = fRobot.Picture();
+		ASSERT_FALSE(whole.pixels.empty());
+		EXPECT_TRUE(picture.pixels == whole.pixels) << where.x << ", " << where.y;
+	}
+}
