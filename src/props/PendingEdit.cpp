@@ -21,12 +21,15 @@ TPendingEdit::TPendingEdit(TPropertyEditor* editor)
 	const TComponent* component = editor != nullptr ? editor->Component() : nullptr;
 	if (component != nullptr && component->DTView() != nullptr)
 		fFormWindow = component->DTView()->Looper();
+	if (PlimWin* mainWindow = MainWindow())
+		fInspector = BMessenger(mainWindow->PropertyWindow());
 }
 
 
 TPendingEdit::TPendingEdit(const TPendingEdit& other)
 	: fEditor(other.fEditor),
-	  fFormWindow(other.fFormWindow)
+	  fFormWindow(other.fFormWindow),
+	  fInspector(other.fInspector)
 {
 	fProperty.SetTo(other.fProperty);
 }
@@ -58,6 +61,5 @@ TPendingEdit::Confirm(const BString& text)
 			return;
 		fEditor->ApplyValue(text.String());
 	}
-	if (PlimWin* mainWindow = MainWindow())
-		mainWindow->PropertyWindow()->UpdateDisplayValues();
+	fInspector.SendMessage(PWM_REFRESH);
 }

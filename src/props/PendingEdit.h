@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <Messenger.h>
 #include <String.h>
 
 #include "props/PropertyWatch.h"
@@ -30,4 +31,5 @@ private:
 	TPropertyEditor* fEditor;
 	TPropertyWatch fProperty;
 	BLooper* fFormWindow;
+	BMessenger fInspector; // it goes before the dialogs do when the program ends
 };

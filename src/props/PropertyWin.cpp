@@ -36,7 +36,6 @@ constexpr float kWidth = 200;
 constexpr float kHeight = 300;
 constexpr const char* kFrameSetting = "PropertyWinFrame";
 
-constexpr uint32 kMsgRefresh = 'rfsh';
 constexpr uint32 kMsgBury = 'bury';     // "editors" (pointer): the receiver's
 constexpr bigtime_t kFrameTime = 16000; // microseconds
 
@@ -93,7 +92,7 @@ PropertyWin::QuitRequested()
 void
 PropertyWin::MessageReceived(BMessage* message)
 {
-	if (message->what == kMsgRefresh) {
+	if (message->what == PWM_REFRESH) {
 		RefreshInThisFrame();
 		return;
 	}
@@ -234,7 +233,7 @@ PropertyWin::Component()
 void
 PropertyWin::UpdateDisplayValues()
 {
-	if (!fRefreshWaits.exchange(true) && PostMessage(kMsgRefresh) != B_OK)
+	if (!fRefreshWaits.exchange(true) && PostMessage(PWM_REFRESH) != B_OK)
 		fRefreshWaits = false;
 }
 
@@ -504,7 +503,7 @@ PropertyWin::RefreshInThisFrame()
 {
 	const bigtime_t now = system_time();
 	if (now < fNextRefresh && fDelayedRefresh == nullptr) {
-		const BMessage refresh(kMsgRefresh);
+		const BMessage refresh(PWM_REFRESH);
 		fDelayedRefresh =
 			std::make_unique<BMessageRunner>(BMessenger(this), refresh, fNextRefresh - now, 1);
 		if (fDelayedRefresh->InitCheck() == B_OK)

@@ -33,6 +33,9 @@ enum {
 	PWM_PICK = 12 // "prop" (pointer to TProperty), "caption" (string)
 };
 
+/// Does what UpdateDisplayValues() does, for who cannot know whether the window still exists.
+enum { PWM_REFRESH = 'rfsh' };
+
 /// The one window that shows and edits the selected component.
 ///
 /// It owns neither the component nor its properties, and reads and writes them with the window of the design

@@ -11,31 +11,6 @@
 
 class GaugesOnSurfaceTest : public SurfaceTest {
 protected:
-	/// Double-clicks the property's row in the property window.
-	void Invoke(const char* property)
-	{
-		BPoint place(-1, -1);
-		{
-			WindowGuard guard(Inspector());
-			ASSERT_TRUE(guard.IsLocked());
-			auto* list = dynamic_cast<BListView*>(Inspector()->FindView("lvProperties"));
-			for (int32 i = 0; i < list->CountItems(); i++) {
-				if (strcmp(static_cast<TPropertyListItem*>(list->ItemAt(i))->Name(), property) != 0)
-					continue;
-				list->ScrollTo(i);
-				place = list->ItemFrame(i).LeftTop() + BPoint(20, 5);
-				list->ConvertToScreen(&place);
-				Inspector()->ConvertFromScreen(&place);
-			}
-			Inspector()->Activate();
-		}
-		ASSERT_GE(place.x, 0) << property;
-		ASSERT_TRUE(fRobot.WaitForWindow("Properties"));
-		fRobot.Settle();
-		fRobot.Click(place, 2);
-		fRobot.Settle();
-	}
-
 	/// What the property window shows for it.
 	std::string Shown(const char* property)
 	{

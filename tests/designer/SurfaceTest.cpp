@@ -8,6 +8,7 @@
 #include <mutex>
 
 #include <Autolock.h>
+#include <ListView.h>
 
 #include "app/Dialogs.h"
 #include "app/MainWindow.h"
@@ -19,6 +20,7 @@
 #include "palette/PaletteCatalog.h"
 #include "palette/PaletteEntry.h"
 #include "project/Project.h"
+#include "props/PropertyListItem.h"
 #include "support/ComponentLibraries.h"
 
 extern "C" int32 be_count_lock_violations();
@@ -292,6 +294,32 @@ SurfaceTest::Shown() const
 {
 	BAutolock lock(Inspector());
 	return Inspector()->Component();
+}
+
+
+void
+SurfaceTest::Invoke(const char* property)
+{
+	BPoint place(-1, -1);
+	{
+		WindowGuard guard(Inspector());
+		ASSERT_TRUE(guard.IsLocked());
+		auto* list = dynamic_cast<BListView*>(Inspector()->FindView("lvProperties"));
+		for (int32 i = 0; i < list->CountItems(); i++) {
+			if (strcmp(static_cast<TPropertyListItem*>(list->ItemAt(i))->Name(), property) != 0)
+				continue;
+			list->ScrollTo(i);
+			place = list->ItemFrame(i).LeftTop() + BPoint(20, 5);
+			list->ConvertToScreen(&place);
+			Inspector()->ConvertFromScreen(&place);
+		}
+		Inspector()->Activate();
+	}
+	ASSERT_GE(place.x, 0) << property;
+	ASSERT_TRUE(fRobot.WaitForWindow("Properties"));
+	fRobot.Settle();
+	fRobot.Click(place, 2);
+	fRobot.Settle();
 }
 
 

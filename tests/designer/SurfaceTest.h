@@ -61,6 +61,8 @@ protected:
 	PropertyWin* Inspector() const;
 	/// What the property window shows.
 	TComponent* Shown() const;
+	/// Double-clicks the property's row in the property window, which the robot works on then.
+	void Invoke(const char* property);
 
 	/// Chooses an item of the menu that the secondary button opens at \a where.
 	bool ChooseFromMenu(BPoint where, const char* label);
