@@ -39,7 +39,7 @@ protected:
 	command_result RunScript(const std::string& script, const std::string& arguments = "",
 		const std::string& program = kProgram)
 	{
-		return RunCommand(Prepare(script) + " timeout 100 " + program + " " + arguments);
+		return RunCommand(Prepare(script) + " " + Within(100) + program + " " + arguments);
 	}
 
 	/// The same, but as soon as there is a file \a path in the settings, the designer is killed.

@@ -221,7 +221,7 @@ protected:
 	{
 		std::ofstream(fFolder / "script.robot") << script;
 		return RunCommand("BE_DISPLAY=qt QT_QPA_PLATFORM=offscreen BE_ROBOT_SCRIPT="
-			+ (fFolder / "script.robot") + " timeout 100 " + program);
+			+ (fFolder / "script.robot") + " " + Within(100) + program);
 	}
 
 	BApplication fApplication{"application/x-vnd.plimworks-components-test"};

@@ -19,8 +19,10 @@ from pathlib import Path
 
 from picture import Picture
 
+# More where programs are slow because a sanitizer watches them.
+PATIENCE = int(os.environ.get("PLIM_PATIENCE", "1"))
 # No wait is meant to come near this, on the slowest of machines.
-LIMIT = 40
+LIMIT = 40 * PATIENCE
 # Between two looks at what is waited for; most things come soon.
 SHORTEST_PAUSE, LONGEST_PAUSE = 0.001, 0.02
 TOOLS = ("Xvfb", "openbox", "xdotool", "xclip", "xsetroot")

@@ -8,10 +8,11 @@ import time
 import traceback
 from pathlib import Path
 
-from xdesktop import Desktop, Failure, missing_tools
+from xdesktop import PATIENCE, Desktop, Failure, missing_tools
 
 SKIPPED = 77
 START = time.monotonic()
+REPORTS = ("SUMMARY: ", ": runtime error: ")
 
 
 def check(condition, message):
@@ -21,6 +22,13 @@ def check(condition, message):
 
 def step(text):
     print(f"{time.monotonic() - START:6.2f} s  {text}", flush=True)
+
+
+def check_unreported(folder):
+    """What a sanitizer says of a program, at its end or before, is a failure whatever else was seen."""
+    for file in sorted(folder.glob("*.output")):
+        text = file.read_text(encoding="utf-8", errors="replace")
+        check(not any(words in text for words in REPORTS), f"a sanitizer reports in {file.name}")
 
 
 def interrupted(number, _):
@@ -44,7 +52,7 @@ def run(use, paths, limit, usage, owns_folder=True, tools=()):
 
     for number in (signal.SIGALRM, signal.SIGTERM, signal.SIGINT, signal.SIGHUP):
         signal.signal(number, interrupted)
-    signal.alarm(limit)
+    signal.alarm(limit * PATIENCE)
     words = [Path(word).resolve() for word in sys.argv[1:]]
     name = Path(sys.argv[0]).stem
     screen = words[-1] / f"{name}.png"
@@ -55,6 +63,7 @@ def run(use, paths, limit, usage, owns_folder=True, tools=()):
     with tempfile.TemporaryDirectory(prefix=f"{name}.") as folder, Desktop(folder) as desktop:
         try:
             use(desktop, *words)
+            check_unreported(Path(folder))
         except Exception:
             traceback.print_exc()
             desktop.picture().save(screen)

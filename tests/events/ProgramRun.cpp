@@ -72,7 +72,7 @@ ProgramRun::Run(const std::string& before, const std::string& after)
 	std::ofstream(folder / "script.robot") << fScript;
 	const command_result result = RunCommand(
 		"BE_DISPLAY=qt QT_QPA_PLATFORM=offscreen BE_ROBOT_SCRIPT=" + (folder / "script.robot") + " "
-		+ before + " timeout 60 " EVENTS_PROGRAM + fDialect + " " + after);
+		+ before + " " + Within(60) + EVENTS_PROGRAM + fDialect + " " + after);
 	fCode = result.code;
 	fOutput = result.output;
 	Read();

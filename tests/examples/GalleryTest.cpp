@@ -21,7 +21,7 @@ RunGallery(const TemporaryFolder& folder, const std::string& script)
 {
 	folder.Make("home");
 	return RunCommand("cd " + (folder / "home") + " && HOME=" + (folder / "home")
-		+ " BE_DISPLAY=qt OUT=" + folder.Path() + " BE_ROBOT_SCRIPT=" + script + " timeout 120 "
+		+ " BE_DISPLAY=qt OUT=" + folder.Path() + " BE_ROBOT_SCRIPT=" + script + " " + Within(120)
 		+ kGallery);
 }
 

@@ -51,7 +51,7 @@ protected:
 	void ExpectReactions(const std::string& program)
 	{
 		const command_result ran = RunCommand("PICTURES=" + fFolder.Path()
-			+ " BE_ROBOT_SCRIPT=" PLIM_SOURCE_DIR "/tests/examples/hello.robot timeout 60 "
+			+ " BE_ROBOT_SCRIPT=" PLIM_SOURCE_DIR "/tests/examples/hello.robot " + Within(60)
 			+ program);
 		EXPECT_EQ(ran.code, 0) << ran.output;
 		EXPECT_NE(ran.output.find("GreetingText: Hello!\n"), std::string::npos) << ran.output;

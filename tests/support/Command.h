@@ -8,11 +8,21 @@
 #include <cstdio>
 #include <string>
 
+#include "support/Patience.h"
+
 /// What a command printed, on both its outputs together, and its exit code (-1 when it was killed).
 struct command_result {
 	int code = -1;
 	std::string output;
 };
+
+/// What comes before a command that may hang: it is ended after so many seconds.
+inline std::string
+Within(int seconds)
+{
+	return "timeout " + std::to_string(seconds * Patience()) + " ";
+}
+
 
 /// Runs a shell command to its end. Commands that may hang bring their own time limit.
 inline command_result

@@ -10,9 +10,11 @@
 #include "display/Display.h"
 #include "display/KeyMap.h"
 #include "display/Robot.h"
+#include "support/Patience.h"
 
 namespace {
 
+const bigtime_t kLimit = 10000000;
 // How long a window may be busy before it is not asked any more.
 const bigtime_t kBusyTime = 300000;
 
@@ -67,13 +69,13 @@ WindowPicture::SavePng(const char* path) const
 
 
 Robot::Robot()
-	: fRobot(std::make_unique<BPrivate::Robot>())
+	: fRobot(std::make_unique<BPrivate::Robot>(kLimit * Patience()))
 {
 }
 
 
 Robot::Robot(BWindow* window)
-	: fRobot(std::make_unique<BPrivate::Robot>()),
+	: fRobot(std::make_unique<BPrivate::Robot>(kLimit * Patience())),
 	  fWindow(window)
 {
 	fRobot->Settle();
@@ -86,7 +88,7 @@ Robot::~Robot() = default;
 void
 Robot::SetLimit(double seconds)
 {
-	fRobot->SetLimit(static_cast<bigtime_t>(seconds * 1000000));
+	fRobot->SetLimit(static_cast<bigtime_t>(seconds * 1000000) * Patience());
 }
 
 

@@ -46,7 +46,7 @@ public:
 	explicit Robot(BWindow* window);
 	~Robot();
 
-	/// Seconds; 10 to begin with.
+	/// Seconds; 10 to begin with. Longer where a sanitizer makes programs slow.
 	void SetLimit(double seconds);
 	/// The shown window with this title ("Untitled*": that begins so) becomes the one to work on.
 	bool WaitForWindow(const char* title);

@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
 // Programs of their own: which display they get, and what a script makes them do.
-#include <cstdio>
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
@@ -8,8 +7,9 @@
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
-#include <sys/wait.h>
 #include <unistd.h>
+
+#include "support/Command.h"
 
 using testing::HasSubstr;
 using testing::Not;
@@ -19,26 +19,14 @@ namespace {
 const std::string kClean =
 	"env -u DISPLAY -u WAYLAND_DISPLAY -u QT_QPA_PLATFORM -u BE_DISPLAY -u BE_ROBOT_SCRIPT ";
 
-struct Result {
-	int code;
-	std::string output;
-};
+using Result = command_result;
 
 
 /// Standard output and error of the demo program; \a environment: NAME=value words.
 Result
 RunProgram(const std::string& environment, const std::string& arguments = "")
 {
-	std::string command =
-		kClean + environment + " timeout 60 " + DISPLAY_PROGRAM + " " + arguments + " 2>&1";
-	FILE* pipe = popen(command.c_str(), "r");
-	std::string output;
-	char buffer[4096];
-	size_t size;
-	while ((size = fread(buffer, 1, sizeof(buffer), pipe)) > 0)
-		output.append(buffer, size);
-	int status = pclose(pipe);
-	return {WIFEXITED(status) ? WEXITSTATUS(status) : -1, output};
+	return RunCommand(kClean + environment + " " + Within(60) + DISPLAY_PROGRAM + " " + arguments);
 }
 
 
