@@ -47,8 +47,10 @@ endif()
 # than there is fails as it does without them. The kernel kit keeps ended threads until they are waited for.
 # The leak checker crashes, now and then, on what it notes of the thread-local data of ended threads: it notes none, and
 # finds such data as it finds all that is on the heap.
+string(CONCAT address_options "allocator_may_return_null=1:detect_stack_use_after_return=1:strict_string_checks=1:"
+  "intercept_tls_get_addr=0:suppressions=${PROJECT_SOURCE_DIR}/tests/asan.supp")
 set(plim_address_environment
-  "ASAN_OPTIONS=allocator_may_return_null=1:detect_stack_use_after_return=1:strict_string_checks=1:intercept_tls_get_addr=0"
+  "ASAN_OPTIONS=${address_options}"
   "LSAN_OPTIONS=suppressions=${PROJECT_SOURCE_DIR}/tests/lsan.supp:print_suppressions=0"
   "UBSAN_OPTIONS=print_stacktrace=1")
 set(sanitizer_environment)
