@@ -40,7 +40,7 @@ ReadZones(const char* text, char divider, std::vector<Gauges::zone>* zones)
 	std::istringstream stream(text);
 	for (std::string part; std::getline(stream, part, divider);) {
 		Gauges::zone zone;
-		if (part.find_first_not_of(" ") == std::string::npos)
+		if (part.find_first_not_of(' ') == std::string::npos)
 			continue;
 		if (!ReadZone(part, &zone))
 			return false;

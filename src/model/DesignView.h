@@ -94,7 +94,7 @@ public:
 		if (message->what == B_MOUSE_WHEEL_CHANGED)
 			return;
 		if (!OfferDesignMessage(fComponent, message))
-			BView::MessageReceived(message);
+			BView::MessageReceived(message); // NOLINT(bugprone-parent-virtual-call): as said above
 	}
 
 private:

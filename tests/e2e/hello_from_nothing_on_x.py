@@ -293,7 +293,7 @@ def design_main(designer):
     form.draw("StringView", (128, 144, 348, 166), Name="CountText", Text="No clicks yet")
     form.draw("Button", (12, 184, 112, 212), Name="NoteButton", Label="Note...", event=True)
     form.draw("StringView", (128, 184, 348, 206), Name="NoteText", Text="Opens another form")
-    form.draw("Button", (248, 236, 348, 264), Name="QuitButton", Label="Quit", event=True)
+    form.draw("Button", (248, 236, 348, 264), Name="QuitButton", picture="last-frame", Label="Quit", event=True)
     designer.shoot("second-form")
     form.save(FORMS[1])
     step("the second form is designed")
