@@ -194,6 +194,19 @@ InputHub::IsFront(const StackedWindow* window) const
 }
 
 
+std::vector<const StackedWindow*>
+InputHub::ShownWindows() const
+{
+	std::lock_guard<std::mutex> lock(fMutex);
+	std::vector<const StackedWindow*> shown;
+	for (const StackedWindow* window : fStack.Windows()) {
+		if (window->IsShown())
+			shown.push_back(window);
+	}
+	return shown;
+}
+
+
 std::vector<StackedWindow*>
 InputHub::WindowsBelow(const StackedWindow* window) const
 {

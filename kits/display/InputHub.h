@@ -66,6 +66,8 @@ public:
 	void AddToSubset(StackedWindow* window, const StackedWindow* member);
 	void RemoveFromSubset(StackedWindow* window, const StackedWindow* member);
 	bool IsFront(const StackedWindow* window) const;
+	/// From the lowest to the topmost.
+	std::vector<const StackedWindow*> ShownWindows() const;
 	/// From the next lower one to the lowest.
 	std::vector<StackedWindow*> WindowsBelow(const StackedWindow* window) const;
 

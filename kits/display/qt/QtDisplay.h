@@ -18,6 +18,7 @@
 #include "display/qt/QtFonts.h"
 
 class QCursor;
+class QImage;
 class QKeyEvent;
 class QWindow;
 
@@ -106,6 +107,7 @@ private:
 	void ConnectScreens();
 	void ReadScreens();
 	void ScreensChanged();
+	QImage PutScreenTogether(BRect frame, double ratio) const;
 	void FocusChanged(QWindow* focus);
 	void ApplicationStateChanged(bool active);
 	QtWindow* FloatingWindow() const;

@@ -1,7 +1,10 @@
 // SPDX-License-Identifier: MIT
 // The host's screens.
+#include <cmath>
+
 #include <QGuiApplication>
 #include <QImage>
+#include <QPainter>
 #include <QPixmap>
 #include <QScreen>
 
@@ -100,6 +103,12 @@ QtDisplay::ReadScreen(BRect frame, Picture* picture)
 		QScreen* screen = QGuiApplication::primaryScreen();
 		if (screen == nullptr)
 			return;
+		// Qt's screen in memory puts its windows to wrong places where there is a scale.
+		const double ratio = screen->devicePixelRatio();
+		if (ratio != 1 && QGuiApplication::platformName() == QLatin1String("offscreen")) {
+			image = PutScreenTogether(frame, ratio);
+			return;
+		}
 		QPixmap pixmap = screen->grabWindow(0, static_cast<int>(frame.left),
 			static_cast<int>(frame.top), frame.IntegerWidth() + 1, frame.IntegerHeight() + 1);
 		image = pixmap.toImage().convertToFormat(QImage::Format_RGB32);
@@ -111,6 +120,36 @@ QtDisplay::ReadScreen(BRect frame, Picture* picture)
 		static_cast<int32>(image.bytesPerLine()), false};
 	*picture = QtCanvas(fFonts, buffer).ReadPicture();
 	return B_OK;
+}
+
+
+/// Display thread. What of \a frame the windows cover, \a ratio device pixels for each pixel; the rest is black.
+QImage
+QtDisplay::PutScreenTogether(BRect frame, double ratio) const
+{
+	QImage image(static_cast<int>(std::lround((frame.IntegerWidth() + 1) * ratio)),
+		static_cast<int>(std::lround((frame.IntegerHeight() + 1) * ratio)), QImage::Format_RGB32);
+	if (image.isNull())
+		return image;
+	image.fill(Qt::black);
+	image.setDevicePixelRatio(ratio);
+
+	QPainter painter(&image);
+	for (const StackedWindow* stacked : fHub.ShownWindows()) {
+		QtWindow* window = WindowOf(stacked);
+		if (window == nullptr || !window->isVisible())
+			continue;
+		const BPoint place = fHub.Frame(stacked).LeftTop() - frame.LeftTop();
+		painter.save();
+		// To whole device pixels, or the picture would be blurred.
+		painter.translate(std::round(place.x * ratio) / ratio, std::round(place.y * ratio) / ratio);
+		painter.setClipRect(QRect(QPoint(0, 0), window->size()));
+		window->PaintPicture(painter);
+		painter.restore();
+	}
+	painter.end();
+	image.setDevicePixelRatio(1);
+	return image;
 }
 
 } // namespace BPrivate

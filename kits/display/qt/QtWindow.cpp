@@ -89,10 +89,13 @@ FlagsOf(const HostWindowStyle& style)
 void
 PaintOutline(QPainter& painter, const QRectF& rect)
 {
-	// Black and white by turns, to be seen on everything.
-	QPen light(Qt::white, 1);
-	QPen dark(Qt::black, 1, Qt::CustomDashLine);
+	// Black and white by turns, to be seen on everything; as wide on all sides as the views' own lines.
+	const double width = std::max(std::floor(painter.device()->devicePixelRatio()), 1.0);
+	QPen light(Qt::white, width);
+	light.setCosmetic(true);
+	QPen dark(Qt::black, width, Qt::CustomDashLine);
 	dark.setDashPattern({3, 3});
+	dark.setCosmetic(true);
 	for (const QPen& pen : {light, dark}) {
 		painter.setPen(pen);
 		painter.drawRect(rect);
@@ -400,23 +403,29 @@ QtWindow::Paint(const QRegion& wanted)
 		region = all;
 	}
 
-	InputOverlay overlay = fDisplay.Hub().Overlay();
 	fBackingStore->beginPaint(region);
 	QPaintDevice* device = fBackingStore->paintDevice();
 	if (device != nullptr) {
 		QPainter painter(device);
 		painter.setClipRegion(region);
-		fSurface->Paint([&](const QImage& image) {
-			QSizeF covered = image.isNull() ? QSizeF() : image.deviceIndependentSize();
-			if (covered.width() < width() || covered.height() < height())
-				painter.fillRect(all, kUndrawnColor);
-			if (!image.isNull())
-				painter.drawImage(QPointF(0, 0), image);
-		});
-		PaintOverlay(painter, overlay, fDisplay.Hub().Frame(fStacked).LeftTop());
+		PaintPicture(painter);
 	}
 	fBackingStore->endPaint();
 	fBackingStore->flush(region);
+}
+
+
+void
+QtWindow::PaintPicture(QPainter& painter)
+{
+	fSurface->Paint([&](const QImage& image) {
+		QSizeF covered = image.isNull() ? QSizeF() : image.deviceIndependentSize();
+		if (covered.width() < width() || covered.height() < height())
+			painter.fillRect(QRect(QPoint(0, 0), size()), kUndrawnColor);
+		if (!image.isNull())
+			painter.drawImage(QPointF(0, 0), image);
+	});
+	PaintOverlay(painter, fDisplay.Hub().Overlay(), fDisplay.Hub().Frame(fStacked).LeftTop());
 }
 
 

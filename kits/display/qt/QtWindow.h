@@ -17,6 +17,7 @@ class QBackingStore;
 class QDragMoveEvent;
 class QDropEvent;
 class QMouseEvent;
+class QPainter;
 class QWheelEvent;
 
 namespace BPrivate {
@@ -48,6 +49,8 @@ public:
 	void ShowDamage();
 	/// Paints \a region of the picture, and what follows the pointer on top.
 	void Paint(const QRegion& region);
+	/// All of it, with the window's left-top at (0, 0).
+	void PaintPicture(QPainter& painter);
 	void CheckScale();
 
 	BRect FrameWithBorder() const;
