@@ -67,6 +67,12 @@ private:
 /// Coordinates are the API's: a point names the centre of a pixel, rects include all four sides. The
 /// buffer has Scale() device pixels for each of these. Straight lines and rects of whole coordinates
 /// cover whole pixels; curves and text are smoothed. An invalid rect draws nothing.
+///
+/// Where the scale is no whole number, a pixel of the API has sometimes one device pixel more than its
+/// neighbour. What is filled covers all of them, so that fills side by side leave no gap. A stroke has the
+/// same number everywhere, as many as fit: it lies at the left and top of the pixels that it names, those
+/// of StrokeRect() at the outer sides. Three parallel lines side by side are an area and fill it.
+///
 /// Not locked: one thread at a time, usually the window's. Nothing here waits for the display's thread.
 class Canvas {
 public:

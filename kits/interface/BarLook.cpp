@@ -86,26 +86,32 @@ TabBorderColor(const BView* view)
 void
 DrawTabSurface(BView* view, BRect frame, BTabView::tab_side side, bool selected, bool enabled)
 {
-	// The corners at the box are square: they are cut off with what reaches below its border.
+	// The corners at the box are square: they are cut off with what reaches below its border. The line
+	// that the tab shares with the box is the box's.
 	BRect shape = frame;
+	BRect shown = frame;
 	const float hidden = kTabRadius + 1;
 	switch (side) {
 		case BTabView::kBottomSide:
 			shape.top -= hidden;
+			shown.top++;
 			break;
 		case BTabView::kLeftSide:
 			shape.right += hidden;
+			shown.right--;
 			break;
 		case BTabView::kRightSide:
 			shape.left -= hidden;
+			shown.left++;
 			break;
 		default:
 			shape.bottom += hidden;
+			shown.bottom--;
 			break;
 	}
 
 	view->PushState();
-	BRegion visible(frame);
+	BRegion visible(shown);
 	view->ConstrainClippingRegion(&visible);
 	view->SetHighColor(TabColor(view, selected, enabled));
 	view->FillRoundRect(shape, kTabRadius, kTabRadius);

@@ -69,24 +69,25 @@ BColorControl::Draw(BRect)
 {
 	BRect bevel(0, 0, PaletteWidth() - 1, PaletteHeight() - 1);
 	const bool focused = IsFocus() && Window()->IsActive();
-	SetHighColor(BPrivate::ControlBorderColor({IsEnabled(), false, false}));
-	StrokeRect(bevel.InsetByCopy(1, 1));
+	const rgb_color border = BPrivate::ControlBorderColor({IsEnabled(), false, false});
+	const rgb_color focus = ui_color(B_KEYBOARD_NAVIGATION_COLOR);
+	if (focused) {
+		BPrivate::DrawDoubleFrame(this, bevel, focus, border);
+	} else {
+		SetHighColor(border);
+		StrokeRect(bevel.InsetByCopy(1, 1));
+	}
 	for (int32 ramp = 0; ramp < kRampCount; ramp++) {
 		DrawRamp(ramp);
 		DrawMarker(ramp);
 	}
-	if (focused) {
-		SetHighColor(ui_color(B_KEYBOARD_NAVIGATION_COLOR));
-		StrokeRect(bevel);
-		// White inside: one of the two lines is seen on any ramp.
-		StrokeRect(RampFrame(fCurrentRamp));
-		SetHighColor(make_color(255, 255, 255));
-		StrokeRect(RampFrame(fCurrentRamp).InsetByCopy(1, 1));
-	}
+	// White inside: one of the two lines is seen on any ramp.
+	if (focused)
+		BPrivate::DrawDoubleFrame(this, RampFrame(fCurrentRamp), focus, make_color(255, 255, 255));
 
 	SetHighColor(BPrivate::StrengthOf(IsEnabled(), ValueAsColor(), ViewColor()));
 	FillRect(fSampleFrame);
-	SetHighColor(BPrivate::ControlBorderColor({IsEnabled(), false, false}));
+	SetHighColor(border);
 	StrokeRect(fSampleFrame);
 }
 

@@ -30,6 +30,19 @@ StrokeRoundFrame(BView* view, BRect frame, float radius, rgb_color color)
 }
 
 
+/// Two lines around \a surface, made of fills below the outer one, so that no scale leaves a gap between them.
+void
+DrawDoubleRoundFrame(
+	BView* view, BRect frame, float radius, rgb_color outer, rgb_color inner, rgb_color surface)
+{
+	view->SetHighColor(inner);
+	view->FillRoundRect(frame, radius, radius);
+	view->SetHighColor(surface);
+	view->FillRoundRect(frame.InsetByCopy(2, 2), radius - 2, radius - 2);
+	StrokeRoundFrame(view, frame, radius, outer);
+}
+
+
 rgb_color
 MarkColor(ControlState state)
 {
@@ -108,20 +121,33 @@ DrawButtonSurface(BView* view, BRect frame, ControlState state, bool isDefault)
 {
 	if (isDefault) {
 		const rgb_color mark = ControlBorderColor({state.enabled, false, false});
-		const BRect around = view->Bounds();
-		StrokeRoundFrame(view, around, kButtonRadius + 2, mark);
-		StrokeRoundFrame(view, around.InsetByCopy(1, 1), kButtonRadius + 1,
-			BlendColors(view->ViewColor(), mark, 0.35f));
+		DrawDoubleRoundFrame(view, view->Bounds(), kButtonRadius + 2, mark,
+			BlendColors(view->ViewColor(), mark, 0.35f), view->ViewColor());
 	}
 
-	view->SetHighColor(ButtonSurfaceColor(state));
-	view->FillRoundRect(frame, kButtonRadius, kButtonRadius);
-	StrokeRoundFrame(view, frame, kButtonRadius, ControlBorderColor(state));
+	const rgb_color surface = ButtonSurfaceColor(state);
+	const rgb_color border = ControlBorderColor(state);
 	if (state.enabled && state.focused) {
-		const rgb_color ring =
-			BlendColors(ButtonSurfaceColor(state), ControlBorderColor(state), 0.5f);
-		StrokeRoundFrame(view, frame.InsetByCopy(1, 1), kButtonRadius - 1, ring);
+		DrawDoubleRoundFrame(
+			view, frame, kButtonRadius, border, BlendColors(surface, border, 0.5f), surface);
+		return;
 	}
+	view->SetHighColor(surface);
+	view->FillRoundRect(frame, kButtonRadius, kButtonRadius);
+	StrokeRoundFrame(view, frame, kButtonRadius, border);
+}
+
+
+void
+DrawDoubleFrame(BView* view, BRect frame, rgb_color outer, rgb_color inner)
+{
+	// The inner line is two pixels wide, the outer one covers half of it: no scale leaves a gap between.
+	view->SetPenSize(2);
+	view->SetHighColor(inner);
+	view->StrokeRect(BRect(frame.left, frame.top, frame.right - 1, frame.bottom - 1));
+	view->SetPenSize(1);
+	view->SetHighColor(outer);
+	view->StrokeRect(frame);
 }
 
 

@@ -36,6 +36,9 @@ rgb_color ControlBorderColor(ControlState state);
 /// The surface of a push button with its border and its focus ring.
 void DrawButtonSurface(BView* view, BRect frame, ControlState state, bool isDefault);
 
+/// Two lines side by side, \a inner within \a outer, which lies on the sides of \a frame.
+void DrawDoubleFrame(BView* view, BRect frame, rgb_color outer, rgb_color inner);
+
 /// The field that text is edited in, and that ticks stand in.
 void DrawFieldSurface(BView* view, BRect frame, ControlState state);
 

@@ -100,15 +100,15 @@ BScrollBar::DrawArrow(Part part)
 	SetHighColor(IsEnabled() ? SurfaceColor(pressed) : ui_color(B_PANEL_BACKGROUND_COLOR));
 	FillRect(frame);
 
-	// A line towards the track; the outline goes around the rest.
+	// A line towards the track; the outline goes around the rest, and over its ends.
 	SetHighColor(EdgeColor(IsEnabled()));
 	const bool back = part == kArrowBack;
 	if (IsVertical()) {
 		const float y = back ? frame.bottom : frame.top;
-		StrokeLine(BPoint(frame.left, y), BPoint(frame.right, y));
+		StrokeLine(BPoint(frame.left - 1, y), BPoint(frame.right + 1, y));
 	} else {
 		const float x = back ? frame.right : frame.left;
-		StrokeLine(BPoint(x, frame.top), BPoint(x, frame.bottom));
+		StrokeLine(BPoint(x, frame.top - 1), BPoint(x, frame.bottom + 1));
 	}
 
 	using BPrivate::ArrowDirection;

@@ -183,10 +183,10 @@ BScrollView::DrawAfterChildren(BRect)
 		StrokeRect(bounds);
 		return;
 	}
-	SetHighColor(fHighlighted ? focus : BPrivate::BlendColors(low, line, 0.4f));
-	StrokeRect(bounds);
-	SetHighColor(fHighlighted ? BPrivate::BlendColors(low, focus, 0.5f) : line);
-	StrokeRect(bounds.InsetByCopy(1, 1));
+	if (fHighlighted)
+		BPrivate::DrawDoubleFrame(this, bounds, focus, BPrivate::BlendColors(low, focus, 0.5f));
+	else
+		BPrivate::DrawDoubleFrame(this, bounds, BPrivate::BlendColors(low, line, 0.4f), line);
 }
 
 

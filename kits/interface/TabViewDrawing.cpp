@@ -193,17 +193,22 @@ void
 BTabView::DrawBox(BRect selectedTabRect)
 {
 	const BRect box = BoxFrame();
+	BRect border = box;
+	if (fBorder == B_NO_BORDER) {
+		// Only the line that the tabs stand on: the other sides lie outside of the view.
+		const float outside = 2;
+		border.InsetBy(-outside, -outside);
+		if (fTabSide == kBottomSide)
+			border.bottom = box.bottom;
+		else if (fTabSide == kLeftSide)
+			border.left = box.left;
+		else if (fTabSide == kRightSide)
+			border.right = box.right;
+		else
+			border.top = box.top;
+	}
 	SetHighColor(BPrivate::TabBorderColor(this));
-	if (fBorder != B_NO_BORDER)
-		StrokeRect(box);
-	else if (fTabSide == kBottomSide)
-		StrokeLine(box.LeftBottom(), box.RightBottom());
-	else if (fTabSide == kLeftSide)
-		StrokeLine(box.LeftTop(), box.LeftBottom());
-	else if (fTabSide == kRightSide)
-		StrokeLine(box.RightTop(), box.RightBottom());
-	else
-		StrokeLine(box.LeftTop(), box.RightTop());
+	StrokeRect(border);
 	if (!selectedTabRect.IsValid())
 		return;
 

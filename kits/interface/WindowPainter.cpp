@@ -3,6 +3,7 @@
 #include "interface/WindowPainter.h"
 
 #include <algorithm>
+#include <cmath>
 #include <vector>
 
 #include <Bitmap.h>
@@ -369,7 +370,7 @@ WindowPainter::FrameChanged(BView* view, BRect oldFrame)
 }
 
 
-// Pixels that stay visible are moved; what comes into sight is drawn.
+// Pixels that stay visible are moved where each goes to one of the device; what comes into sight is drawn.
 void
 WindowPainter::ViewScrolled(BView* view, BPoint delta)
 {
@@ -382,7 +383,10 @@ WindowPainter::ViewScrolled(BView* view, BPoint delta)
 		return;
 	BRect kept = visible & visible.OffsetByCopy(delta);
 	BRegion exposed(visible);
-	if (kept.IsValid()) {
+	const float deviceX = delta.x * fCanvas->Scale();
+	const float deviceY = delta.y * fCanvas->Scale();
+	const bool fits = deviceX == std::floor(deviceX) && deviceY == std::floor(deviceY);
+	if (kept.IsValid() && fits) {
 		BRegion clip(visible);
 		fBegunView = nullptr;
 		fCanvas->SetClip(&clip);

@@ -9,13 +9,20 @@
 
 class DesignScaleTest : public SurfaceTest {
 protected:
-	/// Whether a selection's colour is in the middle of a pixel of the API.
+	/// Whether any of the device pixels that belong to a pixel of the API has a selection's colour: a line need
+	/// not fill them.
 	static bool IsMarked(const WindowPicture& picture, float x, float y)
 	{
 		const float scale = picture.width / 301.0f;
-		const rgb_color color = picture.At(static_cast<int32>(std::floor((x + 0.5f) * scale)),
-			static_cast<int32>(std::floor((y + 0.5f) * scale)));
-		return color.red == 0 && color.green == 200 && color.blue == 200;
+		for (int32 row = std::lround(y * scale); row < std::lround((y + 1) * scale); row++) {
+			for (int32 column = std::lround(x * scale); column < std::lround((x + 1) * scale);
+				 column++) {
+				const rgb_color color = picture.At(column, row);
+				if (color.red == 0 && color.green == 200 && color.blue == 200)
+					return true;
+			}
+		}
+		return false;
 	}
 
 	void CheckSelected(TComponent* component, BRect frame)

@@ -85,6 +85,7 @@ void
 QtCanvas::SetClip(const BRegion* clip)
 {
 	QRect all(0, 0, fBuffer.width, fBuffer.height);
+	fSparseLines.clear();
 	fClip.clear();
 	if (clip == nullptr) {
 		fClip.push_back(all);
@@ -112,11 +113,33 @@ QtCanvas::SetClip(const BRegion* clip)
 QRect
 QtCanvas::DeviceRect(int left, int top, int right, int bottom) const
 {
-	auto edge = [this](int coordinate) {
-		return static_cast<int>(std::lround(
-			std::clamp(static_cast<float>(coordinate), -kFarthest, kFarthest) * fScale));
-	};
-	return QRect(QPoint(edge(left), edge(top)), QPoint(edge(right + 1) - 1, edge(bottom + 1) - 1));
+	return QRect(QPoint(DeviceEdge(left), DeviceEdge(top)),
+		QPoint(DeviceEdge(right + 1) - 1, DeviceEdge(bottom + 1) - 1));
+}
+
+
+int
+QtCanvas::DeviceEdge(int coordinate) const
+{
+	return static_cast<int>(
+		std::lround(std::clamp(static_cast<float>(coordinate), -kFarthest, kFarthest) * fScale));
+}
+
+
+int
+QtCanvas::StrokeWidth(int pixels) const
+{
+	// Rounded down, so that no stroke leaves the pixels that it names. What the scale is short of a
+	// whole number by its type's precision does not count.
+	return std::max(1, static_cast<int>(std::floor(pixels * fScale + 0.001f)));
+}
+
+
+QPointF
+QtCanvas::StrokeCenter(QPoint whole) const
+{
+	const double half = StrokeWidth(1) / 2.0;
+	return QPointF(DeviceEdge(whole.x()) + half, DeviceEdge(whole.y()) + half);
 }
 
 
@@ -164,11 +187,11 @@ QtCanvas::EdgeRect(BRect rect) const
 
 
 QRect
-QtCanvas::DeviceBounds(const QRectF& area) const
+QtCanvas::DeviceBounds(const QRectF& area, double scale) const
 {
 	// One pixel more on each side for what smoothing adds; clamped before it becomes integers.
-	QRectF device(area.left() * fScale - 1, area.top() * fScale - 1, area.width() * fScale + 2,
-		area.height() * fScale + 2);
+	QRectF device(area.left() * scale - 1, area.top() * scale - 1, area.width() * scale + 2,
+		area.height() * scale + 2);
 	return (device & QRectF(fClipBounds)).toAlignedRect() & fClipBounds;
 }
 
@@ -210,6 +233,7 @@ QtCanvas::IsHigh(const pattern& pattern, int x, int y) const
 void
 QtCanvas::FillWhole(const QRect& whole, const pattern& pattern)
 {
+	fSparseLines.clear();
 	if (!whole.isEmpty())
 		FillDevice(Device(whole), pattern);
 }
@@ -241,6 +265,7 @@ QtCanvas::FillDevice(const QRect& device, const pattern& pattern)
 void
 QtCanvas::PaintMask(const Mask& mask, const pattern& pattern)
 {
+	fSparseLines.clear();
 	if (mask.IsEmpty())
 		return;
 	bool isHigh;

@@ -66,6 +66,14 @@ public:
 	QRect DeviceRect(int left, int top, int right, int bottom) const;
 
 private:
+	/// A straight line that leaves device pixels of its pixels free.
+	struct SparseLine {
+		QRect whole;
+		QRect device;
+		Blend blend;
+		struct pattern pattern;
+	};
+
 	/// A rect of the operation in whole pixels of the buffer's coordinates, origin added.
 	QRect WholeRect(BRect rect) const;
 	QPoint WholePoint(BPoint point) const;
@@ -73,7 +81,13 @@ private:
 	QRectF CenterRect(BRect rect) const;
 	QRectF EdgeRect(BRect rect) const;
 	QRect Device(const QRect& whole) const;
-	QRect DeviceBounds(const QRectF& area) const;
+	QRect DeviceBounds(const QRectF& area, double scale) const;
+	/// Where the device pixels of a whole coordinate begin.
+	int DeviceEdge(int coordinate) const;
+	/// How many device pixels a stroke of \a pixels takes: the same number wherever it is.
+	int StrokeWidth(int pixels) const;
+	/// In the middle of the stroke's device pixels.
+	QPointF StrokeCenter(QPoint whole) const;
 	int PenWidth() const;
 	bool HasThinPen() const;
 	uint32* Row(int y) const;
@@ -94,11 +108,19 @@ private:
 	void DrawRun(const char* text, int32 length, BPoint where, float width);
 	bool DrawKnownRun(const char* text, int32 length, BPoint where);
 
-	// Outlines, in the buffer's coordinates
-	void StrokeOutline(const QPainterPath& outline, const pattern& pattern);
-	void FillOutline(const QPainterPath& outline, const pattern& pattern);
+	// Lines side by side, where each leaves device pixels free
+	void JoinLines(const QRect& whole, const QRect& device, const pattern& pattern);
+	void FillRest(const SparseLine& line);
+
+	// Outlines
+	/// \a outline: \a scale device pixels for each of its own.
+	void StrokeOutline(const QPainterPath& outline, double scale, const pattern& pattern);
+	void FillOutline(const QPainterPath& outline, double scale, const pattern& pattern);
 	void StrokeStraight(const QPoint* points, int count, bool closed, const pattern& pattern);
 	void StrokeThickLine(QPoint start, QPoint end, const pattern& pattern);
+	/// The box that a curve is drawn in, and its device pixels for each of its own.
+	QRectF CurveBox(BRect rect, bool stroked, bool keepsShape, double* scale) const;
+	double OutlineWidth() const;
 	QPainterPath PathOf(const CanvasPath& path) const;
 
 	QtFonts& fFonts;
@@ -112,6 +134,9 @@ private:
 	/// Device rects, and the smallest one around them.
 	std::vector<QRect> fClip;
 	QRect fClipBounds;
+
+	/// The latest ones, side by side.
+	std::vector<SparseLine> fSparseLines;
 };
 
 

@@ -68,6 +68,7 @@ QtCanvas::DrawBitmap(const PixelBuffer& bitmap, BRect source, BRect destination,
 {
 	if (!source.IsValid() || !destination.IsValid() || bitmap.bits == nullptr)
 		return;
+	fSparseLines.clear();
 	QRect all(0, 0, bitmap.width, bitmap.height);
 	QRect from(static_cast<int>(std::floor(source.left)), static_cast<int>(std::floor(source.top)),
 		static_cast<int>(source.Width()) + 1, static_cast<int>(source.Height()) + 1);
@@ -112,6 +113,7 @@ QtCanvas::CopyBits(BRect source, BRect destination)
 {
 	if (!source.IsValid() || !destination.IsValid())
 		return;
+	fSparseLines.clear();
 	QRect from = Device(WholeRect(source));
 	QRect to = Device(WholeRect(destination));
 	QRect usable = from & QRect(0, 0, fBuffer.width, fBuffer.height);

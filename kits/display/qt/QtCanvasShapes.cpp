@@ -2,6 +2,7 @@
 // Lines, rects, curves and outlines on the canvas.
 #include <algorithm>
 #include <cmath>
+#include <utility>
 
 #include <QPainter>
 #include <QPainterPath>
@@ -14,6 +15,9 @@
 namespace BPrivate {
 
 namespace {
+
+const double kFarthestPen = 1 << 20;
+
 
 Qt::PenCapStyle
 CapStyle(cap_mode mode)
@@ -86,8 +90,7 @@ QtCanvas::StrokeThickLine(QPoint start, QPoint end, const pattern& pattern)
 	int width = PenWidth();
 	int before = (width - 1) / 2;
 	int after = width / 2;
-	QRect line = QRect(start, end).normalized();
-	line = QRect(QPoint(std::min(start.x(), end.x()), std::min(start.y(), end.y())),
+	QRect line = QRect(QPoint(std::min(start.x(), end.x()), std::min(start.y(), end.y())),
 		QPoint(std::max(start.x(), end.x()), std::max(start.y(), end.y())));
 	bool isVertical = start.x() == end.x() && start.y() != end.y();
 	bool extends = fState.lineCap == B_SQUARE_CAP;
@@ -95,7 +98,70 @@ QtCanvas::StrokeThickLine(QPoint start, QPoint end, const pattern& pattern)
 		line.adjust(-before, 0, after, 0);
 	if (!isVertical || extends)
 		line.adjust(0, -before, 0, after);
-	FillWhole(line, pattern);
+
+	QRect device = Device(line);
+	// A point is the pixel that it names, so that pictures can be made of them.
+	if (line.size() != QSize(1, 1)) {
+		// The pen is a square: lines meet at their corners as its steps do.
+		const QSize last = isVertical ? QSize(width, 1) : QSize(1, width);
+		device.setRight(
+			DeviceEdge(line.right() + 1 - last.width()) + StrokeWidth(last.width()) - 1);
+		device.setBottom(
+			DeviceEdge(line.bottom() + 1 - last.height()) + StrokeWidth(last.height()) - 1);
+	}
+	FillDevice(device, pattern);
+	if (fScale != std::floor(fScale))
+		JoinLines(line, device, pattern);
+}
+
+
+/// Lines side by side, as gradients and graphs are drawn with, leave nothing free. Two are an edge with a
+/// light and a dark side; from the third one on they are an area.
+void
+QtCanvas::JoinLines(const QRect& whole, const QRect& device, const pattern& pattern)
+{
+	const SparseLine line = {whole, device, fBlend, pattern};
+	auto isBeside = [](const QRect& one, const QRect& other) {
+		if (one.size() == QSize(1, 1)
+			|| (one.width() > one.height()) != (other.width() > other.height()))
+			return false;
+		if (one.width() > one.height())
+			return (one.bottom() + 1 == other.top() || other.bottom() + 1 == one.top())
+				&& one.left() <= other.right() && other.left() <= one.right();
+		return (one.right() + 1 == other.left() || other.right() + 1 == one.left())
+			&& one.top() <= other.bottom() && other.top() <= one.bottom();
+	};
+	if (!fSparseLines.empty() && !isBeside(fSparseLines.back().whole, whole))
+		fSparseLines.clear();
+	fSparseLines.push_back(line);
+	if (fSparseLines.size() < 3)
+		return;
+	if (fSparseLines.size() == 3) {
+		FillRest(fSparseLines[0]);
+		FillRest(fSparseLines[1]);
+	}
+	FillRest(line);
+	// The count is all that matters from here on.
+	if (fSparseLines.size() > 4)
+		fSparseLines.erase(fSparseLines.begin());
+}
+
+
+void
+QtCanvas::FillRest(const SparseLine& line)
+{
+	const Blend blend = std::exchange(fBlend, line.blend);
+	const QRect all = Device(line.whole);
+	QRect beside = all;
+	beside.setLeft(line.device.right() + 1);
+	QRect below = all;
+	below.setTop(line.device.bottom() + 1);
+	below.setRight(line.device.right());
+	for (const QRect& rest : {beside, below}) {
+		if (!rest.isEmpty())
+			FillDevice(rest, line.pattern);
+	}
+	fBlend = blend;
 }
 
 
@@ -123,13 +189,12 @@ QtCanvas::StrokeStraight(const QPoint* points, int count, bool closed, const pat
 		return;
 	}
 
-	QPointF half(0.5, 0.5);
-	QPainterPath path(points[0] + half);
+	QPainterPath path(StrokeCenter(points[0]));
 	for (int i = 1; i < count; i++)
-		path.lineTo(points[i] + half);
+		path.lineTo(StrokeCenter(points[i]));
 	if (closed)
 		path.closeSubpath();
-	StrokeOutline(path, pattern);
+	StrokeOutline(path, 1, pattern);
 }
 
 
@@ -146,12 +211,17 @@ QtCanvas::StrokeRect(BRect rect, const pattern& pattern)
 		FillWhole(outer, pattern);
 		return;
 	}
-	// Four pieces that do not overlap: modes such as invert must meet each pixel once.
-	FillWhole(QRect(outer.left(), outer.top(), outer.width(), width), pattern);
-	FillWhole(QRect(outer.left(), outer.bottom() - width + 1, outer.width(), width), pattern);
-	int sideHeight = outer.height() - 2 * width;
-	FillWhole(QRect(outer.left(), outer.top() + width, width, sideHeight), pattern);
-	FillWhole(QRect(outer.right() - width + 1, outer.top() + width, width, sideHeight), pattern);
+	fSparseLines.clear();
+	// Four pieces that do not overlap: modes such as invert must meet each pixel once. They keep to the
+	// outer sides, where a rect that is filled ends too.
+	const QRect device = Device(outer);
+	const int stroke = StrokeWidth(width);
+	FillDevice(QRect(device.left(), device.top(), device.width(), stroke), pattern);
+	FillDevice(QRect(device.left(), device.bottom() - stroke + 1, device.width(), stroke), pattern);
+	const int sideTop = device.top() + stroke;
+	const int sideHeight = device.height() - 2 * stroke;
+	FillDevice(QRect(device.left(), sideTop, stroke, sideHeight), pattern);
+	FillDevice(QRect(device.right() - stroke + 1, sideTop, stroke, sideHeight), pattern);
 }
 
 
@@ -185,14 +255,40 @@ QtCanvas::FillRegion(const BRegion& region, const pattern& pattern)
 // #pragma mark - curves
 
 
+/// At a scale that is no whole number the sides of a rect of whole pixels go to device pixels, as those of
+/// straight lines do; \a keepsShape: to the same number of them wherever it is.
+QRectF
+QtCanvas::CurveBox(BRect rect, bool stroked, bool keepsShape, double* scale) const
+{
+	*scale = fScale;
+	const QRectF edges = EdgeRect(rect);
+	const QRect whole = edges.toAlignedRect();
+	if (fScale == std::floor(fScale) || QRectF(whole) != edges)
+		return stroked ? CenterRect(rect) : edges;
+
+	*scale = 1;
+	QRectF device = Device(whole);
+	if (keepsShape)
+		device.setSize(QSizeF(StrokeWidth(whole.width()), StrokeWidth(whole.height())));
+	if (stroked) {
+		const double half = StrokeWidth(1) / 2.0;
+		device.adjust(half, half, -half, -half);
+	}
+	return device;
+}
+
+
 void
 QtCanvas::StrokeRoundRect(BRect rect, float xRadius, float yRadius, const pattern& pattern)
 {
 	if (!rect.IsValid() || PaintRounded(rect, xRadius, yRadius, true, pattern))
 		return;
+	double scale;
+	const QRectF box = CurveBox(rect, true, false, &scale);
+	const double zoom = fScale / scale;
 	QPainterPath path;
-	path.addRoundedRect(CenterRect(rect), xRadius, yRadius);
-	StrokeOutline(path, pattern);
+	path.addRoundedRect(box, xRadius * zoom, yRadius * zoom);
+	StrokeOutline(path, scale, pattern);
 }
 
 
@@ -201,9 +297,12 @@ QtCanvas::FillRoundRect(BRect rect, float xRadius, float yRadius, const pattern&
 {
 	if (!rect.IsValid() || PaintRounded(rect, xRadius, yRadius, false, pattern))
 		return;
+	double scale;
+	const QRectF box = CurveBox(rect, false, false, &scale);
+	const double zoom = fScale / scale;
 	QPainterPath path;
-	path.addRoundedRect(EdgeRect(rect), xRadius, yRadius);
-	FillOutline(path, pattern);
+	path.addRoundedRect(box, xRadius * zoom, yRadius * zoom);
+	FillOutline(path, scale, pattern);
 }
 
 
@@ -212,9 +311,10 @@ QtCanvas::StrokeEllipse(BRect rect, const pattern& pattern)
 {
 	if (!rect.IsValid())
 		return;
+	double scale;
 	QPainterPath path;
-	path.addEllipse(CenterRect(rect));
-	StrokeOutline(path, pattern);
+	path.addEllipse(CurveBox(rect, true, true, &scale));
+	StrokeOutline(path, scale, pattern);
 }
 
 
@@ -223,25 +323,32 @@ QtCanvas::FillEllipse(BRect rect, const pattern& pattern)
 {
 	if (!rect.IsValid())
 		return;
+	double scale;
 	QPainterPath path;
-	path.addEllipse(EdgeRect(rect));
-	FillOutline(path, pattern);
+	path.addEllipse(CurveBox(rect, false, true, &scale));
+	FillOutline(path, scale, pattern);
 }
 
 
 void
 QtCanvas::StrokeArc(BRect rect, float startAngle, float arcAngle, const pattern& pattern)
 {
-	if (rect.IsValid())
-		StrokeOutline(ArcPath(CenterRect(rect), startAngle, arcAngle, false), pattern);
+	if (!rect.IsValid())
+		return;
+	double scale;
+	const QRectF box = CurveBox(rect, true, true, &scale);
+	StrokeOutline(ArcPath(box, startAngle, arcAngle, false), scale, pattern);
 }
 
 
 void
 QtCanvas::FillArc(BRect rect, float startAngle, float arcAngle, const pattern& pattern)
 {
-	if (rect.IsValid())
-		FillOutline(ArcPath(EdgeRect(rect), startAngle, arcAngle, true), pattern);
+	if (!rect.IsValid())
+		return;
+	double scale;
+	const QRectF box = CurveBox(rect, false, true, &scale);
+	FillOutline(ArcPath(box, startAngle, arcAngle, true), scale, pattern);
 }
 
 
@@ -271,21 +378,22 @@ QtCanvas::FillPolygon(const BPoint* points, int32 count, const pattern& pattern)
 	QPolygonF polygon;
 	for (int32 i = 0; i < count; i++) {
 		whole.push_back(WholePoint(points[i]));
-		polygon << whole.back() + QPointF(0.5, 0.5);
+		polygon << StrokeCenter(whole.back());
 	}
 
 	// The corners name pixels, and each of these belongs to the polygon: it is filled without
 	// smoothing, and its outline is added.
-	Mask mask(DeviceBounds(polygon.boundingRect().adjusted(-1, -1, 1, 1)));
+	const int reach = StrokeWidth(1);
+	Mask mask(DeviceBounds(polygon.boundingRect().adjusted(-reach, -reach, reach, reach), 1));
 	if (mask.IsEmpty())
 		return;
 	QPainter painter(&mask.Image());
 	painter.setRenderHint(QPainter::Antialiasing, fScale != 1);
 	painter.translate(-mask.Area().topLeft());
-	painter.scale(fScale, fScale);
 	painter.setBrush(Qt::white);
-	painter.setPen(fScale == 1 ? QPen(Qt::NoPen)
-							   : QPen(Qt::white, 1, Qt::SolidLine, Qt::SquareCap, Qt::MiterJoin));
+	painter.setPen(fScale == 1
+			? QPen(Qt::NoPen)
+			: QPen(Qt::white, StrokeWidth(1), Qt::SolidLine, Qt::SquareCap, Qt::MiterJoin));
 	painter.drawPolygon(polygon, fState.fillRule == B_EVEN_ODD ? Qt::OddEvenFill : Qt::WindingFill);
 	painter.end();
 	for (size_t i = 0; fScale == 1 && i < whole.size(); i++)
@@ -327,7 +435,7 @@ QtCanvas::PathOf(const CanvasPath& path) const
 void
 QtCanvas::StrokePath(const CanvasPath& path, const pattern& pattern)
 {
-	StrokeOutline(PathOf(path), pattern);
+	StrokeOutline(PathOf(path), fScale, pattern);
 }
 
 
@@ -336,16 +444,26 @@ QtCanvas::FillPath(const CanvasPath& path, const pattern& pattern)
 {
 	QPainterPath outline = PathOf(path);
 	outline.setFillRule(fState.fillRule == B_EVEN_ODD ? Qt::OddEvenFill : Qt::WindingFill);
-	FillOutline(outline, pattern);
+	FillOutline(outline, fScale, pattern);
+}
+
+
+/// In device pixels; of whole pens the same as straight lines have.
+double
+QtCanvas::OutlineWidth() const
+{
+	const double width = std::max(fState.penSize, 1.0f);
+	return width == std::floor(width) && width < kFarthestPen ? StrokeWidth(static_cast<int>(width))
+															  : width * fScale;
 }
 
 
 void
-QtCanvas::StrokeOutline(const QPainterPath& outline, const pattern& pattern)
+QtCanvas::StrokeOutline(const QPainterPath& outline, double scale, const pattern& pattern)
 {
-	qreal width = std::max(fState.penSize, 1.0f);
-	qreal reach = width * std::max(fState.miterLimit, 2.0f) / 2 + 1;
-	Mask mask(DeviceBounds(outline.boundingRect().adjusted(-reach, -reach, reach, reach)));
+	const double width = OutlineWidth() / scale;
+	const double reach = width * std::max(fState.miterLimit, 2.0f) / 2 + 1;
+	Mask mask(DeviceBounds(outline.boundingRect().adjusted(-reach, -reach, reach, reach), scale));
 	if (mask.IsEmpty())
 		return;
 
@@ -354,7 +472,7 @@ QtCanvas::StrokeOutline(const QPainterPath& outline, const pattern& pattern)
 	QPainter painter(&mask.Image());
 	painter.setRenderHint(QPainter::Antialiasing);
 	painter.translate(-mask.Area().topLeft());
-	painter.scale(fScale, fScale);
+	painter.scale(scale, scale);
 	painter.strokePath(outline, pen);
 	painter.end();
 	PaintMask(mask, pattern);
@@ -362,15 +480,15 @@ QtCanvas::StrokeOutline(const QPainterPath& outline, const pattern& pattern)
 
 
 void
-QtCanvas::FillOutline(const QPainterPath& outline, const pattern& pattern)
+QtCanvas::FillOutline(const QPainterPath& outline, double scale, const pattern& pattern)
 {
-	Mask mask(DeviceBounds(outline.boundingRect()));
+	Mask mask(DeviceBounds(outline.boundingRect(), scale));
 	if (mask.IsEmpty())
 		return;
 	QPainter painter(&mask.Image());
 	painter.setRenderHint(QPainter::Antialiasing);
 	painter.translate(-mask.Area().topLeft());
-	painter.scale(fScale, fScale);
+	painter.scale(scale, scale);
 	painter.fillPath(outline, Qt::white);
 	painter.end();
 	PaintMask(mask, pattern);

@@ -93,6 +93,7 @@ QtCanvas::DrawString(const char* text, int32 length, const BPoint* locations, in
 void
 QtCanvas::DrawRun(const char* text, int32 length, BPoint where, float width)
 {
+	fSparseLines.clear();
 	if (DrawKnownRun(text, length, where))
 		return;
 	// What is far outside needs no characters.
@@ -105,7 +106,7 @@ QtCanvas::DrawRun(const char* text, int32 length, BPoint where, float width)
 	// The baseline is the upper side of the row that it names: a capital ends in the row above.
 	QPointF base(where.x + fState.origin.x, where.y + fState.origin.y);
 	QRectF area = transform.mapRect(box).translated(base);
-	Mask mask(DeviceBounds(area));
+	Mask mask(DeviceBounds(area, fScale));
 	if (mask.IsEmpty())
 		return;
 
