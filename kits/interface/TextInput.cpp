@@ -82,6 +82,13 @@ TextInput::MakeFocus(bool focus)
 }
 
 
+bool
+TextInput::AcceptsDrop(const BMessage* message)
+{
+	return fControl->IsEnabled() && BTextView::AcceptsDrop(message);
+}
+
+
 void
 TextInput::InsertText(const char* text, int32 length, int32 offset, const text_run_array* runs)
 {

@@ -18,6 +18,7 @@ public:
 	void MouseDown(BPoint where) override;
 	void KeyDown(const char* bytes, int32 numBytes) override;
 	void MakeFocus(bool focus = true) override;
+	bool AcceptsDrop(const BMessage* message) override;
 
 protected:
 	/// Line breaks become blanks.

@@ -188,4 +188,18 @@ CopyRuns(const TextStyles& styles, int32 from, int32 to)
 	return runs;
 }
 
+
+RunArray
+JoinRuns(const text_run_array& first, int32 firstLength, const text_run_array& second)
+{
+	RunArray runs(BTextView::CopyRunArray(&first, second.count));
+	if (runs == nullptr)
+		return runs;
+	for (int32 i = 0; i < second.count; i++) {
+		runs->runs[first.count + i] = second.runs[i];
+		runs->runs[first.count + i].offset += firstLength;
+	}
+	return runs;
+}
+
 } // namespace BPrivate

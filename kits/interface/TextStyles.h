@@ -65,10 +65,11 @@ private:
 struct RunArrayDeleter {
 	void operator()(text_run_array* runs) const { BTextView::FreeRunArray(runs); }
 };
-typedef std::unique_ptr<text_run_array, RunArrayDeleter> RunArray;
 
 /// The styles of a range, their offsets counted from its start; never empty.
 RunArray CopyRuns(const TextStyles& styles, int32 from, int32 to);
+/// Those of a text of so many bytes, and of another one behind it. Null when there is no memory.
+RunArray JoinRuns(const text_run_array& first, int32 firstLength, const text_run_array& second);
 
 /// The run array in \a size bytes of outside data; null when they are none.
 RunArray ReadFlatRuns(const void* data, ssize_t size);

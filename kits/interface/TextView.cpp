@@ -68,7 +68,10 @@ BTextView::BTextView(BRect frame, const char* name, BRect textRect, const BFont*
 	  fWordWrap(true),
 	  fStylable(false),
 	  fAutoindent(false),
-	  fSelecting(false)
+	  fSelecting(false),
+	  fMayDrag(false),
+	  fDragId(0),
+	  fDropPlace(-1)
 {
 	SetViewColor(ui_color(B_DOCUMENT_BACKGROUND_COLOR));
 	SetLowColor(ViewColor());
@@ -110,7 +113,10 @@ BTextView::BTextView(BMessage* archive)
 	  fWordWrap(true),
 	  fStylable(false),
 	  fAutoindent(false),
-	  fSelecting(false)
+	  fSelecting(false),
+	  fMayDrag(false),
+	  fDragId(0),
+	  fDropPlace(-1)
 {
 	archive->FindRect("_trect", &fTextRect);
 	BPrivate::TextStyle style = fStyles->At(0);
@@ -645,13 +651,10 @@ BTextView::Draw(BRect updateRect)
 	for (int32 line = first; line <= last; line++)
 		DrawLine(line, updateRect);
 
-	if (ShowsCaret()) {
-		float height;
-		const BPoint top = PointAt(fCaret, &height);
-		const float x = std::floor(top.x);
-		SetHighColor(DrawnColor(fStyles->At(std::max<int32>(fCaret - 1, 0)).color));
-		StrokeLine(BPoint(x, top.y), BPoint(x, top.y + height - 1));
-	}
+	if (fDropPlace >= 0)
+		DrawCaret(fDropPlace);
+	else if (ShowsCaret())
+		DrawCaret(fCaret);
 	SetDrawingMode(B_OP_COPY);
 }
 
@@ -659,24 +662,12 @@ BTextView::Draw(BRect updateRect)
 void
 BTextView::DrawLine(int32 line, BRect updateRect)
 {
-	const int32 start = fLayout->LineStart(line);
-	const int32 end = fLayout->LineEnd(line);
-	const BPoint top = PointAt(start);
-	int32 selectionStart;
-	int32 selectionEnd;
-	GetSelection(&selectionStart, &selectionEnd);
-	const int32 from = std::max(start, selectionStart);
-	const int32 to = std::min(end, selectionEnd);
-	// A selection that goes on in the next line includes the line break.
-	const bool breakSelected = selectionStart <= end && selectionEnd > end;
-	const bool active = Window()->IsActive();
-	if (fSelectable && IsFocus() && (from < to || (breakSelected && from <= to))) {
-		const float left = std::floor(top.x + fLayout->XAt(line, from));
-		const float right = breakSelected ? std::max(fTextRect.right, Bounds().right)
-										  : std::ceil(top.x + fLayout->XAt(line, to)) - 1;
+	const BPoint top = PointAt(fLayout->LineStart(line));
+	const BRect marked = SelectionIn(line);
+	if (marked.IsValid()) {
 		const rgb_color mark = ui_color(B_LIST_SELECTED_BACKGROUND_COLOR);
-		SetHighColor(BPrivate::BlendColors(ViewColor(), mark, active ? 1.0f : 0.5f));
-		FillRect(BRect(left, top.y, right, top.y + fLayout->LineHeight(line) - 1));
+		SetHighColor(BPrivate::BlendColors(ViewColor(), mark, Window()->IsActive() ? 1.0f : 0.5f));
+		FillRect(marked);
 	}
 
 	// Of a long line only what is seen, and what reaches into it.
@@ -693,6 +684,17 @@ BTextView::DrawLine(int32 line, BRect updateRect)
 		DrawString(text.data(), static_cast<int32>(text.size()),
 			BPoint(top.x + piece.x, top.y + fLayout->Ascent(line)));
 	}
+}
+
+
+void
+BTextView::DrawCaret(int32 offset)
+{
+	float height;
+	const BPoint top = PointAt(offset, &height);
+	const float x = std::floor(top.x);
+	SetHighColor(DrawnColor(fStyles->At(std::max<int32>(offset - 1, 0)).color));
+	StrokeLine(BPoint(x, top.y), BPoint(x, top.y + height - 1));
 }
 
 

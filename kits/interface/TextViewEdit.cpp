@@ -251,17 +251,41 @@ BTextView::Copy(BClipboard* clipboard)
 	if (start == end || IsTypingHidden() || clipboard == NULL || !clipboard->Lock())
 		return;
 	clipboard->Clear();
-	clipboard->Data()->AddData(kPlainText, B_MIME_TYPE, fText.data() + start, end - start);
-	if (fStylable) {
-		const BPrivate::RunArray runs = BPrivate::CopyRuns(*fStyles, start, end);
-		int32 size = 0;
-		if (void* data = FlattenRunArray(runs.get(), &size)) {
-			clipboard->Data()->AddData(kRunArray, B_MIME_TYPE, data, size);
-			free(data);
-		}
-	}
+	AddSelection(clipboard->Data());
 	clipboard->Commit();
 	clipboard->Unlock();
+}
+
+
+/// As the clipboard and drags carry it.
+void
+BTextView::AddSelection(BMessage* message) const
+{
+	int32 start;
+	int32 end;
+	GetSelection(&start, &end);
+	message->AddData(kPlainText, B_MIME_TYPE, fText.data() + start, end - start);
+	if (!fStylable)
+		return;
+	const BPrivate::RunArray runs = BPrivate::CopyRuns(*fStyles, start, end);
+	int32 size = 0;
+	if (void* data = FlattenRunArray(runs.get(), &size)) {
+		message->AddData(kRunArray, B_MIME_TYPE, data, size);
+		free(data);
+	}
+}
+
+
+/// No runs for a text that is not stylable, or when there are none.
+void
+BTextView::ReadText(const BMessage& message, std::string* text, BPrivate::RunArray* runs) const
+{
+	const void* data = NULL;
+	ssize_t size = 0;
+	if (fStylable && message.FindData(kRunArray, B_MIME_TYPE, &data, &size) == B_OK)
+		*runs = BPrivate::ReadFlatRuns(data, size);
+	if (message.FindData(kPlainText, B_MIME_TYPE, &data, &size) == B_OK)
+		text->assign(static_cast<const char*>(data), strnlen(static_cast<const char*>(data), size));
 }
 
 
@@ -270,14 +294,9 @@ BTextView::Paste(BClipboard* clipboard)
 {
 	if (!fEditable || clipboard == NULL || !clipboard->Lock())
 		return;
-	const void* data = NULL;
-	ssize_t size = 0;
 	std::string text;
 	BPrivate::RunArray runs;
-	if (fStylable && clipboard->Data()->FindData(kRunArray, B_MIME_TYPE, &data, &size) == B_OK)
-		runs = BPrivate::ReadFlatRuns(data, size);
-	if (clipboard->Data()->FindData(kPlainText, B_MIME_TYPE, &data, &size) == B_OK)
-		text.assign(static_cast<const char*>(data), strnlen(static_cast<const char*>(data), size));
+	ReadText(*clipboard->Data(), &text, &runs);
 	clipboard->Unlock();
 
 	int32 start;
@@ -372,19 +391,7 @@ void
 BTextView::MessageReceived(BMessage* message)
 {
 	if (message->WasDropped() && AcceptsDrop(message)) {
-		const void* data;
-		ssize_t size;
-		if (message->FindData(kPlainText, B_MIME_TYPE, &data, &size) != B_OK)
-			return;
-		const char* text = static_cast<const char*>(data);
-		const int32 length = static_cast<int32>(strnlen(text, size));
-		if (length == 0 || !IsAllowed(text, length, 0))
-			return;
-		const int32 offset = OffsetAt(ConvertFromScreen(message->DropPoint()));
-		SealUndo();
-		Replace(offset, offset, text, length);
-		SealUndo();
-		ScrollToSelection();
+		TakeDrop(message);
 		return;
 	}
 

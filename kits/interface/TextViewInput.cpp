@@ -225,7 +225,9 @@ BTextView::MouseDown(BPoint where)
 {
 	if (!fSelectable && !fEditable)
 		return;
-	if (!IsFocus())
+	// What the press itself selects, by giving the focus, is not what it is on.
+	const bool showedSelection = IsFocus();
+	if (!showedSelection)
 		MakeFocus(true);
 
 	const int32 offset = OffsetAt(where);
@@ -242,7 +244,9 @@ BTextView::MouseDown(BPoint where)
 	} else if (fSelectable && clicks >= 3) {
 		const int32 line = LineAt(offset);
 		Select(OffsetAt(line), fLayout->LineEnd(line));
-	} else {
+	} else if (extend || !showedSelection
+		|| (MessageNumber(this, "buttons") & B_PRIMARY_MOUSE_BUTTON) == 0
+		|| !BeginPressOnSelection(where)) {
 		MoveCaret(offset, extend && fSelectable);
 		fSelecting = fSelectable;
 		SetMouseEventMask(B_POINTER_EVENTS, B_NO_POINTER_HISTORY | B_LOCK_WINDOW_FOCUS);
@@ -253,6 +257,8 @@ BTextView::MouseDown(BPoint where)
 void
 BTextView::MouseUp(BPoint)
 {
+	if (fMayDrag)
+		MoveCaret(OffsetAt(fPressed), false);
 	StopSelecting();
 }
 
@@ -261,6 +267,9 @@ void
 BTextView::MouseMoved(BPoint where, uint32 code, const BMessage* dragMessage)
 {
 	BView::MouseMoved(where, code, dragMessage);
+	FollowDrag(where, code, dragMessage);
 	if (fSelecting)
 		SelectTo(where);
+	else if (fMayDrag && dragMessage == NULL)
+		DragWhenFarEnough(where);
 }

@@ -221,5 +221,6 @@ void
 BTextView::StopSelecting()
 {
 	fSelecting = false;
+	fMayDrag = false;
 	fScrollOn.reset();
 }

@@ -34,6 +34,8 @@ struct TextChange;
 class TextLayout;
 class TextStyles;
 class TextUndo;
+struct RunArrayDeleter;
+typedef std::unique_ptr<text_run_array, RunArrayDeleter> RunArray;
 } // namespace BPrivate
 
 /// UTF-8 text in lines. Offsets are bytes; a selection without length is the caret.
@@ -219,10 +221,21 @@ private:
 	void ScrollOn();
 	void StopSelecting();
 
+	// Dragging
+	BRect SelectionIn(int32 line) const;
+	bool BeginPressOnSelection(BPoint where);
+	void DragWhenFarEnough(BPoint where);
+	void FollowDrag(BPoint where, uint32 code, const BMessage* dragMessage);
+	void TakeDrop(const BMessage* message);
+	bool MoveSelection(int32 offset);
+	void AddSelection(BMessage* message) const;
+	void ReadText(const BMessage& message, std::string* text, BPrivate::RunArray* runs) const;
+
 	// Picture
 	void Relayout();
 	void InvalidateText();
 	void DrawLine(int32 line, BRect updateRect);
+	void DrawCaret(int32 offset);
 	bool ShowsCaret() const;
 	BSize ContentSize() const;
 	BPoint LastPlace() const;
@@ -253,6 +266,12 @@ private:
 	bool fStylable;
 	bool fAutoindent;
 	bool fSelecting;
+	// The press was on what is selected, and nothing has come of it yet.
+	bool fMayDrag;
+	BPoint fPressed;
+	// The last one that began here, and where one over the view would be dropped, or -1.
+	int64 fDragId;
+	int32 fDropPlace;
 };
 
 #endif // _TEXT_VIEW_H

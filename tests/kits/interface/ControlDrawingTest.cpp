@@ -367,6 +367,41 @@ TEST_F(ControlDrawingTest, TextControlShowsItsStates)
 }
 
 
+TEST_F(ControlDrawingTest, ATextShowsWhereWhatIsDraggedOverItWouldGo)
+{
+	const BRect kInside(4, 4, 96, 46);
+	auto* source = Add(new BTextView(BRect(10, 10, 110, 60), "source", kInside, B_FOLLOW_NONE));
+	auto* target = Add(new BTextView(BRect(150, 10, 250, 60), "target", kInside, B_FOLLOW_NONE));
+	source->SetText("word");
+	target->SetText("      ");
+	Show();
+	Do([&] {
+		source->MakeFocus();
+		source->SelectAll();
+	});
+	float height = 0;
+	const BPoint place = Ask([&] { return target->ConvertToParent(target->PointAt(3, &height)); });
+	const float x = std::floor(place.x);
+	const BRect caret(x, place.y, x, place.y + height - 1);
+	const auto Dark = [&] { return DarkPixels(Picture(), caret); };
+
+	fRobot->MoveTo(BPoint(20, 20));
+	fRobot->Press();
+	fRobot->MoveTo(BPoint(30, 30));
+	EXPECT_EQ(Dark(), 0);
+	fRobot->MoveTo(place + BPoint(1, 5));
+	EXPECT_EQ(Dark(), height);
+	fRobot->MoveTo(BPoint(280, 150));
+	EXPECT_EQ(Dark(), 0);
+	fRobot->MoveTo(place + BPoint(1, 5));
+	EXPECT_EQ(Dark(), height);
+	EXPECT_TRUE(fRobot->Key("escape"));
+	EXPECT_EQ(Dark(), 0);
+	fRobot->Release();
+	EXPECT_EQ(TextOf(target), "      ");
+}
+
+
 TEST_F(ControlDrawingTest, SelectionIsShownWhileFocused)
 {
 	BTextView* view = Add(new BTextView(

@@ -251,6 +251,8 @@ TEST_F(TextViewDragTest, TextControlScrollsSideways)
 	BTextControl* control = Add(new BTextControl(
 		BRect(100, 20, 199, 49), "control", NULL, std::string(30, 'm').c_str(), NULL));
 	Show(control->TextView(), std::string(30, 'm'));
+	// What is selected would be dragged.
+	Do([this] { fView->Select(0, 0); });
 	DragFrom(1, BPoint(280, 190));
 	EXPECT_TRUE(Becomes([this] {
 		int32 end;
