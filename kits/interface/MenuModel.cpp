@@ -133,6 +133,9 @@ void
 MenuModel::CloseWindows(BMenu* menu)
 {
 	MenuLock lock(menu);
+	// In no window, so that none is open below it either. Another thread may just have taken it out.
+	if (!lock.IsLocked())
+		return;
 	auto window = dynamic_cast<MenuWindow*>(menu->Window());
 	if (window == nullptr && !Of(menu).isBar)
 		return;

@@ -92,6 +92,9 @@ public:
 	explicit MenuLock(const BMenu* menu);
 	~MenuLock();
 
+	/// Whether the menu is in a looper, where it stays as long as this exists.
+	bool IsLocked() const { return fLooper != nullptr; }
+
 	MenuLock(const MenuLock&) = delete;
 	MenuLock& operator=(const MenuLock&) = delete;
 
