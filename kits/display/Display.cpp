@@ -14,6 +14,7 @@
 #include "display/FontSettings.h"
 #include "display/NoneDisplay.h"
 #include "display/RobotScript.h"
+#include "kernel/ProgramEnd.h"
 
 namespace BPrivate {
 
@@ -67,7 +68,7 @@ StartModule()
 		fprintf(stderr, "libbe: no display: %s; nothing will be shown\n", reason);
 		return nullptr;
 	}
-	atexit(StopModule);
+	call_at_program_end(StopModule);
 	return display;
 }
 

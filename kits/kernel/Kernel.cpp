@@ -350,6 +350,21 @@ copy_name(char (&to)[B_OS_NAME_LENGTH], const char* name)
 
 
 void
+stay_until_program_end()
+{
+	{
+		KernelSection section;
+		Thread* thread = section.Current();
+		if (thread->kind != Thread::Kind::kSpawned)
+			return;
+		end_thread_record(thread);
+	}
+	for (;;)
+		pause();
+}
+
+
+void
 adopt_thread_record(const std::shared_ptr<Thread>& thread)
 {
 	thread->hostId = gettid();

@@ -177,6 +177,10 @@ void announce_thread_end();
 /// \a timeout: microseconds, for all of them. Returns B_OK, B_TIMED_OUT or B_INTERRUPTED.
 status_t wait_for_announced_ends(bigtime_t timeout);
 
+/// Ends the calling thread, if made by spawn_thread(), for all who wait for it, and keeps it as it is until the
+/// process goes: for a thread that cannot be taken apart, as what that needs is gone. Returns in other threads.
+void stay_until_program_end();
+
 /// Makes \a thread the calling one's record until its end.
 void adopt_thread_record(const std::shared_ptr<Thread>& thread);
 /// Lets the thread look at its flags now.

@@ -10,6 +10,7 @@
 #include <unistd.h>
 
 #include "kernel/Kernel.h"
+#include "kernel/ProgramEnd.h"
 #include "kernel/Team.h"
 #include "support/HostError.h"
 
@@ -50,6 +51,7 @@ thread_main(void* argument)
 	tThreadId = thread->id;
 	record.reset();
 
+	ThreadEndWatch watch;
 	run_thread(thread);
 	return nullptr;
 }

@@ -76,6 +76,7 @@ DisplayThread::DisplayThread()
 	: fWaker(nullptr),
 	  fAccepts(false),
 	  fHasStarted(false),
+	  fHasEnded(false),
 	  fWakeIsPending(false),
 	  fRefused(false)
 {
@@ -149,13 +150,22 @@ DisplayThread::Main(const std::string& platforms, const std::function<void()>& s
 		std::lock_guard<std::mutex> lock(fMutex);
 		fWaker = nullptr;
 	}
-	// The program is at its end, and static objects of Qt that came up late are gone already: taking
+	if (!succeeded)
+		return;
+	// The program is at its end, and static objects of Qt that came up late may be gone already: taking
 	// Qt apart could meet them. Only what is on the clipboard has to be handed over to the host, which
 	// the application object's destructor does.
-	bool keepsClipboard = succeeded && QGuiApplication::clipboard()->ownsClipboard()
-		&& QGuiApplication::platformName() == QLatin1String("xcb");
-	if (succeeded && !keepsClipboard)
-		application.release();
+	if (QGuiApplication::clipboard()->ownsClipboard()
+		&& QGuiApplication::platformName() == QLatin1String("xcb"))
+		application.reset();
+	{
+		std::lock_guard<std::mutex> lock(fMutex);
+		fHasEnded = true;
+	}
+	fCondition.notify_all();
+	// Threads of Qt's own still want to wake this one, which they could not once it has ended.
+	for (;;)
+		pause();
 }
 
 
@@ -234,7 +244,7 @@ DisplayThread::Refuse()
 void
 DisplayThread::Stop(std::function<void()> ending)
 {
-	if (IsCurrent() || !fThread.joinable())
+	if (IsCurrent())
 		return;
 	bool isQueued = Post([this, ending = std::move(ending)] {
 		Refuse();
@@ -242,10 +252,10 @@ DisplayThread::Stop(std::function<void()> ending)
 		// quit() would have Qt close what windows it has of its own, those of a drag for one.
 		QCoreApplication::exit();
 	});
-	if (isQueued)
-		fThread.join();
-	else
-		fThread.detach();
+	if (!isQueued)
+		return;
+	std::unique_lock<std::mutex> lock(fMutex);
+	fCondition.wait(lock, [this] { return fHasEnded; });
 }
 
 

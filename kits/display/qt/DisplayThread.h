@@ -24,7 +24,8 @@ public:
 	/// Returns false, the thread ended, when none of them can be had.
 	bool Start(const std::string& platforms, std::function<void()> started);
 
-	/// Runs \a ending in the thread, then ends Qt and waits for it. Later tasks are refused.
+	/// Runs \a ending in the thread, then ends Qt there and waits for that; the thread itself stays. Later tasks
+	/// are refused.
 	void Stop(std::function<void()> ending);
 
 	/// Queues \a task; false, and nothing happens, when the thread has ended.
@@ -54,6 +55,7 @@ private:
 	QObject* fWaker;
 	bool fAccepts;
 	bool fHasStarted;
+	bool fHasEnded;
 	bool fWakeIsPending;
 	/// Counts up when tasks are thrown away, so that those who wait for them wake.
 	bool fRefused;

@@ -10,6 +10,7 @@
 
 #include "display/qt/CoverPixels.h"
 #include "display/qt/Mask.h"
+#include "display/qt/QtUse.h"
 #include "display/qt/RoundedShape.h"
 
 namespace BPrivate {
@@ -331,6 +332,9 @@ QtCanvas::PaintRounded(
 		|| !IsSolid(pattern, &isHigh) || !fBlend.IsPlainFill(isHigh, &pixel))
 		return false;
 
+	const QtUse use;
+	if (!use)
+		return true;
 	const QRect whole = WholeRect(rect);
 	const RoundedShape& shape = RoundedShape::Of(xRadius, yRadius, stroked);
 	if (whole.width() < shape.Side() || whole.height() < shape.Side())

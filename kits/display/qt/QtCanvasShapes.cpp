@@ -11,6 +11,7 @@
 
 #include "display/qt/Mask.h"
 #include "display/qt/QtCanvas.h"
+#include "display/qt/QtUse.h"
 
 namespace BPrivate {
 
@@ -384,6 +385,9 @@ QtCanvas::FillPolygon(const BPoint* points, int32 count, const pattern& pattern)
 	// The corners name pixels, and each of these belongs to the polygon: it is filled without
 	// smoothing, and its outline is added.
 	const int reach = StrokeWidth(1);
+	const QtUse use;
+	if (!use)
+		return;
 	Mask mask(DeviceBounds(polygon.boundingRect().adjusted(-reach, -reach, reach, reach), 1));
 	if (mask.IsEmpty())
 		return;
@@ -461,6 +465,9 @@ QtCanvas::OutlineWidth() const
 void
 QtCanvas::StrokeOutline(const QPainterPath& outline, double scale, const pattern& pattern)
 {
+	const QtUse use;
+	if (!use)
+		return;
 	const double width = OutlineWidth() / scale;
 	const double reach = width * std::max(fState.miterLimit, 2.0f) / 2 + 1;
 	Mask mask(DeviceBounds(outline.boundingRect().adjusted(-reach, -reach, reach, reach), scale));
@@ -482,6 +489,9 @@ QtCanvas::StrokeOutline(const QPainterPath& outline, double scale, const pattern
 void
 QtCanvas::FillOutline(const QPainterPath& outline, double scale, const pattern& pattern)
 {
+	const QtUse use;
+	if (!use)
+		return;
 	Mask mask(DeviceBounds(outline.boundingRect(), scale));
 	if (mask.IsEmpty())
 		return;

@@ -14,6 +14,7 @@
 #include "display/qt/Mask.h"
 #include "display/qt/QtCanvas.h"
 #include "display/qt/QtFonts.h"
+#include "display/qt/QtUse.h"
 
 namespace BPrivate {
 
@@ -95,6 +96,9 @@ QtCanvas::DrawRun(const char* text, int32 length, BPoint where, float width)
 {
 	fSparseLines.clear();
 	if (DrawKnownRun(text, length, where))
+		return;
+	const QtUse use;
+	if (!use)
 		return;
 	// What is far outside needs no characters.
 	FontKey key = FontKey::Of(fState.font);

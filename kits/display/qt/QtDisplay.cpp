@@ -26,6 +26,7 @@
 #include "display/qt/KeyTranslation.h"
 #include "display/qt/QtCanvas.h"
 #include "display/qt/QtHostWindow.h"
+#include "display/qt/QtUse.h"
 #include "display/qt/QtWindow.h"
 
 namespace BPrivate {
@@ -128,6 +129,7 @@ QtDisplay::Stop()
 		for (QtHostWindow* window : fWindows)
 			window->Detach();
 	});
+	QtUse::EndAll();
 }
 
 
@@ -579,6 +581,9 @@ QtDisplay::Beep()
 status_t
 QtDisplay::DecodePicture(const void* data, size_t size, Picture* picture)
 {
+	const QtUse use;
+	if (!use)
+		return B_ERROR;
 	QByteArray bytes =
 		QByteArray::fromRawData(static_cast<const char*>(data), static_cast<qsizetype>(size));
 	QBuffer buffer(&bytes);
@@ -597,6 +602,9 @@ QtDisplay::SavePicture(const Picture& picture, const char* path)
 {
 	if (picture.width <= 0 || picture.height <= 0)
 		return B_BAD_VALUE;
+	const QtUse use;
+	if (!use)
+		return B_ERROR;
 	QImage image(reinterpret_cast<const uchar*>(picture.pixels.data()), picture.width,
 		picture.height, picture.hasAlpha ? QImage::Format_ARGB32 : QImage::Format_RGB32);
 	return image.save(QString::fromUtf8(path), "PNG") ? B_OK : B_ERROR;

@@ -5,7 +5,7 @@
 #include <algorithm>
 #include <cmath>
 #include <cstring>
-#include <optional>
+#include <memory>
 
 #include <QFont>
 #include <QFontDatabase>
@@ -18,6 +18,7 @@
 #include "display/FontSettings.h"
 #include "display/Utf8.h"
 #include "display/qt/Mask.h"
+#include "display/qt/QtUse.h"
 
 namespace BPrivate {
 
@@ -115,17 +116,33 @@ InkOf(const Mask& mask)
 }
 
 
+/// What a thread keeps of its last font. It is Qt's own, so it stays when Qt is gone already.
+template <typename Content>
+class ThreadsLast {
+public:
+	~ThreadsLast()
+	{
+		const QtUse use;
+		if (!use)
+			content.release();
+	}
+
+	std::unique_ptr<Content> content;
+};
+
+
+/// Within a QtUse.
 const LastFont&
 Last(QtFonts& fonts, const FontKey& key)
 {
-	thread_local std::optional<LastFont> last;
-	if (!last.has_value() || !SameKey(last->key, key)) {
+	thread_local ThreadsLast<LastFont> last;
+	if (last.content == nullptr || !SameKey(last.content->key, key)) {
 		const QFontMetricsF metrics(fonts.FontFor(key, 1));
-		last.emplace(LastFont{key, metrics,
+		last.content = std::make_unique<LastFont>(LastFont{key, metrics,
 			{static_cast<float>(metrics.ascent()), static_cast<float>(metrics.descent()),
 				static_cast<float>(std::max(metrics.leading(), 0.0))}});
 	}
-	return *last;
+	return *last.content;
 }
 
 } // namespace
@@ -212,6 +229,9 @@ QtFonts::FamilyAt(int32 index)
 int32
 QtFonts::CountFamilies()
 {
+	const QtUse use;
+	if (!use)
+		return 0;
 	std::lock_guard<std::mutex> lock(fMutex);
 	ReadFamilies();
 	return static_cast<int32>(fFamilies.size());
@@ -221,6 +241,9 @@ QtFonts::CountFamilies()
 status_t
 QtFonts::GetFamily(int32 index, font_family* name)
 {
+	const QtUse use;
+	if (!use)
+		return B_ERROR;
 	std::lock_guard<std::mutex> lock(fMutex);
 	ReadFamilies();
 	if (index < 0 || index >= static_cast<int32>(fFamilies.size()))
@@ -233,6 +256,9 @@ QtFonts::GetFamily(int32 index, font_family* name)
 int32
 QtFonts::CountStyles(int32 index)
 {
+	const QtUse use;
+	if (!use)
+		return 0;
 	std::lock_guard<std::mutex> lock(fMutex);
 	const Family* family = FamilyAt(index);
 	return family != nullptr ? static_cast<int32>(family->styles.size()) : 0;
@@ -242,6 +268,9 @@ QtFonts::CountStyles(int32 index)
 status_t
 QtFonts::GetStyle(int32 index, int32 style, FontStyleInfo* info)
 {
+	const QtUse use;
+	if (!use)
+		return B_ERROR;
 	std::lock_guard<std::mutex> lock(fMutex);
 	const Family* family = FamilyAt(index);
 	if (family == nullptr || style < 0 || style >= static_cast<int32>(family->styles.size()))
@@ -256,8 +285,10 @@ QtFonts::GetStyle(int32 index, int32 style, FontStyleInfo* info)
 void
 QtFonts::GetStandardFont(standard_font which, uint16* family, uint16* style, float* size)
 {
+	const QtUse use;
 	std::lock_guard<std::mutex> lock(fMutex);
-	FindStandardFont(which);
+	if (use)
+		FindStandardFont(which);
 	*family = fStandardFamilies[which];
 	*style = fStandardStyles[which];
 	*size = 12;
@@ -273,10 +304,10 @@ QtFonts::FontFor(const FontKey& key, float scale)
 		float scale;
 		QFont font;
 	};
-	thread_local std::optional<Known> known;
-	if (!known.has_value() || known->scale != scale || !SameKey(known->key, key))
-		known.emplace(Known{key, scale, MakeFont(key, scale)});
-	return known->font;
+	thread_local ThreadsLast<Known> last;
+	if (last.content == nullptr || last.content->scale != scale || !SameKey(last.content->key, key))
+		last.content = std::make_unique<Known>(Known{key, scale, MakeFont(key, scale)});
+	return last.content->font;
 }
 
 
@@ -319,7 +350,8 @@ QtFonts::MakeFont(const FontKey& key, float scale)
 font_height
 QtFonts::Height(const FontKey& font)
 {
-	return Last(*this, font).height;
+	const QtUse use;
+	return use ? Last(*this, font).height : font_height{font.size, 0, 0};
 }
 
 
@@ -334,6 +366,9 @@ QtFonts::StringWidth(const FontKey& font, const char* text, int32 length)
 		if (known != nullptr)
 			return known->width;
 	}
+	const QtUse use;
+	if (!use)
+		return 0;
 	const QFontMetricsF& metrics = Last(*this, font).metrics;
 	const float width =
 		static_cast<float>(metrics.horizontalAdvance(QString::fromUtf8(text, length)));
@@ -350,6 +385,9 @@ std::shared_ptr<const TextRun>
 QtFonts::MakeRun(
 	const FontKey& font, const char* text, int32 length, float scale, const QPointF& rest)
 {
+	const QtUse use;
+	if (!use)
+		return nullptr;
 	auto run = std::make_shared<TextRun>();
 	run->width = StringWidth(font, text, length);
 	run->scale = scale;
@@ -387,10 +425,13 @@ QtFonts::MakeRun(
 void
 QtFonts::GetEscapements(const FontKey& font, const char* text, int32 count, float* escapements)
 {
+	std::fill(escapements, escapements + count, 0);
+	const QtUse use;
+	if (!use)
+		return;
 	const QFontMetricsF& metrics = Last(*this, font).metrics;
 	const char* end = text + strlen(text);
 	for (int32 i = 0; i < count; i++) {
-		escapements[i] = 0;
 		if (text >= end)
 			continue;
 		char32_t character = NextCharacter(&text, end);
@@ -403,10 +444,13 @@ QtFonts::GetEscapements(const FontKey& font, const char* text, int32 count, floa
 void
 QtFonts::GetGlyphBounds(const FontKey& font, const char* text, int32 count, BRect* bounds)
 {
+	std::fill(bounds, bounds + count, BRect());
+	const QtUse use;
+	if (!use)
+		return;
 	const QFontMetricsF& metrics = Last(*this, font).metrics;
 	const char* end = text + strlen(text);
 	for (int32 i = 0; i < count; i++) {
-		bounds[i] = BRect();
 		if (text >= end)
 			continue;
 		char32_t character = NextCharacter(&text, end);

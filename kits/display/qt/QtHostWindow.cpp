@@ -270,9 +270,10 @@ QtHostWindow::SetPointerGrab(bool grab)
 {
 	fDisplay.Hub().SetGrab(&fStacked, grab);
 	// Elsewhere there is nothing to grab, or no way to.
-	if (QGuiApplication::platformName() != QLatin1String("xcb"))
-		return;
-	WithWindow([&](QtWindow& window) { window.setMouseGrabEnabled(grab); });
+	WithWindow([&](QtWindow& window) {
+		if (QGuiApplication::platformName() == QLatin1String("xcb"))
+			window.setMouseGrabEnabled(grab);
+	});
 }
 
 

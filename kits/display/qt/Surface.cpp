@@ -8,6 +8,7 @@
 
 #include "display/WindowPixels.h"
 #include "display/qt/QtCanvas.h"
+#include "display/qt/QtUse.h"
 
 namespace BPrivate {
 
@@ -17,7 +18,8 @@ Surface::Take(const QtCanvas& canvas, const BRegion& region)
 	const PixelBuffer& buffer = canvas.Buffer();
 	QRect all(0, 0, buffer.width, buffer.height);
 	const std::shared_ptr<WindowPixels>& pixels = canvas.Pixels();
-	if (pixels == nullptr)
+	const QtUse use;
+	if (pixels == nullptr || !use)
 		return false;
 
 	std::lock_guard<std::mutex> lock(fMutex);

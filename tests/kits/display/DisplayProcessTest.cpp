@@ -64,6 +64,20 @@ TEST(DisplayChoiceTest, WithoutADisplayWindowsAreKeptOffscreen)
 }
 
 
+class EndingTest : public testing::TestWithParam<const char*> {};
+
+TEST_P(EndingTest, AProgramEndsWellWhileItsWindowsDraw)
+{
+	// What could go wrong depends on who comes first.
+	const Result result = RunCommand("seq 20 | " + kClean + "xargs -P 4 -I NUMBER " + Within(60)
+		+ ENDING_PROGRAM + " " + GetParam());
+	EXPECT_EQ(result.code, 0) << result.output;
+}
+
+INSTANTIATE_TEST_SUITE_P(Ways, EndingTest, testing::Values("return", "exit", "quit", "close"),
+	[](const auto& info) { return std::string(info.param); });
+
+
 TEST(DisplayChoiceTest, NoneIsTheBuiltInOne)
 {
 	Result result = RunProgram("BE_DISPLAY=none");
