@@ -92,7 +92,11 @@ TDesignForm::TDesignForm(const char* name, form_visibility visibility, TFormHost
 }
 
 
-TDesignForm::~TDesignForm() {}
+TDesignForm::~TDesignForm()
+{
+	// The view is destroyed after this component.
+	fDesignView->NoteEditors(this);
+}
 
 
 void

@@ -41,11 +41,20 @@ TDesignFormView::TDesignFormView(BRect frame, TDesignForm* form)
 
 TDesignFormView::~TDesignFormView()
 {
-	std::unique_ptr<TForgottenEditors> editors = std::make_unique<TForgottenEditors>();
 	for (int32 i = 0; i < TFormDesigner::CountComponents(); i++)
-		editors->Add(TFormDesigner::ComponentAt(i));
+		NoteEditors(TFormDesigner::ComponentAt(i));
 	TFormDesigner::ClearComponents(true);
-	Inspector::Bury(std::move(editors));
+	if (fEditors != nullptr)
+		Inspector::Bury(std::move(fEditors));
+}
+
+
+void
+TDesignFormView::NoteEditors(const TComponent* component)
+{
+	if (fEditors == nullptr)
+		fEditors = std::make_unique<TForgottenEditors>();
+	fEditors->Add(component);
 }
 
 

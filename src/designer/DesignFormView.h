@@ -15,6 +15,7 @@ class BFilePanel;
 class BMenu;
 class BPopUpMenu;
 class TDesignForm;
+class TForgottenEditors;
 class TLoadReport;
 class TPaletteEntry;
 
@@ -131,6 +132,9 @@ public:
 	const char* Filename() const { return fFilename; }
 	void SetFilename(const char* name);
 
+	/// Notes the editors of \a component, which is about to be destroyed; they follow when the view is destroyed.
+	void NoteEditors(const TComponent* component);
+
 	TDesignForm* DesignWindow() const { return fForm; }
 
 	/// Whether the generated application opens this form first.
@@ -171,6 +175,7 @@ private:
 	std::unique_ptr<BFilePanel> fSavePanel;
 	TDesignForm* fForm;
 	char fFilename[256];
+	std::unique_ptr<TForgottenEditors> fEditors; // of those that are destroyed with the form
 	// What the file held when it was loaded or saved, and whether components of it were left out.
 	TFileStamp fStamp;
 	bool fIsIncomplete;

@@ -12,6 +12,7 @@
 #include "designer/Inspector.h"
 #include "project/ProjectObserver.h"
 #include "project/ProjectOperation.h"
+#include "props/ForgottenEditors.h"
 
 namespace {
 
@@ -96,10 +97,13 @@ TProject::NewProject(bool withForm)
 	if (fObserver != nullptr)
 		fObserver.load()->ProjectStarted(fApp.get());
 	Quit(oldForms);
+	std::unique_ptr<TForgottenEditors> editors = std::make_unique<TForgottenEditors>();
 	{
 		WindowGuard guard(fAppLooper, B_INFINITE_TIMEOUT);
+		editors->Add(oldApp.get());
 		oldApp.reset();
 	}
+	Inspector::Bury(std::move(editors));
 
 	SetFilename("");
 	if (withForm)

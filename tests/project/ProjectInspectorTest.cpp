@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 // What the property window shows of the project, in the running designer.
 
+#include <atomic>
+
 #include <OS.h>
 
 #include "app/DesignerRun.h"
@@ -9,12 +11,37 @@
 #include "designer/DesignForm.h"
 #include "designer/DesignFormView.h"
 #include "model/AppComponent.h"
+#include "model/Property.h"
 #include "project/Project.h"
 #include "project/ProjectView.h"
 #include "project/ProjectWin.h"
 #include "props/PropertyWin.h"
+#include "props/StringProperty.h"
 
 namespace {
+
+/// No window handles it: answered when the messages before it have been handled.
+constexpr uint32 kMsgAreYouDone = '_don';
+
+std::atomic<int> sDeletedEditors = 0;
+
+
+class CountedEditor : public TStringProperty {
+public:
+	using TStringProperty::TStringProperty;
+	~CountedEditor() override { sDeletedEditors++; }
+};
+
+
+/// Gives \a component one more property, with an editor that is counted.
+void
+AddCounted(TComponent* component)
+{
+	TProperty* property = new TProperty(component, "Counted", "", nullptr, false);
+	component->AddPropAndEditor(
+		property, new CountedEditor(component, property), nullptr, nullptr, false);
+}
+
 
 class ProjectInspectorTest : public DesignerTest {
 protected:
@@ -122,5 +149,25 @@ TEST_F(ProjectInspectorTest, OutlivesTheProjectsThatItShows)
 		}
 		EXPECT_EQ(Window()->Project()->CountForms(), 4);
 		EXPECT_TRUE(Boxes().empty());
+	});
+}
+
+
+TEST_F(ProjectInspectorTest, TheEditorsOfFormsAndApplicationGoWithThem)
+{
+	sDeletedEditors = 0;
+	Run([] {
+		{
+			WindowGuard guard(FormAt(0));
+			AddCounted(FormAt(0));
+		}
+		{
+			WindowGuard guard(Window());
+			AddCounted(Window()->Project()->App());
+		}
+		Window()->NewProject(false);
+		// They go in the property window's thread.
+		Tell(BMessenger(MainWindow()->PropertyWindow()), kMsgAreYouDone);
+		EXPECT_EQ(sDeletedEditors, 2);
 	});
 }
