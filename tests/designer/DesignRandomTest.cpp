@@ -3,6 +3,8 @@
 
 #include "designer/SurfaceTest.h"
 
+#include <malloc.h>
+
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
@@ -33,6 +35,9 @@ constexpr const char* kEdges[] = {"Left", "Top", "Right", "Bottom"};
 /// The usual test run has time for few; PLIM_RANDOM_ACTIONS says how many, PLIM_RANDOM_SEED which.
 constexpr int kUsualActions = 40;
 constexpr int kActionsBetweenReports = 250;
+
+/// A form that has so many gets no more, so that the last action has no more to do than one long before.
+constexpr int32 kMostComponents = 25;
 
 /// What users may type as a label, a name excepted.
 constexpr const char* kTexts[] = {
@@ -110,6 +115,13 @@ protected:
 	{
 		BPoint where;
 		const int kind = Number(100);
+		const bool isForMore = kind < 20 || (kind >= 87 && kind < 92);
+		if (isForMore && IsFull()) {
+			// What lies beside the form, or below others, is out of reach.
+			if (!SomeComponent(false, &where) || !ChooseFromMenu(where, "Delete"))
+				return "full";
+			return "make room";
+		}
 		if (kind < 20) {
 			const char* className = kClasses[Number(std::size(kClasses))];
 			Choose(className);
@@ -195,6 +207,13 @@ protected:
 		return "delete all";
 	}
 
+	bool IsFull() const
+	{
+		bool isFull = false;
+		Locked([&] { isFull = Form()->CountComponents() >= kMostComponents; });
+		return isFull;
+	}
+
 	/// Runs \a paste; what is new on the form then tells the frame that was copied.
 	void NotePasted(const std::function<void()>& paste)
 	{
@@ -271,6 +290,21 @@ protected:
 				const std::string name = form->ComponentAt(i)->ComponentName();
 				EXPECT_NE(source.find("  // create " + name + "\n"), std::string::npos) << name;
 			}
+		}
+	}
+
+	/// Forgets the components that are on neither form any more.
+	void ForgetDeleted()
+	{
+		std::set<TComponent*> components;
+		for (TDesignForm* form : fForms) {
+			WindowGuard guard(form);
+			for (int32 i = 0; i < form->CountComponents(); i++)
+				components.insert(form->ComponentAt(i));
+		}
+		for (std::set<TComponent*>* noted : {&fPasted, &fEdited}) {
+			for (auto i = noted->begin(); i != noted->end();)
+				i = components.count(*i) > 0 ? std::next(i) : noted->erase(i);
 		}
 	}
 
@@ -393,6 +427,19 @@ protected:
 		form->SetFilename((fFolder / (std::string(form->ComponentName()) + ".frm")).c_str());
 	}
 
+	/// Says how far the user is, what the heap holds for the program, and how much there is on the forms.
+	void Report(int actions)
+	{
+		int32 components = 0;
+		for (TDesignForm* form : fForms) {
+			WindowGuard guard(form);
+			components += form->CountComponents();
+		}
+		const struct mallinfo2 heap = mallinfo2();
+		std::cerr << actions << " actions, " << (heap.uordblks + heap.hblkhd) / 1024
+				  << " kB of the heap in use, " << components << " components" << std::endl;
+	}
+
 	const int fSeed;
 	std::mt19937 fRandom;
 	TDesignForm* fForms[2];
@@ -409,12 +456,13 @@ TEST_F(DesignRandomTest, AnythingInAnyOrderKeepsAllInStep)
 		const std::string what =
 			"seed " + std::to_string(fSeed) + ", action " + std::to_string(i) + " (" + Act() + ")";
 		EXPECT_TRUE(fRobot.Settle()) << what;
+		ForgetDeleted();
 		for (TDesignForm* form : fForms)
 			CheckForm(form, what);
 		CheckInspector(what);
 		for (TDesignForm* form : fForms)
 			CheckDocument(form, what);
 		if (i % kActionsBetweenReports == kActionsBetweenReports - 1)
-			std::cerr << i + 1 << " actions" << std::endl;
+			Report(i + 1);
 	}
 }
