@@ -9,7 +9,16 @@
 #include <new>
 #include <thread>
 
+// The sanitizers watch the heap, so under them all blocks are the heap's. Clang has its own way to tell.
 #if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
+#define BLOCKS_ARE_WATCHED 1
+#elif defined(__has_feature)
+#if __has_feature(address_sanitizer) || __has_feature(thread_sanitizer)
+#define BLOCKS_ARE_WATCHED 1
+#endif
+#endif
+
+#ifdef BLOCKS_ARE_WATCHED
 // Of the sanitizers' allocator, whose header not every compiler brings along.
 extern "C" int __sanitizer_get_ownership(const volatile void* block);
 #endif
@@ -92,8 +101,7 @@ CutBlock(size_t units)
 void*
 TBlockPool::Allocate(size_t size)
 {
-#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
-	// The sanitizers watch the heap.
+#ifdef BLOCKS_ARE_WATCHED
 	return ::operator new(size);
 #else
 	const size_t units = (size + sizeof(BlockHeader) + kUnit - 1) / kUnit;
@@ -116,7 +124,7 @@ TBlockPool::Allocate(size_t size)
 bool
 TBlockPool::Owns(const void* block)
 {
-#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
+#ifdef BLOCKS_ARE_WATCHED
 	return __sanitizer_get_ownership(block) != 0;
 #else
 	const std::less<const void*> isBefore;
@@ -134,7 +142,7 @@ TBlockPool::Owns(const void* block)
 void
 TBlockPool::Free(void* block)
 {
-#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
+#ifdef BLOCKS_ARE_WATCHED
 	::operator delete(block);
 #else
 	if (block == nullptr)
