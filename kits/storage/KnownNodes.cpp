@@ -26,10 +26,17 @@ struct known_node {
 	node_key parent;
 };
 
+using node_map = std::map<node_key, known_node>;
+
+/// What is no folder is kept in two generations: a saved document is a new node each time.
 struct node_table {
 	std::mutex lock;
-	std::map<node_key, known_node> nodes;
+	node_map folders;
+	node_map files;
+	node_map olderFiles;
 };
+
+const size_t kMostFiles = 1000; // of a generation
 
 // A path has at most this many folders; more steps upward would be a loop in the table.
 const int kMaxDepth = B_PATH_NAME_LENGTH / 2;
@@ -67,11 +74,48 @@ IsNodeAt(const std::string& path, const node_key& key)
 }
 
 
+// What is known of a node, which then belongs to those that were asked for last.
+known_node*
+Lookup(node_table& table, const node_key& key)
+{
+	for (node_map* nodes : {&table.folders, &table.files}) {
+		const auto found = nodes->find(key);
+		if (found != nodes->end())
+			return &found->second;
+	}
+	auto older = table.olderFiles.extract(key);
+	return older.empty() ? nullptr : &table.files.insert(std::move(older)).position->second;
+}
+
+
+known_node&
+LookupOrAdd(node_table& table, const struct stat& stat)
+{
+	const node_key key(stat.st_dev, stat.st_ino);
+	// Numbers of nodes that are gone are used again.
+	if (S_ISDIR(stat.st_mode)) {
+		table.files.erase(key);
+		table.olderFiles.erase(key);
+		return table.folders[key];
+	}
+
+	table.folders.erase(key);
+	known_node* const known = Lookup(table, key);
+	if (known != nullptr)
+		return *known;
+	if (table.files.size() >= kMostFiles) {
+		table.olderFiles.swap(table.files);
+		table.files.clear();
+	}
+	return table.files[key];
+}
+
+
 void
 RememberLocked(node_table& table, const struct stat& stat, const std::string& path, int depth)
 {
 	const node_key key(stat.st_dev, stat.st_ino);
-	known_node& node = table.nodes[key];
+	known_node& node = LookupOrAdd(table, stat);
 	if (node.path == path)
 		return;
 
@@ -118,11 +162,11 @@ FindInFolder(const std::string& folder, const node_key& key, std::string* path)
 bool
 FindLocked(node_table& table, const node_key& key, std::string* path, int depth)
 {
-	const auto found = table.nodes.find(key);
-	if (found == table.nodes.end() || depth == 0)
+	known_node* const found = Lookup(table, key);
+	if (found == nullptr || depth == 0)
 		return false;
 
-	known_node& node = found->second;
+	known_node& node = *found;
 	if (IsNodeAt(node.path, key)) {
 		*path = node.path;
 		return true;

@@ -12,7 +12,9 @@
 
 namespace BPrivate {
 
-/// Remembers the path of a node, and of every folder on the way to it, for this process's life.
+/// Remembers the path of a node, and of every folder on the way to it.
+///
+/// Folders, which entries are found by, for this process's life; of other nodes the last thousand at least.
 /// \a path: absolute and without links in its folders. Any thread.
 void remember_node(const struct stat& stat, const std::string& path);
 

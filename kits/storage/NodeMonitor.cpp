@@ -356,8 +356,17 @@ NodeMonitor::HandleOwnEvent(watched_node* node, uint32 mask)
 	}
 	if ((mask & IN_MOVE_SELF) != 0) {
 		BMessage message = NoticeMessage(B_ENTRY_MOVED, node->ref);
-		if (BPrivate::find_node_path(node->ref.device, node->ref.node, &node->path) == B_OK)
-			message.AddString("name", node->path.substr(node->path.rfind('/') + 1).c_str());
+		std::string path;
+		status_t status = BPrivate::find_node_path(node->ref.device, node->ref.node, &path);
+		if (status != B_OK) {
+			// Many other files may have been looked at since this one was.
+			BPrivate::remember_node(node->stat, node->path);
+			status = BPrivate::find_node_path(node->ref.device, node->ref.node, &path);
+		}
+		if (status == B_OK) {
+			node->path = path;
+			message.AddString("name", path.substr(path.rfind('/') + 1).c_str());
+		}
 		Send(*node, message, B_WATCH_NAME);
 		return;
 	}

@@ -144,6 +144,28 @@ TEST_F(NodeMonitorTest, FileTellsOfItsStatusAndName)
 }
 
 
+TEST_F(NodeMonitorTest, FileTellsOfItsNameHoweverManyOthersWereLookedAt)
+{
+	const std::string other = fFolder.Write("other");
+	node_ref otherNode;
+	ASSERT_EQ(BEntry(other.c_str()).GetNodeRef(&otherNode), B_OK);
+	ASSERT_EQ(Watch(fFolder.Write("file"), B_WATCH_NAME), B_OK);
+
+	fFolder.Make("many");
+	for (int i = 0; i < 2001; i++) {
+		const std::string path = fFolder.Write("many/" + std::to_string(i));
+		node_ref node;
+		ASSERT_EQ(BEntry(path.c_str()).GetNodeRef(&node), B_OK);
+	}
+	// One that nobody cares for is forgotten: programs that save for days look at as many.
+	EXPECT_EQ(watch_node(&otherNode, B_WATCH_NAME, fTarget), B_ENTRY_NOT_FOUND);
+	ASSERT_EQ(Watch(other, B_WATCH_NAME), B_OK);
+
+	std::filesystem::rename(fFolder / "file", fFolder / "renamed");
+	EXPECT_STREQ(fListener->Wait(B_ENTRY_MOVED).FindString("name"), "renamed");
+}
+
+
 TEST_F(NodeMonitorTest, FileTellsOfItsAttributes)
 {
 	const std::string path = fFolder.Write("file");
