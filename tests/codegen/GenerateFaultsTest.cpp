@@ -2,10 +2,13 @@
 // Generating on a disk that fails, is full, or when the program is killed: every source is the old or the new one.
 
 #include <cerrno>
+#include <filesystem>
 #include <iterator>
+#include <map>
 
 #include "app/Dialogs.h"
 #include "codegen/CodeGenerator.h"
+#include "codegen/DialectGenerator.h"
 #include "codegen/SampleProject.h"
 #include "codegen/TestFolder.h"
 #include "designer/DesignForm.h"
@@ -15,7 +18,15 @@
 namespace {
 
 constexpr int kMostCalls = 300;
+int sBoxes = 0;
 const char* const kGenerated[] = {"Form1.h", "Form1.cpp", "Form1.fcp", "MyApp.h", "MyApp.cpp"};
+
+int32
+CountBox(const char*, const char*, const char*)
+{
+	sBoxes++;
+	return 0;
+}
 
 
 class GenerateFaultsTest : public testing::Test {
@@ -126,6 +137,64 @@ TEST_F(GenerateFaultsTest, KilledBeforeAnyCallEverySourceIsTheOldOrTheNewOne)
 	}
 	EXPECT_GT(call, 15);
 	EXPECT_LT(call, kMostCalls);
+}
+
+
+TEST_F(GenerateFaultsTest, OfAWholeNewFolderWhicheverCallFailsThereIsNothingHalf)
+{
+	SetMessageBoxHook(CountBox);
+	const std::string folder = fFolder.At("sources");
+	std::map<std::string, std::string> whole;
+	int missing = 0;
+	int folderFailures = 0;
+	for (disk_fault fault : {DISK_CALL_FAILS, DISK_STAYS_FULL, DISK_WRITES_HALF}) {
+		int call = 0; // nothing fails at first
+		for (; call < kMostCalls; call++) {
+			std::filesystem::remove_all(folder);
+			TDialectGenerator generator;
+			generator.SetDialect(DIALECT_STANDARD);
+			generator.SetBuildFiles(true);
+			generator.SetAppComponent(&fProject->App());
+			generator.SetGenerationPath(folder.c_str());
+			bool wasReached;
+			sBoxes = 0;
+			{
+				FaultyDisk disk(call, fault, ENOSPC);
+				TDiagnosticSilence silence;
+				generator.GenerateApp();
+				wasReached = call == 0 || disk.WasReached();
+			}
+			SCOPED_TRACE("fault " + std::to_string(fault) + " at call " + std::to_string(call));
+			std::map<std::string, std::string> files;
+			if (std::filesystem::exists(folder)) {
+				for (const auto& entry : std::filesystem::directory_iterator(folder))
+					files[entry.path().filename()] = ReadText(entry.path());
+			}
+			if (whole.empty())
+				whole = files;
+			for (const auto& [name, text] : files)
+				EXPECT_TRUE(whole.count(name) > 0 && text == whole[name]) << name;
+			// What is not there is told, file by file, or all at once when the folder could not be made.
+			size_t unwritable = 0;
+			for (const generated_file& file : generator.Writer().Files())
+				unwritable += file.outcome == GENERATED_UNWRITABLE ? 1 : 0;
+			if (sBoxes == 0)
+				EXPECT_EQ(files.size() + unwritable, whole.size());
+			else
+				EXPECT_LT(files.size(), whole.size());
+			folderFailures += sBoxes;
+			missing += whole.size() - files.size();
+			if (!wasReached)
+				break;
+		}
+		EXPECT_LT(call, kMostCalls);
+	}
+	// There are the files that build the program, too.
+	SetMessageBoxHook(nullptr);
+	EXPECT_GT(whole.size(), 5u);
+	EXPECT_GT(missing, 20);
+	// Once for each kind of fault that a folder can have.
+	EXPECT_GE(folderFailures, 2);
 }
 
 
