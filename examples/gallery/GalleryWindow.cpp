@@ -131,7 +131,9 @@ GalleryWindow::ShowAlert(const BMessage* message)
 		"line.",
 		kLabels[0], count > 1 ? kLabels[1] : nullptr, count > 2 ? kLabels[2] : nullptr,
 		B_WIDTH_AS_USUAL, static_cast<alert_type>(message->GetInt32("type", B_INFO_ALERT)));
-	alert->Go(new BInvoker(new BMessage(kMsgAlertAnswered), this));
+	// No alert owns it, and one may outlive this window.
+	static BInvoker sAnswer(new BMessage(kMsgAlertAnswered), this);
+	alert->Go(&sAnswer);
 }
 
 
