@@ -60,16 +60,22 @@ MenuTracker::PointerMessage(const BMessage& message)
 		return;
 	}
 
+	const bool isHeld = message.GetInt32("buttons", 0) != 0;
+	if (message.what == B_MOUSE_MOVED && fIsPressed && !isHeld) {
+		// The window of the press is late with the release: it was not here, but where the pointer was last.
+		Released(fWhere);
+		if (fEnded)
+			return;
+	}
+
 	fWhere = where;
 	if (std::fabs(where.x - fPressWhere.x) > kClickDistance
 		|| std::fabs(where.y - fPressWhere.y) > kClickDistance)
 		fHasWandered = true;
-	const bool isHeld = message.GetInt32("buttons", 0) != 0;
 	if (message.what == B_MOUSE_DOWN) {
 		if (!fIsPressed)
 			Pressed(where);
 	} else if (fIsPressed && !isHeld) {
-		// A release that nobody reported shows in the next move.
 		Hover(where);
 		if (!fEnded)
 			Released(where);

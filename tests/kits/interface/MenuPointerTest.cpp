@@ -43,6 +43,28 @@ TEST_F(MenuPointerTest, PressDragAndReleaseChooses)
 }
 
 
+TEST_F(MenuPointerTest, AReleaseThatIsToldLateWasWhereThePointerWasBefore)
+{
+	Show();
+	fRobot->MoveTo(MiddleOf("File"));
+	fRobot->Press();
+	ASSERT_TRUE(Opens(fFile));
+	// The pointer goes on to nowhere before the window of the press has handed on the release.
+	BMessage moved(B_MOUSE_MOVED);
+	moved.AddPoint("screen_where", BPoint(700, 500));
+	moved.AddInt32("buttons", 0);
+	moved.AddInt64("when", system_time());
+	ASSERT_EQ(BMessenger(fFile).SendMessage(&moved), B_OK);
+	fRobot->Settle();
+	EXPECT_TRUE(IsOpen(fFile));
+	fRobot->Release();
+	EXPECT_TRUE(IsOpen(fFile));
+	fRobot->ClickItem("Save");
+	EXPECT_TRUE(AllClosed());
+	EXPECT_EQ(TakeCodes(), "save ");
+}
+
+
 TEST_F(MenuPointerTest, DraggedOutAndReleasedChoosesNothing)
 {
 	Show();
