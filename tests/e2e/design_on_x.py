@@ -11,7 +11,8 @@ where a tool is missing.
 import sys
 
 from plimworks_on_x import Session
-from xdesktop import AWAY, wait_for
+from waits import wait_for
+from xdesktop import AWAY
 from xtest import check, run, step
 
 WHOLE_LIMIT = 220
@@ -50,13 +51,9 @@ class Form:
     def drag(self, start, end, to=None):
         """From a point of this form to one of this form, or of the form to."""
         start, end = self.at(start), (to or self).at(end)
-        self.desktop.xdotool("mousemove", *start, "mousedown", 1)
-        steps = 8
-        for i in range(1, steps + 1):
-            self.desktop.xdotool(
-                "mousemove", *(start[j] + (end[j] - start[j]) * i // steps for j in (0, 1)), "sleep", 0.03)
+        self.desktop.input.drag(start, end)
         # The pointer is in the pictures, too.
-        self.desktop.xdotool("mouseup", 1, "mousemove", *AWAY)
+        self.desktop.input.move(*AWAY)
 
     def is_marked(self, *points):
         screen = self.desktop.picture()
@@ -121,7 +118,7 @@ def use_two_designers(first, second):
 
     inside = second.at((90, 55))
     face = desktop.picture().pixel(*inside)
-    desktop.xdotool("mousemove", *second.at((60, 45)), "click", 3)
+    desktop.input.click(*second.at((60, 45)), button=3)
     second.expect_told("TDesignFormView Got DTM_COMPONENT_CONTEXTMENU message")
     wait_for("the menu is open", lambda: desktop.picture().pixel(*inside) != face)
     second.session.save_picture("menu")
@@ -133,7 +130,8 @@ def use_two_designers(first, second):
     first.click(BARE)
     desktop.wait_until_active(first.window)
     first.expect_told("1 Components")
-    desktop.xdotool("mousemove", *first.at((40, 200)), "key", "ctrl+v")
+    desktop.input.move(*first.at((40, 200)))
+    desktop.key("ctrl+v")
     first.expect_told("SetPropertyValue('Name', 'Button11')")
     first.click((60, 210))
     first.expect_selected(40, 200, 140, 230)

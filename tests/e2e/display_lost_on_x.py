@@ -11,7 +11,7 @@ import time
 from pathlib import Path
 
 from exchange import Program, check, main
-from xdesktop import wait_for
+from waits import wait_for
 
 MEASURED = 2  # seconds
 LOST = "libbe: the connection to the display is broken; the program quits"

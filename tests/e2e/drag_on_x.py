@@ -9,7 +9,7 @@ import sys
 from urllib.parse import quote
 
 from exchange import Program, check, main
-from xdesktop import wait_for
+from waits import wait_for
 
 PLACES = {"One": (100, 100), "Two": (300, 100), "Other": (500, 100), "Files": (100, 320), "Picture": (300, 320)}
 SOURCE = (700, 100)
@@ -24,6 +24,7 @@ class Session:
         self.client = client
         self.file = desktop.folder / "a file, 100% ü.txt"
         self.file.write_text("content")
+        self.pointer = desktop.input
         self.one = Program(desktop, [program], "one")
         self.other = Program(desktop, [program], "other")
         for each, title, drags in ((self.one, "One", "rect"), (self.one, "Two", "nothing"),
@@ -43,27 +44,31 @@ class Session:
         program.expect(f"{title} released")
         self.desktop.wait_until_active(window)
 
-    def pointer(self, *words):
-        self.desktop.xdotool(*words)
-
     def drag(self, start, end, button_up=True):
-        """Presses, goes there in steps and releases, each step a move of its own for the server."""
-        self.pointer("mousemove", *start, "mousedown", 1)
-        self.go(start, end)
+        """Presses, goes there in steps and releases."""
+        self.pointer.move(*start)
+        self.pointer.press()
+        self.pointer.go(start, end)
         if button_up:
-            self.pointer("mouseup", 1)
+            self.pointer.release()
 
     def drag_to(self, program, title, start, end):
         """Releases over another program when that has answered that it takes what is dragged: before, it is not given."""
         self.drag(start, end, button_up=False)
         program.expect_exactly(f"{title} entered {DRAGGED}")
-        program.ask(f"sync {title}", f"synced {title}")
-        self.pointer("mouseup", 1)
+        # A hand that rests moves a little all the same.
+        self.pointer.go((end[0] - 4, end[1]), end, steps=4)
+        # The answer is on its way when the one has drawn what came before it, and has come when the other has.
+        self.let_draw(self.other, "Other")
+        self.let_draw(self.one, "Two")
+        self.let_draw(self.other, "Other")
+        self.pointer.release()
 
-    def go(self, start, end):
-        steps = 8
-        for i in range(1, steps + 1):
-            self.pointer("mousemove", *(start[j] + (end[j] - start[j]) * i // steps for j in (0, 1)), "sleep", 0.03)
+    @staticmethod
+    def let_draw(program, title):
+        """What has come to the program by now is handled at the latest in the second round."""
+        for _ in range(2):
+            program.ask(f"sync {title}", f"synced {title}")
 
     def place(self, title, x, y):
         return PLACES[title][0] + x, PLACES[title][1] + y
@@ -97,13 +102,14 @@ class Session:
     def over_another_program(self):
         self.drag(self.place("One", 40, 40), self.place("Other", 70, 80), button_up=False)
         self.other.expect_exactly(f"Other entered {DRAGGED}")
-        self.go(self.place("Other", 70, 80), NOWHERE)
+        self.pointer.go(self.place("Other", 70, 80), NOWHERE)
         self.other.expect_exactly("Other exited")
-        self.pointer("mouseup", 1)
+        self.pointer.release()
         self.check_nothing_else()
 
     def check_nothing_else(self):
         """Nothing more was dropped by the time that a click arrives, and that is a click as any other."""
+        self.let_draw(self.one, "Two")
         since = self.one.seen
         self.desktop.click(*self.place("Two", 120, 120))
         self.one.expect_exactly("Two pressed")
@@ -118,8 +124,8 @@ class Session:
             hovered.expect_exactly(f"{name} entered {DRAGGED}")
             self.desktop.key("Escape")
             hovered.expect_exactly(f"{name} exited")
-            self.go(end, self.place("Two", 20, 20))
-            self.pointer("mouseup", 1)
+            self.pointer.go(end, self.place("Two", 20, 20))
+            self.pointer.release()
             self.check_nothing_else()
 
     def files_from_outside(self):
@@ -170,7 +176,7 @@ class Session:
             self.drag(self.place(title, 40, 40), (TARGET[0] + 20, TARGET[1] + 20), button_up=False)
             target.expect("entered")
             target.expect("answered")
-            self.pointer("mouseup", 1)
+            self.pointer.release()
             target.expect("dropped")
             check(received.read_bytes() == content, f"as {kind} came {received.read_bytes()}")
             target.process.terminate()
@@ -181,7 +187,7 @@ class Session:
         self.drag(self.place("One", 40, 40), self.place("Other", 70, 80), button_up=False)
         self.other.expect_exactly(f"Other entered {DRAGGED}")
         self.one.quit()
-        self.pointer("mouseup", 1)
+        self.pointer.release()
         self.desktop.click(*self.place("Other", 60, 60))
         self.other.expect("Other pressed")
         self.other.expect("Other released")

@@ -8,7 +8,7 @@ usage: tests/e2e/events_on_x.py EVENTS_PROGRAM EXCHANGE_PROGRAM FOLDER
 import sys
 
 from exchange import Program
-from xdesktop import wait_for
+from waits import wait_for
 from xtest import check, run, step
 
 WHOLE_LIMIT = 110

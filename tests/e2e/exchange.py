@@ -4,7 +4,7 @@
 import subprocess
 import sys
 
-from xdesktop import wait_for
+from waits import wait_for
 from xtest import check, run
 
 WHOLE_LIMIT = 220

@@ -13,7 +13,7 @@ import time
 
 from exchange import Program, check, main
 from watched import Watched
-from xdesktop import wait_for
+from waits import wait_for
 
 STATUS = "svStatus"
 # Beside the gallery's window.
@@ -262,15 +262,18 @@ class Session:
         g.keys("ctrl+7")
         left, top, _, bottom = (int(place) for place in g.frame("tvScrolled"))
         # From behind the first letter.
-        self.desktop.xdotool("mousemove", left + 9, top + 8, "mousedown", 1, "mousemove", left + 9, bottom - 5,
-                             "mousemove", left + 9, bottom + 40)
+        pointer = self.desktop.input
+        pointer.move(left + 9, top + 8)
+        pointer.press()
+        pointer.move(left + 9, bottom - 5)
+        pointer.move(left + 9, bottom + 40)
 
         def copied_to_the_end():
             g.keys("ctrl+c")
             text = self.desktop.clipboard() or ""
             return text.startswith("ine 1 ") and "Line 20 of" in text
         wait_for("the text is selected to its last line", copied_to_the_end)
-        self.desktop.xdotool("mouseup", 1)
+        pointer.release()
 
     def dropped_file(self):
         g = self.gallery
@@ -281,12 +284,7 @@ class Session:
         source = Program(self.desktop, [self.client, "source", *SOURCE, "text/uri-list", offered], "source")
         source.expect("ready")
         start, end = (SOURCE[0] + 30, SOURCE[1] + 30), (int(left + right) // 2, int(top + bottom) // 2)
-        steps = 6
-        self.desktop.xdotool("mousemove", *start, "mousedown", 1)
-        for i in range(1, steps + 1):
-            self.desktop.xdotool("mousemove", *(start[j] + (end[j] - start[j]) * i // steps for j in (0, 1)),
-                                 "sleep", 0.03)
-        self.desktop.xdotool("mouseup", 1)
+        self.desktop.input.drag(start, end)
         source.expect("finished")
         g.expect_status("Dropped: apple.txt banana.txt")
         source.process.terminate()

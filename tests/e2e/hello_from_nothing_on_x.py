@@ -14,8 +14,8 @@ import sys
 
 from design_on_x import Form
 from plimworks_on_x import FILE_MENU, GENERATED, QUESTION, Session
-from xdesktop import AWAY, wait_for
-from xinput import Input
+from waits import wait_for
+from xdesktop import AWAY
 from xtest import check, run, step
 
 WHOLE_LIMIT = 220
@@ -66,7 +66,7 @@ class Designer(Session):
 
     def __init__(self, *arguments):
         super().__init__(*arguments)
-        self.input = Input(self.desktop)
+        self.input = self.desktop.input
         self.pictures_so_far = 0
         self.places = {}
         self.seen = 0
@@ -95,14 +95,20 @@ class Designer(Session):
 
     def drag_frame(self, window, grip, distance):
         """Holds the pointer until the window manager has followed it, and keeps it there until that lets go of it."""
-        before = self.desktop.xdotool("getwindowgeometry", window)
+        before = self.desktop.geometry(window)
         end = (grip[0] + distance[0], grip[1] + distance[1])
-        self.desktop.xdotool("mousemove", *grip, "mousedown", 1, "mousemove", *end)
-        wait_for("the window follows the pointer",
-                 lambda: self.desktop.xdotool("mousemove", *end, "getwindowgeometry", window) != before)
-        self.desktop.xdotool("mouseup", 1)
+        self.input.move(*grip)
+        self.input.press()
+
+        def follows():
+            # It may have begun to hold the pointer after the first move.
+            self.input.move(end[0] - 1, end[1])
+            self.input.move(*end)
+            return self.desktop.geometry(window) != before
+        wait_for("the window follows the pointer", follows)
+        self.input.release()
         self.input.wait_until_let_go()
-        self.desktop.xdotool("mousemove", *AWAY)
+        self.input.move(*AWAY)
 
     def move_window(self, window, place):
         """By its title bar."""
@@ -145,7 +151,7 @@ class Designer(Session):
         self.choose_from("File", index, separators, picture)
 
     def open_menu(self, x, y):
-        self.desktop.xdotool("mousemove", x, y, "click", 3)
+        self.input.click(x, y, button=3)
 
     def save_as(self, title, name, picture=None):
         """In a panel that has opened; what it proposes is selected."""
@@ -167,7 +173,7 @@ class Designer(Session):
         self.listen()
         place = (INSPECTOR[0] + first[0], INSPECTOR[1] + first[1] + row * ROW)
         self.input.double_click(*place)
-        self.desktop.xdotool("mousemove", *AWAY)
+        self.input.move(*AWAY)
         self.expect_told(f"BMessage({code})")
 
     def edit(self, kind, picture=None, **values):
@@ -217,11 +223,14 @@ class BareForm(Form):
             self.drag(start, end)
             return
         before = self.desktop.picture()
-        self.desktop.xdotool("mousemove", *self.at(start), "mousedown", 1, "mousemove", *self.at(end))
+        self.desktop.input.move(*self.at(start))
+        self.desktop.input.press()
+        self.desktop.input.move(*self.at(end))
         edge = self.at(((start[0] + end[0]) // 2, start[1]))
         wait_for("the frame is shown", lambda: self.desktop.picture().pixel(*edge) != before.pixel(*edge))
         self.session.shoot(picture)
-        self.desktop.xdotool("mouseup", 1, "mousemove", *AWAY)
+        self.desktop.input.release()
+        self.desktop.input.move(*AWAY)
 
     def draw(self, entry, frame, inside=(0, 0), event=False, picture=None, **values):
         """Chooses on the palette, draws the frame, which lies that far inside of the form, and sets the properties."""

@@ -15,7 +15,7 @@ import time
 from pathlib import Path
 
 import picture
-from xdesktop import wait_for
+from waits import wait_for
 from xtest import check, run, step
 
 WHOLE_LIMIT = 110

@@ -12,7 +12,7 @@ import shutil
 import sys
 
 from plimworks_on_x import Session
-from xdesktop import wait_for
+from waits import wait_for
 from xtest import check, run, step
 
 WHOLE_LIMIT = 150

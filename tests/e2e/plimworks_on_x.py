@@ -11,7 +11,7 @@ The exit code is 1 when something is not as it should be, and 77 where a tool is
 import shutil
 import sys
 
-from xdesktop import wait_for
+from waits import wait_for
 from xtest import check, run, step
 
 WHOLE_LIMIT = 220

@@ -14,8 +14,7 @@ import sys
 import time
 
 from watched import Watched
-from xdesktop import wait_for
-from xinput import Input
+from waits import wait_for
 from xtest import check, run, step
 
 WHOLE_LIMIT = 280
@@ -76,7 +75,7 @@ class Designer(Watched):
         super().__init__(desktop, [program, "all.plim"], f"designer-{turn}")
         self.turn = turn
         self.application, self.form, *self.components = components
-        self.input = Input(desktop)
+        self.input = desktop.input
         for title in ("Plimworks", "Components", "Project", self.form.value("Title")):
             desktop.wait_for_window(title)
         desktop.xdotool("windowmove", desktop.wait_for_window("Project"), *PROJECT_PLACE)

@@ -8,8 +8,7 @@ usage: tests/e2e/windows_on_x.py EXCHANGE_PROGRAM XDND_CLIENT FOLDER
 import sys
 
 from exchange import Program, check, main
-from xdesktop import wait_for
-from xinput import Input
+from waits import wait_for
 
 TITLED, MODAL_LOOK, FLOATING_LOOK = 1, 3, 7
 NORMAL, MODAL_APP, FLOATING_APP = 0, 1, 4
@@ -20,7 +19,7 @@ SIZE = 150
 class Session:
     def __init__(self, desktop, program):
         self.desktop = desktop
-        self.input = Input(desktop)
+        self.input = desktop.input
         self.one = Program(desktop, [program], "one")
         self.two = Program(desktop, [program], "two")
         for each in (self.one, self.two):

@@ -18,13 +18,9 @@ import time
 from pathlib import Path
 
 from picture import Picture
+from waits import LIMIT, Failure, wait_for
+from xinput import Input
 
-# More where programs are slow because a sanitizer watches them.
-PATIENCE = int(os.environ.get("PLIM_PATIENCE", "1"))
-# No wait is meant to come near this, on the slowest of machines.
-LIMIT = 40 * PATIENCE
-# Between two looks at what is waited for; most things come soon.
-SHORTEST_PAUSE, LONGEST_PAUSE = 0.001, 0.02
 TOOLS = ("Xvfb", "openbox", "xdotool", "xclip", "xsetroot")
 PR_SET_PDEATHSIG = 1
 AWAY = (1000, 740)
@@ -45,26 +41,8 @@ WINDOW_MANAGER_SETTINGS = """<?xml version="1.0" encoding="UTF-8"?>
 DESKTOP_COLOUR = "#51718f"
 
 
-class Failure(Exception):
-    """What was expected and did not happen."""
-
-
 def missing_tools(more=()):
     return [tool for tool in (*TOOLS, *more) if shutil.which(tool) is None]
-
-
-def wait_for(what, answer):
-    """Asks until \\a answer gives something true, and returns that."""
-    end = time.monotonic() + LIMIT
-    pause = SHORTEST_PAUSE
-    while True:
-        result = answer()
-        if result:
-            return result
-        if time.monotonic() > end:
-            raise Failure(f"this did not come about within {LIMIT} s: {what}")
-        time.sleep(pause)
-        pause = min(2 * pause, LONGEST_PAUSE)
 
 
 class Desktop:
@@ -78,6 +56,7 @@ class Desktop:
             self.environment.pop(name, None)
         self.children = []
         self.screen = None
+        self.input = None
         self.manager = None
 
     def __enter__(self):
@@ -145,6 +124,7 @@ class Desktop:
         self.environment["DISPLAY"] = f":{int(number)}"
         with open(self.folder / "Xvfb_screen0", "rb") as file:
             self.screen = mmap.mmap(file.fileno(), 0, prot=mmap.PROT_READ)
+        self.input = Input(self.environment["DISPLAY"])
 
     def start_window_manager(self):
         settings = self.folder / "openbox.xml"
@@ -204,20 +184,19 @@ class Desktop:
     def geometry(self, window):
         """Where the window's content is on the screen, and its size: left, top, width, height, in pixels."""
         size = values(self.xdotool("getwindowgeometry", "--shell", window))
-        # The place in that answer is wrong in a window manager's frame; the pointer's is the server's own.
-        place = values(self.xdotool("mousemove", "--window", window, 0, 0, "getmouselocation", "--shell"))
-        self.xdotool("mousemove", *AWAY)
-        return place["X"], place["Y"], size["WIDTH"], size["HEIGHT"]
+        # The place in that answer is wrong in a window manager's frame.
+        return *self.input.place_of(window), size["WIDTH"], size["HEIGHT"]
 
     def click(self, x, y):
         """Clicks and goes on at once to where nothing is: the pointer is in the pictures, too."""
-        self.xdotool("mousemove", x, y, "click", 1, "mousemove", *AWAY)
+        self.input.click(x, y)
+        self.input.move(*AWAY)
 
     def type(self, text):
         self.xdotool("type", "--delay", 1, text)
 
     def key(self, key):
-        self.xdotool("key", "--delay", 1, key)
+        self.input.key(key)
 
     # Pictures
 

@@ -1,26 +1,29 @@
 # SPDX-License-Identifier: MIT
-"""The pointer and the keys of an X server, many a millisecond: all events go through one connection.
+"""The pointer and the keys of an X server, many a millisecond: all events go through one connection, and no move overtakes a
+release, as those of separate programs do while the window manager holds the pointer.
 
 The server sends them to the windows in their order, so what follows waits only where another window has to be there first.
 """
 
 import ctypes
+import time
 
-from xdesktop import wait_for
+from waits import wait_for
 
-BUTTON, BUTTON_MASK = 1, 0x100
+FIRST_BUTTON_MASK = 0x100
 # XWindowAttributes as ints, with room to spare: five of them, three pointers and a number come before the place of the
 # state of mapping.
 ATTRIBUTES, MAP_STATE, VIEWABLE = ctypes.c_int * 64, 23, 2
 ASYNCHRONOUS, GRAB_SUCCESS = 1, 0
+STEP = 0.03  # seconds
 POINTER_ROOT = 1  # in place of a window: none has the focus by itself
 NAMED_KEYS = {"ctrl": "Control_L", "shift": "Shift_L", "alt": "Alt_L"}
 
 
 class Input:
-    """One connection to the server of a desktop."""
+    """One connection to a server."""
 
-    def __init__(self, desktop):
+    def __init__(self, server):
         self.x = ctypes.CDLL("libX11.so.6")
         self.test = ctypes.CDLL("libXtst.so.6")
         self.x.XOpenDisplay.restype = ctypes.c_void_p
@@ -30,7 +33,7 @@ class Input:
         # A window may go while it is asked about; that is no reason to end.
         self.ignore = ctypes.CFUNCTYPE(ctypes.c_int, ctypes.c_void_p, ctypes.c_void_p)(lambda *_: 0)
         self.x.XSetErrorHandler(self.ignore)
-        self.display = ctypes.c_void_p(self.x.XOpenDisplay(desktop.environment["DISPLAY"].encode()))
+        self.display = ctypes.c_void_p(self.x.XOpenDisplay(server.encode()))
         self.root = ctypes.c_ulong(self.x.XDefaultRootWindow(self.display))
         self.codes = {}
 
@@ -41,31 +44,48 @@ class Input:
 
     def move(self, x, y):
         self.test.XTestFakeMotionEvent(self.display, -1, int(x), int(y), ctypes.c_ulong(0))
+        self.flush()
 
-    def press(self, down):
-        self.test.XTestFakeButtonEvent(self.display, BUTTON, int(down), ctypes.c_ulong(0))
+    def press(self, button=1):
+        self.test.XTestFakeButtonEvent(self.display, button, 1, ctypes.c_ulong(0))
+        self.flush()
 
-    def is_pressed(self):
+    def release(self, button=1):
+        """Until it is on its way to its window: the window manager holds the pointer while it looks at a press, and keys
+        would get past it."""
+        self.test.XTestFakeButtonEvent(self.display, button, 0, ctypes.c_ulong(0))
+        wait_for("the button is released", lambda: not self.is_pressed(button))
+
+    def is_pressed(self, button=1):
         numbers = [ctypes.c_int() for _ in range(4)]
         windows = [ctypes.c_ulong() for _ in range(2)]
         mask = ctypes.c_uint()
         self.x.XQueryPointer(self.display, self.root, *map(ctypes.byref, [*windows, *numbers, mask]))
-        return mask.value & BUTTON_MASK != 0
+        return mask.value & FIRST_BUTTON_MASK << (button - 1) != 0
 
-    def click(self, x, y):
-        """Until the release is on its way to its window: the window manager holds the pointer while it looks at a press,
-        and keys would get past it."""
+    def click(self, x, y, button=1):
         self.move(x, y)
-        self.press(True)
-        self.press(False)
-        wait_for("the button is released", lambda: not self.is_pressed())
+        self.press(button)
+        self.release(button)
 
     def double_click(self, x, y):
         """Its presses are no longer apart than the server needs, however busy the machine is."""
         self.move(x, y)
-        for down in (True, False, True, False):
-            self.press(down)
-        wait_for("the button is released", lambda: not self.is_pressed())
+        for down in (1, 0, 1):
+            self.test.XTestFakeButtonEvent(self.display, 1, down, ctypes.c_ulong(0))
+        self.release()
+
+    def go(self, start, end, steps=8):
+        """Each step is a move of its own for the programs, too."""
+        for i in range(1, steps + 1):
+            self.move(*(start[j] + (end[j] - start[j]) * i // steps for j in (0, 1)))
+            time.sleep(STEP)
+
+    def drag(self, start, end):
+        self.move(*start)
+        self.press()
+        self.go(start, end)
+        self.release()
 
     def wait_until_let_go(self):
         """Until no other program holds the pointer: a window manager that moves a window follows it up to then, even when
@@ -165,6 +185,13 @@ class Input:
                 return True
             inside = ctypes.c_ulong(found.value)
         return False
+
+    def place_of(self, window):
+        """Where the window's content is on the screen: left and top, in pixels."""
+        left, top, child = ctypes.c_int(), ctypes.c_int(), ctypes.c_ulong()
+        self.x.XTranslateCoordinates(
+            self.display, ctypes.c_ulong(window), self.root, 0, 0, *map(ctypes.byref, [left, top, child]))
+        return left.value, top.value
 
     def wait_until_shown(self, title):
         wait_for(f"a window \"{title}\" is shown", lambda: self.is_shown(title))

@@ -8,7 +8,8 @@ import time
 import traceback
 from pathlib import Path
 
-from xdesktop import PATIENCE, Desktop, Failure, missing_tools
+from waits import PATIENCE, Failure
+from xdesktop import Desktop, missing_tools
 
 SKIPPED = 77
 START = time.monotonic()
