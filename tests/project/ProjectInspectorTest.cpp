@@ -62,6 +62,8 @@ protected:
 
 	void Select(int32 row)
 	{
+		// A new form shows itself when its window becomes active, which must not come after this.
+		ASSERT_TRUE(fRobot.Settle());
 		{
 			WindowGuard guard(Window());
 			ASSERT_TRUE(guard.IsLocked());
