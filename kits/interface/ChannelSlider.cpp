@@ -8,6 +8,8 @@
 #include <Message.h>
 #include <Window.h>
 
+#include "ThumbTracking.h"
+
 namespace {
 
 constexpr int32 kMostChannels = 32;
@@ -33,15 +35,89 @@ MessageNumber(const BView* view, const char* name)
 
 } // namespace
 
+/// Changes the value of the channel whose thumb is held, or by as much those of all, and has them sent.
+class BChannelSlider::Thumb : public BPrivate::ThumbTracking {
+public:
+	explicit Thumb(BChannelSlider* slider)
+		: ThumbTracking(slider),
+		  fSlider(slider),
+		  fMovesAll(false),
+		  fValueBefore(0)
+	{
+	}
+
+	bool MovesAll() const { return fMovesAll; }
+	/// For the press that comes now, of the slider's current channel.
+	void SetMovesAll(bool movesAll)
+	{
+		fMovesAll = movesAll;
+		fValueBefore = fSlider->Value();
+	}
+
+protected:
+	void ChangeBegins() override;
+	void MoveThumb(BPoint middle) override;
+	void ChangeEnds() override;
+
+private:
+	BChannelSlider* fSlider;
+	bool fMovesAll;
+	std::vector<int32> fValuesBefore;
+	// Of the moved channel where the drag began.
+	int32 fValueBefore;
+};
+
+
+void
+BChannelSlider::Thumb::ChangeBegins()
+{
+	fValuesBefore.assign(fSlider->ValueList(), fSlider->ValueList() + fSlider->CountChannels());
+}
+
+
+void
+BChannelSlider::Thumb::MoveThumb(BPoint middle)
+{
+	// The program may have taken channels away meanwhile.
+	const int32 channel = fSlider->CurrentChannel();
+	if (channel >= fSlider->CountChannels())
+		return;
+	const int32 value = fSlider->ValueAt(middle, channel);
+	std::vector<int32> values(
+		fSlider->ValueList(), fSlider->ValueList() + fSlider->CountChannels());
+	values[channel] = value;
+	if (fMovesAll) {
+		const int64 way = static_cast<int64>(value) - fValueBefore;
+		for (size_t i = 0; i < std::min(values.size(), fValuesBefore.size()); i++) {
+			values[i] = static_cast<int32>(std::clamp<int64>(
+				fValuesBefore[i] + way, fSlider->MinLimitList()[i], fSlider->MaxLimitList()[i]));
+		}
+	}
+	fSlider->ChangeValues(values);
+}
+
+
+void
+BChannelSlider::Thumb::ChangeEnds()
+{
+	const auto changed = std::make_unique<bool[]>(fSlider->CountChannels());
+	bool anyChanged = false;
+	for (int32 i = 0; i < fSlider->CountChannels(); i++) {
+		const size_t place = static_cast<size_t>(i);
+		changed[i] = place >= fValuesBefore.size() || fSlider->ValueFor(i) != fValuesBefore[place];
+		anyChanged = anyChanged || changed[i];
+	}
+	if (anyChanged)
+		fSlider->InvokeChannel(NULL, 0, -1, changed.get());
+}
+
+
 BChannelSlider::BChannelSlider(BRect area, const char* name, const char* label, BMessage* message,
 	orientation orientation, int32 channels, uint32 resizeMode, uint32 flags)
 	: BChannelControl(area, name, label, message, std::min(channels, kMostChannels), resizeMode,
 		flags | B_FULL_UPDATE_ON_RESIZE),
 	  fOrientation(orientation),
-	  fIsChanging(false),
-	  fMovesAll(false),
-	  fGrabOffset(0),
-	  fValueBefore(0)
+	  fThumb(std::make_unique<Thumb>(this))
 {
 }
 
@@ -64,10 +140,7 @@ BChannelSlider::BChannelSlider(const char* name, const char* label, BMessage* me
 BChannelSlider::BChannelSlider(BMessage* archive)
 	: BChannelControl(archive),
 	  fOrientation(static_cast<orientation>(archive->GetInt32("_orient", B_HORIZONTAL))),
-	  fIsChanging(false),
-	  fMovesAll(false),
-	  fGrabOffset(0),
-	  fValueBefore(0)
+	  fThumb(std::make_unique<Thumb>(this))
 {
 	if (CountChannels() > kMostChannels)
 		SetChannelCount(kMostChannels);
@@ -95,7 +168,7 @@ BChannelSlider::Archive(BMessage* archive, bool deep) const
 void
 BChannelSlider::DetachedFromWindow()
 {
-	fIsChanging = false;
+	fThumb->Cancel();
 	BChannelControl::DetachedFromWindow();
 }
 
@@ -107,40 +180,25 @@ BChannelSlider::MouseDown(BPoint where)
 	if (!IsEnabled() || channel < 0)
 		return;
 	SetCurrentChannel(channel);
-	SetMouseEventMask(B_POINTER_EVENTS, B_NO_POINTER_HISTORY | B_LOCK_WINDOW_FOCUS);
-	SetTracking(true);
-	fMovesAll = MessageNumber(this, "buttons") == B_SECONDARY_MOUSE_BUTTON
-		|| (MessageNumber(this, "modifiers") & B_SHIFT_KEY) != 0;
-	BeginChange();
-	fValueBefore = ValueFor(channel);
-	// A thumb that is taken hold of stays under the pointer; beside it, it comes there.
+	fThumb->SetMovesAll(MessageNumber(this, "buttons") == B_SECONDARY_MOUSE_BUTTON
+		|| (MessageNumber(this, "modifiers") & B_SHIFT_KEY) != 0);
 	const BRect bar = BarFrame(channel);
-	const BPoint middle = ThumbPoint(bar, channel);
-	const bool holdsThumb = ThumbFrame(bar, channel).Contains(where);
-	fGrabOffset = !holdsThumb ? 0 : IsVertical() ? middle.y - where.y : middle.x - where.x;
-	if (!holdsThumb)
-		TrackTo(where);
-	Invalidate();
+	fThumb->MouseDown(where, ThumbFrame(bar, channel), ThumbPoint(bar, channel),
+		B_NO_POINTER_HISTORY | B_LOCK_WINDOW_FOCUS);
 }
 
 
 void
 BChannelSlider::MouseMoved(BPoint where, uint32, const BMessage*)
 {
-	if (IsTracking())
-		TrackTo(where);
+	fThumb->MouseMoved(where);
 }
 
 
 void
 BChannelSlider::MouseUp(BPoint where)
 {
-	if (!IsTracking())
-		return;
-	TrackTo(where);
-	SetTracking(false);
-	Invalidate();
-	FinishChange();
+	fThumb->MouseUp(where);
 }
 
 
@@ -161,7 +219,7 @@ BChannelSlider::KeyDown(const char* bytes, int32 numBytes)
 	const bool isUpright = key == B_UP_ARROW || key == B_DOWN_ARROW;
 	if (isArrow && isUpright != IsVertical()) {
 		const bool next = key == B_RIGHT_ARROW || key == B_DOWN_ARROW;
-		FinishChange();
+		fThumb->FinishChange();
 		SetCurrentChannel(CurrentChannel() + (next ? 1 : -1));
 		return;
 	}
@@ -169,7 +227,7 @@ BChannelSlider::KeyDown(const char* bytes, int32 numBytes)
 	int64 value = isForward ? Value() + step : Value() - step;
 	if (!isArrow)
 		value = key == B_HOME ? minimum : maximum;
-	BeginChange();
+	fThumb->BeginChange();
 	std::vector<int32> values(ValueList(), ValueList() + CountChannels());
 	values[CurrentChannel()] = static_cast<int32>(std::clamp<int64>(value, minimum, maximum));
 	ChangeValues(values);
@@ -180,8 +238,7 @@ void
 BChannelSlider::KeyUp(const char* bytes, int32 numBytes)
 {
 	BChannelControl::KeyUp(bytes, numBytes);
-	if (!IsTracking())
-		FinishChange();
+	fThumb->KeyReleased();
 }
 
 
@@ -189,19 +246,16 @@ void
 BChannelSlider::MakeFocus(bool focus)
 {
 	BChannelControl::MakeFocus(focus);
-	// The release of the key that moved the thumb goes elsewhere.
-	if (!focus && !IsTracking())
-		FinishChange();
+	if (!focus)
+		fThumb->KeyReleased();
 }
 
 
 void
 BChannelSlider::SetEnabled(bool on)
 {
-	if (!on && IsTracking()) {
-		SetTracking(false);
-		FinishChange();
-	}
+	if (!on)
+		fThumb->Disabled();
 	BChannelControl::SetEnabled(on);
 }
 
@@ -243,36 +297,11 @@ BChannelSlider::IsVertical() const
 }
 
 
-/// Notes what the values are before the user changes them, until FinishChange().
-void
-BChannelSlider::BeginChange()
+/// Whether the thumbs move together.
+bool
+BChannelSlider::MovesAll() const
 {
-	if (fIsChanging)
-		return;
-	fIsChanging = true;
-	fValuesBefore.assign(ValueList(), ValueList() + CountChannels());
-}
-
-
-void
-BChannelSlider::TrackTo(BPoint where)
-{
-	// The program may have taken channels away meanwhile.
-	const int32 channel = CurrentChannel();
-	if (channel >= CountChannels())
-		return;
-	where += IsVertical() ? BPoint(0, fGrabOffset) : BPoint(fGrabOffset, 0);
-	const int32 value = ValueAt(where, channel);
-	std::vector<int32> values(ValueList(), ValueList() + CountChannels());
-	values[channel] = value;
-	if (fMovesAll) {
-		const int64 way = static_cast<int64>(value) - fValueBefore;
-		for (size_t i = 0; i < std::min(values.size(), fValuesBefore.size()); i++) {
-			values[i] = static_cast<int32>(
-				std::clamp<int64>(fValuesBefore[i] + way, MinLimitList()[i], MaxLimitList()[i]));
-		}
-	}
-	ChangeValues(values);
+	return fThumb->MovesAll();
 }
 
 
@@ -295,23 +324,4 @@ BChannelSlider::ChangeValues(const std::vector<int32>& values)
 	BeginInvokeNotify(B_CONTROL_MODIFIED);
 	InvokeChannel(ModificationMessage(), 0, -1, changed.get());
 	EndInvokeNotify();
-}
-
-
-void
-BChannelSlider::FinishChange()
-{
-	if (!fIsChanging)
-		return;
-	fIsChanging = false;
-	const auto changed = std::make_unique<bool[]>(CountChannels());
-	bool anyChanged = false;
-	for (int32 i = 0; i < CountChannels(); i++) {
-		const size_t place = static_cast<size_t>(i);
-		changed[i] = place >= fValuesBefore.size() || ValueFor(i) != fValuesBefore[place];
-		anyChanged = anyChanged || changed[i];
-	}
-	// What is sent may have the control deleted: nothing comes after it.
-	if (anyChanged)
-		InvokeChannel(NULL, 0, -1, changed.get());
 }

@@ -217,7 +217,7 @@ BChannelSlider::DrawChannel(const Places& places, int32 channel)
 		this, bar, BPrivate::StrengthOf(IsEnabled(), color, ViewColor()), BRect(), color);
 	const bool isCurrent = channel == CurrentChannel();
 	const bool isFocused = isCurrent && IsFocus() && Window()->IsActive();
-	const bool isHeld = IsTracking() && (isCurrent || fMovesAll);
+	const bool isHeld = IsTracking() && (isCurrent || MovesAll());
 	BPrivate::DrawBlockThumb(
 		this, ThumbFrame(bar, channel), fOrientation, {IsEnabled(), isFocused, isHeld});
 }

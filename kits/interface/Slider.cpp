@@ -8,12 +8,46 @@
 #include <Message.h>
 #include <Window.h>
 
+#include "ThumbTracking.h"
+
 namespace {
 
 constexpr float kDefaultBarThickness = 6;
 constexpr int32 kDefaultSnooze = 20000;
 
 } // namespace
+
+/// Changes the slider's value, and has it sent.
+class BSlider::Thumb : public BPrivate::ThumbTracking {
+public:
+	explicit Thumb(BSlider* slider)
+		: ThumbTracking(slider),
+		  fSlider(slider),
+		  fValueBefore(0)
+	{
+	}
+
+protected:
+	void ChangeBegins() override { fValueBefore = fSlider->Value(); }
+
+	void MoveThumb(BPoint middle) override
+	{
+		const int32 value = fSlider->ValueForPoint(middle);
+		if (value != fSlider->Value())
+			fSlider->ChangeValue(value);
+	}
+
+	void ChangeEnds() override
+	{
+		if (fSlider->Value() != fValueBefore)
+			fSlider->Invoke();
+	}
+
+private:
+	BSlider* fSlider;
+	int32 fValueBefore;
+};
+
 
 BSlider::BSlider(BRect frame, const char* name, const char* label, BMessage* message,
 	int32 minValue, int32 maxValue, orientation posture, thumb_style thumbType, uint32 resizingMode,
@@ -34,9 +68,7 @@ BSlider::BSlider(BRect frame, const char* name, const char* label, BMessage* mes
 	  fUsesBarColor(false),
 	  fUsesFillColor(false),
 	  fHasFillColor(false),
-	  fIsChanging(false),
-	  fValueBefore(minValue),
-	  fGrabOffset(0)
+	  fThumb(std::make_unique<Thumb>(this))
 {
 	SetValueNoUpdate(minValue);
 }
@@ -75,9 +107,7 @@ BSlider::BSlider(BMessage* archive)
 	  fUsesBarColor(archive->FindColor("_bcolor", &fBarColor) == B_OK),
 	  fUsesFillColor(archive->GetBool("_usefill", false)),
 	  fHasFillColor(archive->FindColor("_fcolor", &fFillColor) == B_OK),
-	  fIsChanging(false),
-	  fValueBefore(0),
-	  fGrabOffset(0)
+	  fThumb(std::make_unique<Thumb>(this))
 {
 	archive->FindString("_minlbl", &fMinLimitLabel);
 	archive->FindString("_maxlbl", &fMaxLimitLabel);
@@ -142,7 +172,7 @@ BSlider::Archive(BMessage* archive, bool deep) const
 void
 BSlider::DetachedFromWindow()
 {
-	fIsChanging = false;
+	fThumb->Cancel();
 	BControl::DetachedFromWindow();
 }
 
@@ -173,7 +203,7 @@ BSlider::KeyDown(const char* bytes, int32 numBytes)
 	}
 	if (!IsEnabled())
 		return;
-	BeginChange();
+	fThumb->BeginChange();
 	ChangeValue(static_cast<int32>(std::clamp<int64>(value, fMinimum, fMaximum)));
 }
 
@@ -182,8 +212,7 @@ void
 BSlider::KeyUp(const char* bytes, int32 numBytes)
 {
 	BControl::KeyUp(bytes, numBytes);
-	if (!IsTracking())
-		FinishChange();
+	fThumb->KeyReleased();
 }
 
 
@@ -191,48 +220,32 @@ void
 BSlider::MakeFocus(bool focus)
 {
 	BControl::MakeFocus(focus);
-	// The release of the key that moved the thumb goes elsewhere.
-	if (!focus && !IsTracking())
-		FinishChange();
+	if (!focus)
+		fThumb->KeyReleased();
 }
 
 
 void
 BSlider::MouseDown(BPoint where)
 {
-	if (!IsEnabled())
-		return;
-	SetMouseEventMask(B_POINTER_EVENTS, B_NO_POINTER_HISTORY | B_SUSPEND_VIEW_FOCUS);
-	SetTracking(true);
-	BeginChange();
-	// A thumb that is taken hold of stays under the pointer; beside it, it comes there.
-	const BRect thumb = ThumbFrame();
-	const bool holdsThumb = thumb.Contains(where);
-	const BPoint middle = ThumbPoint();
-	fGrabOffset = !holdsThumb ? 0 : IsHorizontal() ? middle.x - where.x : middle.y - where.y;
-	if (!holdsThumb)
-		TrackTo(where);
-	Invalidate();
+	if (IsEnabled()) {
+		fThumb->MouseDown(
+			where, ThumbFrame(), ThumbPoint(), B_NO_POINTER_HISTORY | B_SUSPEND_VIEW_FOCUS);
+	}
 }
 
 
 void
 BSlider::MouseMoved(BPoint where, uint32, const BMessage*)
 {
-	if (IsTracking())
-		TrackTo(where);
+	fThumb->MouseMoved(where);
 }
 
 
 void
 BSlider::MouseUp(BPoint where)
 {
-	if (!IsTracking())
-		return;
-	TrackTo(where);
-	SetTracking(false);
-	Invalidate();
-	FinishChange();
+	fThumb->MouseUp(where);
 }
 
 
@@ -324,10 +337,8 @@ BSlider::GetLimits(int32* minimum, int32* maximum) const
 void
 BSlider::SetEnabled(bool enable)
 {
-	if (!enable && IsTracking()) {
-		SetTracking(false);
-		FinishChange();
-	}
+	if (!enable)
+		fThumb->Disabled();
 	BControl::SetEnabled(enable);
 }
 
@@ -490,17 +501,6 @@ BSlider::SetBarThickness(float thickness)
 }
 
 
-/// Notes what the value is before the user changes it, until FinishChange().
-void
-BSlider::BeginChange()
-{
-	if (fIsChanging)
-		return;
-	fIsChanging = true;
-	fValueBefore = Value();
-}
-
-
 void
 BSlider::ChangeValue(int32 value)
 {
@@ -508,28 +508,6 @@ BSlider::ChangeValue(int32 value)
 	SetValue(value);
 	if (Value() != before && fModificationMessage != NULL)
 		InvokeNotify(fModificationMessage, B_CONTROL_MODIFIED);
-}
-
-
-void
-BSlider::FinishChange()
-{
-	if (!fIsChanging)
-		return;
-	fIsChanging = false;
-	// What is sent may have the slider deleted: nothing comes after it.
-	if (Value() != fValueBefore)
-		Invoke();
-}
-
-
-void
-BSlider::TrackTo(BPoint where)
-{
-	where += IsHorizontal() ? BPoint(fGrabOffset, 0) : BPoint(0, fGrabOffset);
-	const int32 value = ValueForPoint(where);
-	if (value != Value())
-		ChangeValue(value);
 }
 
 

@@ -3,6 +3,8 @@
 #ifndef _CHANNEL_SLIDER_H
 #define _CHANNEL_SLIDER_H
 
+#include <memory>
+
 #include <ChannelControl.h>
 
 /// A thumb for each channel, on bars side by side or, when it is horizontal, one below the other.
@@ -50,8 +52,10 @@ public:
 
 private:
 	struct Places;
+	class Thumb;
 
 	bool IsVertical() const;
+	bool MovesAll() const;
 	Places PlacesOf() const;
 	BRect BarFrame(int32 channel) const;
 	BRect BarFrame(const Places& places, int32 channel) const;
@@ -64,18 +68,10 @@ private:
 	void DrawLabels(const Places& places);
 	void DrawLine(const char* text, BPoint middle);
 
-	void BeginChange();
-	void TrackTo(BPoint where);
 	void ChangeValues(const std::vector<int32>& values);
-	void FinishChange();
 
 	orientation fOrientation;
-	bool fIsChanging;
-	bool fMovesAll;
-	float fGrabOffset;
-	std::vector<int32> fValuesBefore;
-	// Of the moved channel where the drag began.
-	int32 fValueBefore;
+	std::unique_ptr<Thumb> fThumb;
 };
 
 #endif // _CHANNEL_SLIDER_H

@@ -9,7 +9,8 @@
 
 namespace BPrivate {
 class ClickTracking;
-}
+class ThumbTracking;
+} // namespace BPrivate
 
 enum {
 	B_CONTROL_OFF = 0,
@@ -73,6 +74,7 @@ protected:
 
 private:
 	friend class BPrivate::ClickTracking;
+	friend class BPrivate::ThumbTracking;
 
 	BString fLabel;
 	int32 fValue;

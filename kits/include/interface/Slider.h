@@ -3,6 +3,8 @@
 #ifndef _SLIDER_H
 #define _SLIDER_H
 
+#include <memory>
+
 #include <Control.h>
 
 enum hash_mark_location {
@@ -125,10 +127,9 @@ public:
 	virtual void SetBarThickness(float thickness);
 
 private:
-	void BeginChange();
+	class Thumb;
+
 	void ChangeValue(int32 value);
-	void FinishChange();
-	void TrackTo(BPoint where);
 	void Redraw();
 
 	bool IsHorizontal() const;
@@ -156,9 +157,7 @@ private:
 	bool fUsesBarColor;
 	bool fUsesFillColor;
 	bool fHasFillColor;
-	bool fIsChanging;
-	int32 fValueBefore;
-	float fGrabOffset;
+	std::unique_ptr<Thumb> fThumb;
 };
 
 #endif // _SLIDER_H
