@@ -219,20 +219,25 @@ PanelList::FrameResized(float newWidth, float newHeight)
 }
 
 
+/// What changes where keys go is done by the window at once, and not when a message comes: keys that wait in the
+/// queue were typed for afterwards.
 void
 PanelList::KeyDown(const char* bytes, int32 numBytes)
 {
 	switch (bytes[0]) {
 		case B_BACKSPACE:
-			Window()->PostMessage(kMsgGoUp);
+		{
+			BMessage goUp(kMsgGoUp);
+			Window()->MessageReceived(&goUp);
 			break;
+		}
 
 		case '/':
 		case '~':
 		{
 			BMessage typed(kMsgPathTyped);
 			typed.AddString("text", bytes);
-			Window()->PostMessage(&typed);
+			Window()->MessageReceived(&typed);
 			break;
 		}
 

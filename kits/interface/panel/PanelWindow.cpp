@@ -76,20 +76,12 @@ PanelWindow::MessageReceived(BMessage* message)
 			Invoked();
 			break;
 
-		case kMsgEnter:
-			EnterSelected(true);
-			break;
-
 		case kMsgGoUp:
 			GoUp();
 			break;
 
 		case kMsgPathTyped:
 			EditPath(message->GetString("text", ""));
-			break;
-
-		case kMsgEditPath:
-			fPath->MakeFocus(true);
 			break;
 
 		case kMsgPathEdited:
@@ -354,13 +346,17 @@ PanelWindow::SetOrder(const BMessage& message)
 
 
 /// Enter means what the focus is about, before the default button gets it; Escape first takes back a path that is
-/// being typed. True when it is done.
+/// being typed. Keys that move the focus do so before the next key comes, which a shortcut's message would not.
+/// True when it is done.
 bool
 PanelWindow::HandleKey(const BMessage& message)
 {
 	const uint32 kHeldModifiers = B_SHIFT_KEY | B_COMMAND_KEY | B_CONTROL_KEY | B_OPTION_KEY;
 	const int32 key = message.GetInt32("raw_char", 0);
-	if ((message.GetInt32("modifiers", 0) & kHeldModifiers) != 0)
+	const uint32 held = message.GetInt32("modifiers", 0) & kHeldModifiers;
+	if (held == B_COMMAND_KEY || held == B_CONTROL_KEY)
+		return HandleFocusKey(key, held == B_COMMAND_KEY);
+	if (held != 0)
 		return false;
 
 	const bool isInPath = CurrentFocus() == fPath->TextView();
@@ -374,6 +370,30 @@ PanelWindow::HandleKey(const BMessage& message)
 		return true;
 	}
 	return key == B_ENTER && CurrentFocus() == fList && EnterSelected(false);
+}
+
+
+bool
+PanelWindow::HandleFocusKey(int32 key, bool isCommand)
+{
+	switch (key) {
+		case B_UP_ARROW:
+			GoUp();
+			return true;
+
+		case B_DOWN_ARROW:
+			EnterSelected(true);
+			return true;
+
+		case 'l':
+		case 'L':
+			if (isCommand)
+				fPath->MakeFocus(true);
+			return isCommand;
+
+		default:
+			return false;
+	}
 }
 
 

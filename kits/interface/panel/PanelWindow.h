@@ -70,6 +70,7 @@ private:
 	void HandleDrop(const BMessage& message);
 	void SetOrder(const BMessage& message);
 	bool HandleKey(const BMessage& message);
+	bool HandleFocusKey(int32 key, bool isCommand);
 	void GoTo(const std::string& folder, const std::string& select = "");
 	bool TryFolder(const std::string& path, const std::string& select = "");
 	void GoUp();

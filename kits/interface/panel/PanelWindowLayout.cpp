@@ -190,13 +190,8 @@ PanelWindow::LayOut()
 void
 PanelWindow::AddShortcuts()
 {
-	AddShortcut(B_UP_ARROW, B_COMMAND_KEY, new BMessage(kMsgGoUp));
-	AddShortcut(B_DOWN_ARROW, B_COMMAND_KEY, new BMessage(kMsgEnter));
-	AddShortcut(B_UP_ARROW, B_CONTROL_KEY | B_NO_COMMAND_KEY, new BMessage(kMsgGoUp));
-	AddShortcut(B_DOWN_ARROW, B_CONTROL_KEY | B_NO_COMMAND_KEY, new BMessage(kMsgEnter));
 	AddShortcut('n', B_COMMAND_KEY, new BMessage(kMsgNewFolder));
 	AddShortcut('h', B_COMMAND_KEY, new BMessage(kMsgToggleHidden));
-	AddShortcut('l', B_COMMAND_KEY, new BMessage(kMsgEditPath));
 	AddShortcut('w', B_COMMAND_KEY, new BMessage(kMsgCancel));
 }
 

@@ -11,8 +11,6 @@ enum : uint32 {
 	kMsgDefault = '_PDf',
 	kMsgCancel = '_PCn',
 	/// Into the selected folder.
-	kMsgEnter = '_PEn',
-	kMsgEditPath = '_PEd',
 	kMsgPathEdited = '_PPe',
 	kMsgHiddenChanged = '_PHc',
 	kMsgToggleHidden = '_PHt',

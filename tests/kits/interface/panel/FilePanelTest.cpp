@@ -342,6 +342,28 @@ TEST_F(FilePanelTest, ATypedPathIsCompleted)
 }
 
 
+TEST_F(FilePanelTest, KeysThatWaitGoWhereTheKeysBeforeThemLead)
+{
+	fFolder.Make("other");
+	fFolder.Write("other/banana");
+	fFolder.Write("other/cherry");
+	Open();
+	// The first slash leads to the path's field.
+	TypeInOneGo(fFolder / "other/x");
+	EXPECT_EQ(fRobot.Text("path"), fFolder / "other/x");
+	// Enter leads to the list again, Backspace there to the folder above.
+	TypeInOneGo("\b\nch");
+	EXPECT_TRUE(WaitForRows({"banana", "cherry"}));
+	EXPECT_TRUE(WaitUntil([&] { return Selected() == List{"cherry"}; }));
+	TypeInOneGo("\bot\nba");
+	EXPECT_TRUE(WaitForRows({"banana", "cherry"}));
+	EXPECT_TRUE(WaitUntil([&] { return Selected() == List{"banana"}; }));
+	TypeInOneGo("\b~/x");
+	EXPECT_EQ(fRobot.Text("path"), "~/x");
+	EXPECT_EQ(ShownFolder(), fFolder.Path());
+}
+
+
 TEST_F(FilePanelTest, ATypedPathThatLeadsNowhereIsExplained)
 {
 	Open();

@@ -6,9 +6,11 @@
 #include <atomic>
 #include <chrono>
 #include <condition_variable>
+#include <future>
 #include <memory>
 #include <mutex>
 #include <string>
+#include <thread>
 #include <vector>
 
 #include <gtest/gtest.h>
@@ -137,6 +139,22 @@ protected:
 		ASSERT_TRUE(fPanel->Window()->Lock());
 		function();
 		fPanel->Window()->Unlock();
+	}
+
+	/// All keys wait by the time that the panel's window handles the first one.
+	void TypeInOneGo(const std::string& text)
+	{
+		std::promise<void> held;
+		std::thread holder([&] {
+			const bool isLocked = fPanel->Window()->Lock();
+			held.set_value();
+			snooze(20'000);
+			if (isLocked)
+				fPanel->Window()->Unlock();
+		});
+		held.get_future().wait();
+		fRobot.Type(text.c_str());
+		holder.join();
 	}
 
 	/// Waits for a condition, with a limit.
