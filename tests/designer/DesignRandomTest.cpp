@@ -116,7 +116,7 @@ protected:
 		BPoint where;
 		const int kind = Number(100);
 		const bool isForMore = kind < 20 || (kind >= 87 && kind < 92);
-		if (isForMore && IsFull()) {
+		if (isForMore && IsFull(Form())) {
 			// What lies beside the form, or below others, is out of reach.
 			if (!SomeComponent(false, &where) || !ChooseFromMenu(where, "Delete"))
 				return "full";
@@ -143,10 +143,12 @@ protected:
 			return "click";
 		}
 		if (kind < 76) {
-			WorkOn(Form() == fForms[0] ? fForms[1] : fForms[0]);
+			WorkOn(OtherForm());
 			return "other form";
 		}
 		if (kind < 82) {
+			if (IsFull(OtherForm()))
+				return "full on the other side";
 			if (SomeComponent(false, &where)) {
 				const BPoint distance(0, fForms[0] == Form() ? 320 : -320);
 				Drag(where, BPoint(Number(280) + 10, Number(280) + 10) + distance);
@@ -207,11 +209,12 @@ protected:
 		return "delete all";
 	}
 
-	bool IsFull() const
+	TDesignForm* OtherForm() const { return Form() == fForms[0] ? fForms[1] : fForms[0]; }
+
+	static bool IsFull(TDesignForm* form)
 	{
-		bool isFull = false;
-		Locked([&] { isFull = Form()->CountComponents() >= kMostComponents; });
-		return isFull;
+		WindowGuard guard(form);
+		return form->CountComponents() >= kMostComponents;
 	}
 
 	/// Runs \a paste; what is new on the form then tells the frame that was copied.
