@@ -140,4 +140,15 @@ host_error()
 	return errno == 0 ? B_ERROR : host_error(errno);
 }
 
+
+int
+host_errno(status_t status)
+{
+	for (const ErrorPair& pair : kErrors) {
+		if (pair.status == status)
+			return pair.host;
+	}
+	return 0;
+}
+
 } // namespace BPrivate

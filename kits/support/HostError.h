@@ -15,6 +15,9 @@ status_t host_error(int error);
 /// The status for the calling thread's errno, never B_OK.
 status_t host_error();
 
+/// The host's errno value for a status; 0 when it has none.
+int host_errno(status_t status);
+
 } // namespace BPrivate
 
 #endif // _HOST_ERROR_H

@@ -620,8 +620,19 @@ TEST(PlimgenTest, AProjectThatCannotBeReadIsToldByName)
 			EXPECT_TRUE(
 				Has(result.err, "plimgen: " + folder.At(name) + ": the project cannot be read"))
 				<< result.err;
+			EXPECT_FALSE(Has(result.err, "Unknown error")) << result.err;
 		}
 	}
+}
+
+
+TEST(PlimgenTest, WhyAFileCannotBeReadIsToldInWords)
+{
+	ProjectFolder folder;
+	EXPECT_TRUE(Has(Plimgen({folder.At("missing.plim")}).err,
+		"cannot be read (No such file or directory); name a project file"));
+	EXPECT_TRUE(Has(Plimgen({folder.SaveSimple(), "--components", folder.At("missing")}).err,
+		"cannot be read (No such file or directory); check the option"));
 }
 
 
@@ -702,8 +713,8 @@ TEST(PlimgenTest, AFileThatCannotBeReadIsLeftAloneAndTheOthersWritten)
 	std::filesystem::create_directories(folder.At("out/Form1.cpp"));
 	const program_result result = Plimgen({project});
 	EXPECT_EQ(result.code, 3);
-	EXPECT_TRUE(
-		Has(result.err, "plimgen: " + folder.At("out/Form1.cpp") + ": the file cannot be read"));
+	EXPECT_TRUE(Has(result.err,
+		"plimgen: " + folder.At("out/Form1.cpp") + ": the file cannot be read (Is a directory)"));
 	EXPECT_TRUE(Has(result.out, "created " + folder.At("out/Form1.h")));
 	EXPECT_TRUE(std::filesystem::is_directory(folder.At("out/Form1.cpp")));
 }
