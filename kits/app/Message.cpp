@@ -108,6 +108,7 @@ BMessage::CopyFrom(const BMessage& other)
 	memcpy(fBody->buckets, other.fBody->buckets, sizeof(fBody->buckets));
 	fBody->fieldCount = other.fBody->fieldCount;
 	fBody->dataSize = other.fBody->dataSize;
+	fBody->isRegular = other.fBody->isRegular;
 	memcpy(fBody->Fields(), other.fBody->Fields(), fBody->fieldCount * sizeof(Field));
 	memcpy(fBody->Data(), other.fBody->Data(), fBody->dataSize);
 	fBody->IndexNames();

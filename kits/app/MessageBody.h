@@ -95,6 +95,8 @@ struct BMessage::Body {
 	// open addressing, a power of two in size, -1 where it is empty. Null without.
 	int32* names;
 	uint32 namesSize;
+	// Whether looking for the name of any field finds that field. In a file names can occur twice, and in chains of others.
+	bool isRegular;
 
 	/// An empty body with room for that much; null when there is no memory.
 	static Body* Create(uint32 fieldCapacity, uint32 dataCapacity);
@@ -124,6 +126,8 @@ struct BMessage::Body {
 	int32* NameSlot(const FieldName& name);
 	/// Enters a field that was linked at the end of its chain.
 	void AddName(int32 index);
+	/// Follows the hash chains; false when one never ends. Finds out whether the fields are regular, if they are few.
+	bool CheckChains();
 	/// Forgets the table and the ends of the chains, before a field goes or gets another name.
 	void DropNames();
 

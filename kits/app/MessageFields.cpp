@@ -48,6 +48,7 @@ BMessage::Body::Create(uint32 fieldCapacity, uint32 dataCapacity)
 	std::fill_n(body->lastLinks, kBucketCount, -1);
 	body->names = nullptr;
 	body->namesSize = 0;
+	body->isRegular = true;
 	return body;
 }
 
@@ -139,9 +140,35 @@ BMessage::Body::AddName(int32 index)
 }
 
 
+bool
+BMessage::Body::CheckChains()
+{
+	const Field* fields = Fields();
+	uint32 found = 0;
+	isRegular = fieldCount < kIndexedFieldCount;
+	for (uint32 bucket = 0; bucket < kBucketCount; bucket++) {
+		const int32 first = buckets[bucket];
+		uint32 length = 0;
+		for (int32 link = first; link >= 0; link = fields[link].next) {
+			if (++length > fieldCount)
+				return false;
+			if (!isRegular)
+				continue;
+			isRegular = fields[link].hash % kBucketCount == bucket;
+			for (int32 other = first; other != link && isRegular; other = fields[other].next)
+				isRegular = fields[other].hash != fields[link].hash;
+		}
+		found += length;
+	}
+	isRegular = isRegular && found == fieldCount;
+	return true;
+}
+
+
 void
 BMessage::Body::DropNames()
 {
+	isRegular = false;
 	free(names);
 	names = nullptr;
 	namesSize = 0;
@@ -186,7 +213,7 @@ BMessage::IndexOf(const char* name) const
 	if (cursorField < fBody->fieldCount) {
 		const Field& field = fBody->Fields()[cursorField];
 		if (name == fBody->NameOf(field))
-			return IndexOf(FieldName(name, field));
+			return fBody->isRegular ? int32(cursorField) : IndexOf(FieldName(name, field));
 	}
 	return IndexOf(FieldName(name));
 }
@@ -302,6 +329,7 @@ BMessage::Reserve(uint32 moreFields, uint32 moreData)
 		std::copy_n(fBody->lastLinks, kBucketCount, body->lastLinks);
 		body->names = fBody->names;
 		body->namesSize = fBody->namesSize;
+		body->isRegular = fBody->isRegular;
 		memcpy(body->Fields(), fBody->Fields(), fBody->fieldCount * sizeof(Field));
 		memcpy(body->Data(), fBody->Data(), fBody->dataSize);
 		fBody->names = nullptr;

@@ -232,16 +232,10 @@ BMessage::Private::ParseHaiku(
 		}
 	}
 
-	for (int32 link : body->buckets) {
-		uint32 length = 0;
-		for (; link >= 0 && length <= header.fieldCount; length++)
-			link = body->Fields()[link].next;
-		if (length > header.fieldCount) {
-			Body::Destroy(body);
-			return nullptr;
-		}
+	if (!body->CheckChains()) {
+		Body::Destroy(body);
+		return nullptr;
 	}
-
 	body->IndexNames();
 
 	message->what = header.what;

@@ -336,6 +336,7 @@ BMessage::Private::ParseR5(const uint8* buffer, size_t size, BMessage* message, 
 		body->fieldCount++;
 		body->dataSize = field.EndOffset();
 	}
+	body->CheckChains();
 
 	message->what = ReadWord(buffer + 12, isSwapped);
 	if ((flags & kR5HasSpecifiers) != 0)

@@ -520,7 +520,8 @@ void
 BView::Invalidate(BRect invalRect)
 {
 	CheckLock();
-	if (fOwner == nullptr)
+	// Without pixels there is nothing to draw anew.
+	if (fOwner == nullptr || !fOwner->fData->painter.HasCanvas())
 		return;
 	invalRect.Set(std::trunc(invalRect.left), std::trunc(invalRect.top),
 		std::trunc(invalRect.right), std::trunc(invalRect.bottom));
