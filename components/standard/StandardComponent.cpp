@@ -39,7 +39,7 @@ const property_row*
 FindRow(const component_description& description, const char* name)
 {
 	for (const property_row& row : description.properties) {
-		if (strcmp(row.name, name) == 0)
+		if (row.name[0] == name[0] && strcmp(row.name, name) == 0)
 			return &row;
 	}
 	return nullptr;

@@ -4,6 +4,7 @@
 #include "codegen/FormSourceEmitter.h"
 
 #include <string>
+#include <string_view>
 
 #include "codegen/FormParts.h"
 #include "codegen/HandlerNames.h"
@@ -194,16 +195,18 @@ TFormSourceEmitter::EmitComponentConstructor(TComponent* component, BString& tex
 void
 TFormSourceEmitter::EmitComponentPropSet(TComponent* component, BString& text)
 {
+	const std::string_view name = component->ComponentName();
 	text << "$TAB// initialize " << component->ComponentName() << "\n";
 	std::string statements;
 	statements.reserve(1024);
-	for (int32 i = 0; i < component->CountProperties(); i++) {
+	const int32 count = component->CountProperties();
+	for (int32 i = 0; i < count; i++) {
 		const TProperty* property = component->PropertyAt(i);
 		if (property == nullptr || !property->IsGenerated())
 			continue;
 
 		AppendStatement(statements, property->SetStatement(),
-			{{"$COMPONENT", component->ComponentName()}, {"$VALUE", property->Value()}});
+			{{"$COMPONENT", name}, {"$VALUE", property->Value()}});
 	}
 	text.Append(statements.data(), static_cast<int32>(statements.length()));
 }

@@ -91,14 +91,22 @@ BeginsWith(const char* text, std::string_view prefix)
 }
 
 
-/// The first of \a placeholders that stands at \a text, in any case of its letters; null when none does.
+/// The first of \a placeholders that stands at \a text, in any case of its letters; null when none does. \a end: of
+/// the text, at its zero byte.
 const placeholder_value*
-FindPlaceholder(const char* text, std::initializer_list<placeholder_value> placeholders)
+FindPlaceholder(
+	const char* text, const char* end, std::initializer_list<placeholder_value> placeholders)
 {
-	// Placeholders rarely share the letter behind their "$".
-	const char letter = LowerCase(text[1]);
+	// Placeholders rarely share the letter behind their "$"; the two cases of a letter differ in one bit.
+	constexpr int kCase = 'a' - 'A';
 	for (const placeholder_value& each : placeholders) {
-		if (letter == LowerCase(each.placeholder[1]) && BeginsWith(text, each.placeholder))
+		if (((text[1] ^ each.placeholder[1]) & ~kCase) != 0)
+			continue;
+		const size_t length = each.placeholder.length();
+		if (static_cast<size_t>(end - text) < length)
+			continue;
+		if (memcmp(text, each.placeholder.data(), length) == 0
+			|| BeginsWith(text, each.placeholder))
 			return &each;
 	}
 	return nullptr;
@@ -136,38 +144,113 @@ AppendPiece(std::string_view piece, LineBreaks lineBreaks, std::string& text)
 }
 
 
+/// Appends pieces of some bytes each to a text, most of them without asking it for room each time.
+class PieceWriter {
+public:
+	explicit PieceWriter(std::string& text)
+		: fText(text),
+		  fLength(0)
+	{
+	}
+	~PieceWriter() { Flush(); }
+
+	void Append(std::string_view piece)
+	{
+		if (piece.length() > kSize - fLength) {
+			Flush();
+			if (piece.length() > kSize) {
+				fText.append(piece);
+				return;
+			}
+		}
+		memcpy(fPieces + fLength, piece.data(), piece.length());
+		fLength += piece.length();
+	}
+
+private:
+	void Flush()
+	{
+		fText.append(fPieces, fLength);
+		fLength = 0;
+	}
+
+	static const size_t kSize = 4096;
+
+	std::string& fText;
+	size_t fLength;
+	char fPieces[kSize];
+};
+
+
+/// Whether putting one of \a placeholders in could make another.
+bool
+HasDollar(std::initializer_list<placeholder_value> placeholders)
+{
+	for (const placeholder_value& each : placeholders) {
+		if (each.value.find('$') != std::string_view::npos)
+			return true;
+	}
+	return false;
+}
+
+
 /// Appends \a source with all of \a placeholders replaced at once. False, with \a text as it was, when one pass for
 /// each could come to another result: when replacing one makes another.
 bool
 AppendInOnePass(const char* source, std::initializer_list<placeholder_value> placeholders,
 	LineBreaks lineBreaks, std::string& text)
 {
+	const char* from = strchr(source, '$');
+	if (from == nullptr) {
+		AppendPiece(source, lineBreaks, text);
+		return true;
+	}
+
+	const char* const end = from + strlen(from);
 	const size_t oldLength = text.length();
 	const bool isOne = placeholders.size() == 1;
+	const bool hasDollar = HasDollar(placeholders);
 	const char* loneDollar = nullptr;
-	for (const char* from = strchr(source, '$'); from != nullptr; from = strchr(from, '$')) {
-		const placeholder_value* found = FindPlaceholder(from, placeholders);
-		if (found == nullptr) {
-			loneDollar = from++;
-			continue;
-		}
-		const bool makesAnother = found->value.find('$') != std::string_view::npos
-			|| (loneDollar != nullptr
-				&& BeginsPlaceholder(
-					std::string_view(loneDollar, from - loneDollar), placeholders));
-		if (makesAnother && !isOne) {
-			text.resize(oldLength);
-			return false;
-		}
+	bool makesAnother = false;
+	{
+		PieceWriter writer(text);
+		const auto append = [&](std::string_view piece) {
+			if (lineBreaks == kLineBreaksIndented) {
+				size_t lineBreak;
+				while ((lineBreak = piece.find('\n')) != std::string_view::npos) {
+					writer.Append(piece.substr(0, lineBreak + 1));
+					writer.Append("  ");
+					piece.remove_prefix(lineBreak + 1);
+				}
+			}
+			writer.Append(piece);
+		};
+		for (; from != nullptr; from = strchr(from, '$')) {
+			const placeholder_value* found = FindPlaceholder(from, end, placeholders);
+			if (found == nullptr) {
+				loneDollar = from++;
+				continue;
+			}
+			makesAnother = !isOne
+				&& ((hasDollar && found->value.find('$') != std::string_view::npos)
+					|| (loneDollar != nullptr
+						&& BeginsPlaceholder(
+							std::string_view(loneDollar, from - loneDollar), placeholders)));
+			if (makesAnother)
+				break;
 
-		AppendPiece(std::string_view(source, from - source), lineBreaks, text);
-		AppendPiece(found->value, lineBreaks, text);
-		loneDollar = nullptr;
-		source = from + found->placeholder.length();
-		from = source;
+			append(std::string_view(source, from - source));
+			append(found->value);
+			loneDollar = nullptr;
+			source = from + found->placeholder.length();
+			from = source;
+		}
+		if (!makesAnother)
+			append(std::string_view(source, end - source));
 	}
-	AppendPiece(source, lineBreaks, text);
-	return true;
+	if (makesAnother)
+		text.resize(oldLength);
+	return !makesAnother;
 }
 
 

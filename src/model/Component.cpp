@@ -5,6 +5,7 @@
 #include "model/Component.h"
 
 #include <cstring>
+#include <mutex>
 
 #include "model/ComponentDrag.h"
 #include "model/ComponentOwner.h"
@@ -13,6 +14,7 @@
 #include "model/FixedText.h"
 #include "model/FormDesigner.h"
 #include "model/NameCompare.h"
+#include "model/NamedList.h"
 #include "model/Property.h"
 #include "model/PropertyStore.h"
 #include "model/PropertyTable.h"
@@ -34,21 +36,45 @@ DeleteProperty(TProperty* property)
 }
 
 
+/// The lists are of that class, which component libraries do not know.
+static TNamedList*
+Named(BList* list)
+{
+	return static_cast<TNamedList*>(list);
+}
+
+
+static const char*
+PropertyName(const TProperty* property)
+{
+	return property->Name();
+}
+
+
+static const char*
+EventName(const TEvent* event)
+{
+	return event->name;
+}
+
+
 TComponent::TComponent(TComponentOwner* owner, TFormDesigner* designer, TComponentType type)
-	: fOwner(owner),
+	: fLongName(nullptr),
+	  fOwner(owner),
 	  fDesigner(designer),
 	  fComponentType(type),
-	  fProperties(new BList(kListStep)),
-	  fEvents(new BList(kListStep)),
+	  fProperties(new TNamedList(kListStep)),
+	  fEvents(new TNamedList(kListStep)),
 	  fComponentMode(CM_DESIGN),
 	  fModified(false),
+	  fStoreIsLate(true),
 	  fPropertyStore(new TPropertyStore(this)),
 	  fDesignerSelected(false),
-	  fLastFound(kNoProperty),
+	  fStoredCount(0),
+	  fUnused(0),
 	  fDTView(nullptr)
 {
-	// Clearing all of the name would touch memory that nobody uses, in each of thousands of components.
-	fComponentName[0] = '\0';
+	fShortName[0] = '\0';
 	fClassName[0] = '\0';
 }
 
@@ -56,26 +82,40 @@ TComponent::TComponent(TComponentOwner* owner, TFormDesigner* designer, TCompone
 TComponent::~TComponent()
 {
 	ComponentDrag::Forget(this);
+	// Nobody will ask for the store any more.
+	fStoredCount = 0;
 	// Not the overrides of derived classes: those are gone.
 	TComponent::ClearProperties(true);
 	delete fProperties;
 	TComponent::ClearEvents(true);
 	delete fEvents;
 	delete fPropertyStore;
+	delete[] fLongName;
 }
 
 
 void
 TComponent::SetComponentName(const char* name)
 {
-	SetFixedText(fComponentName, name);
+	if (name == nullptr)
+		return;
+	const size_t length = strnlen(name, kComponentNameSize - 1);
+	char* text = fLongName != nullptr ? fLongName : fShortName;
+	// Room for every name would be a tenth of the memory of a form's thousands of components. Once it is there, it stays:
+	// so do the names that were given out.
+	if (fLongName == nullptr && length >= kShortNameSize)
+		text = new char[kComponentNameSize];
+	memmove(text, name, length);
+	text[length] = '\0';
+	if (text != fShortName)
+		fLongName = text;
 }
 
 
 const char*
 TComponent::ComponentName() const
 {
-	return fComponentName;
+	return fLongName != nullptr ? fLongName : fShortName;
 }
 
 
@@ -175,7 +215,7 @@ TComponent::GetPropertyValue(const char* name)
 		return ComponentName();
 
 	const char* value;
-	return fPropertyStore->FindString(name, &value) == B_OK ? value : nullptr;
+	return PropertyStore()->FindString(name, &value) == B_OK ? value : nullptr;
 }
 
 
@@ -211,6 +251,7 @@ TComponent::SetEventSelection(const char* name, bool selected)
 void
 TComponent::InitPropertyList()
 {
+	KeepStored();
 	fPropertyStore->MakeEmpty();
 	ClearProperties(true);
 
@@ -241,6 +282,9 @@ TComponent::InitPropertyValues()
 void
 TComponent::AddProperty(TProperty* property)
 {
+	const char* name = property != nullptr ? property->Name() : nullptr;
+	if (name != nullptr && Named(fProperties)->NoteName(name) && FindProperty(name) != nullptr)
+		Named(fProperties)->SetRepeats();
 	fProperties->AddItem(property);
 }
 
@@ -263,7 +307,8 @@ TComponent::AddPropAndEditor(TProperty* property, TPropertyEditor* editor, const
 bool
 TComponent::RemoveProperty(TProperty* property)
 {
-	fLastFound = kNoProperty;
+	KeepStored();
+	Named(fProperties)->SetLast(-1);
 	return fProperties->RemoveItem(property);
 }
 
@@ -271,7 +316,8 @@ TComponent::RemoveProperty(TProperty* property)
 TProperty*
 TComponent::RemoveProperty(int32 index)
 {
-	fLastFound = kNoProperty;
+	KeepStored();
+	Named(fProperties)->SetLast(-1);
 	return static_cast<TProperty*>(fProperties->RemoveItem(index));
 }
 
@@ -279,16 +325,19 @@ TComponent::RemoveProperty(int32 index)
 void
 TComponent::ClearProperties(bool deleteProperties)
 {
+	KeepStored();
 	for (int32 i = 0; deleteProperties && PropertyAt(i) != nullptr; i++)
 		DeleteProperty(PropertyAt(i));
-	fLastFound = kNoProperty;
-	fProperties->MakeEmpty();
+	Named(fProperties)->Forget();
 }
 
 
 void
 TComponent::AddEvent(TEvent* event)
 {
+	const char* name = event != nullptr ? event->name : nullptr;
+	if (name != nullptr && Named(fEvents)->NoteName(name) && FindEvent(name) != nullptr)
+		Named(fEvents)->SetRepeats();
 	fEvents->AddItem(event);
 }
 
@@ -296,6 +345,7 @@ TComponent::AddEvent(TEvent* event)
 bool
 TComponent::RemoveEvent(TEvent* event)
 {
+	Named(fEvents)->SetLast(-1);
 	return fEvents->RemoveItem(event);
 }
 
@@ -303,6 +353,7 @@ TComponent::RemoveEvent(TEvent* event)
 TEvent*
 TComponent::RemoveEvent(int32 index)
 {
+	Named(fEvents)->SetLast(-1);
 	return static_cast<TEvent*>(fEvents->RemoveItem(index));
 }
 
@@ -312,7 +363,7 @@ TComponent::ClearEvents(bool deleteEvents)
 {
 	for (int32 i = 0; deleteEvents && EventAt(i) != nullptr; i++)
 		delete EventAt(i);
-	fEvents->MakeEmpty();
+	Named(fEvents)->Forget();
 }
 
 
@@ -342,23 +393,7 @@ TComponent::FindProperty(const char* name) const
 {
 	if (name == nullptr)
 		return nullptr;
-	const int32 count = CountProperties();
-	void* const* properties = static_cast<void* const*>(fProperties->Items());
-	// What was found last is asked for again while a form is loaded: it was the first of its name, and
-	// still is.
-	const int32 last = fLastFound.load(std::memory_order_relaxed);
-	if (last >= 0 && last < count
-		&& IsSameName(static_cast<TProperty*>(properties[last])->Name(), name))
-		return static_cast<TProperty*>(properties[last]);
-
-	for (int32 i = 0; i < count; i++) {
-		TProperty* property = static_cast<TProperty*>(properties[i]);
-		if (property != nullptr && IsSameName(property->Name(), name)) {
-			fLastFound.store(i, std::memory_order_relaxed);
-			return property;
-		}
-	}
-	return nullptr;
+	return FindNamed<TProperty>(Named(fProperties), name, PropertyName);
 }
 
 
@@ -381,14 +416,7 @@ TComponent::FindEvent(const char* name) const
 {
 	if (name == nullptr)
 		return nullptr;
-	const int32 count = CountEvents();
-	void* const* events = static_cast<void* const*>(fEvents->Items());
-	for (int32 i = 0; i < count; i++) {
-		TEvent* event = static_cast<TEvent*>(events[i]);
-		if (event != nullptr && event->name != nullptr && IsSameName(event->name, name))
-			return event;
-	}
-	return nullptr;
+	return FindNamed<TEvent>(Named(fEvents), name, EventName);
 }
 
 
@@ -400,7 +428,7 @@ TComponent::StoreProperty(const char* name, const char* value)
 
 	TProperty* property = FindProperty(name);
 	if (property == nullptr) {
-		fPropertyStore->SetString(name, value);
+		PropertyStore()->SetString(name, value);
 		return;
 	}
 
@@ -413,7 +441,48 @@ TComponent::StoreProperty(const char* name, const char* value)
 			|| Owner()->ComponentPropertyModified(this, name, property->Value(), value))
 			SetModified(true);
 	}
-	property->SetValue(value);
+	property->TakeValue(value);
+	if (fStoreIsLate.load(std::memory_order_relaxed) && property->fComponent == this) {
+		if (property->fStoreOrder == 0)
+			property->fStoreOrder = ++fStoredCount;
+		return;
+	}
 	// Not by the store's own setter: that takes precautions for texts of the store.
-	fPropertyStore->BMessage::SetString(name, property->Value());
+	PropertyStore()->BMessage::SetString(name, property->Value());
+}
+
+
+/// Puts into the store what the properties have kept for it. A form that is loaded and generated has thousands of
+/// stores that nobody asks for.
+void
+TComponent::FillStore() const
+{
+	static std::mutex sMutex;
+	const std::lock_guard<std::mutex> lock(sMutex);
+	if (!fStoreIsLate.load(std::memory_order_relaxed))
+		return;
+
+	// In the order in which they were stored, which is mostly that of the list.
+	const int32 count = CountProperties();
+	int32 index = 0;
+	for (uint16 order = 1; order <= fStoredCount; order++) {
+		for (int32 tried = 0; tried < count; tried++, index++) {
+			TProperty* property = PropertyAt(index % count);
+			if (property == nullptr || property->fStoreOrder != order)
+				continue;
+			fPropertyStore->BMessage::SetString(property->Name(), property->Value());
+			property->fStoreOrder = 0;
+			break;
+		}
+	}
+	fStoreIsLate.store(false, std::memory_order_release);
+}
+
+
+/// Before properties go: what they have kept for the store is put there.
+void
+TComponent::KeepStored()
+{
+	if (fStoredCount > 0)
+		PropertyStore();
 }

@@ -177,7 +177,12 @@ public:
 	void SetClassName(const char* name);
 	const char* ClassName() const { return fClassName; }
 
-	TPropertyStore* PropertyStore() const { return fPropertyStore; }
+	TPropertyStore* PropertyStore() const
+	{
+		if (fStoreIsLate.load(std::memory_order_acquire))
+			FillStore();
+		return fPropertyStore;
+	}
 
 	/// The view that shows the component on the design surface, or null.
 	BView* DTView() const { return fDTView; }
@@ -201,6 +206,8 @@ public:
 	void StoreProperty(const char* name, const char* value);
 
 private:
+	void FillStore() const;
+	void KeepStored();
 	bool IsOnSameForm(const TComponent* component) const;
 	void TakeIn(TComponent* component);
 	void SelectAlone();
@@ -209,10 +216,12 @@ private:
 	void ResizeByMouse(BRect frame, BView* view);
 
 	static const size_t kComponentNameSize = 1024;
+	static const size_t kShortNameSize = 40;
 	static const size_t kClassNameSize = 32;
-	static const int32 kNoProperty = -1;
 
-	char fComponentName[kComponentNameSize];
+	char fShortName[kShortNameSize];
+	// Room for the longest name, once there was one that is not short.
+	char* fLongName;
 	char fClassName[kClassNameSize];
 	TComponentOwner* fOwner;
 	TFormDesigner* fDesigner;
@@ -221,11 +230,13 @@ private:
 	BList* fEvents;
 	TComponentMode fComponentMode;
 	bool fModified;
+	// Nobody has asked for the store yet: the properties alone keep what is stored. Where the alignment left a gap.
+	mutable std::atomic<bool> fStoreIsLate;
 	TPropertyStore* fPropertyStore;
 	bool fDesignerSelected;
-	// The index of the property that FindProperty() found last, while it is known to be the first of its
-	// name. Where the alignment left a gap.
-	mutable std::atomic<int32> fLastFound;
+	// How many properties have been stored since. In a gap, too.
+	uint16 fStoredCount;
+	int32 fUnused;
 	BView* fDTView;
 };
 

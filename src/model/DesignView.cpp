@@ -2,7 +2,6 @@
 
 #include "model/DesignView.h"
 
-#include <cstdlib>
 #include <cstring>
 
 #include <Message.h>
@@ -11,6 +10,7 @@
 #include "model/ColorText.h"
 #include "model/ComponentOwner.h"
 #include "model/DesignMessages.h"
+#include "model/NumberText.h"
 #include "model/Property.h"
 
 namespace {
@@ -62,8 +62,9 @@ InDesignedSize(TComponent* component, const BFont* font)
 	BFont sized(*font);
 	const bool isSystems = font == be_plain_font || font == be_bold_font || font == be_fixed_font;
 	const char* size = ValueOf(component, "FontSize");
-	if (isSystems && size != nullptr && atoi(size) > 0)
-		sized.SetSize(atoi(size));
+	const long points = isSystems && size != nullptr ? NumberIn(size) : 0;
+	if (points > 0)
+		sized.SetSize(points);
 	return sized;
 }
 

@@ -7,14 +7,14 @@
 #include <cstdio>
 #include <cstring>
 
-static bool sShown = true;
+bool gDiagnosticsShown = true;
 static thread_local bool sSilent = false;
 
 
 void
 PrintDiagnostic(const char* format, ...)
 {
-	if (!sShown || sSilent)
+	if (!gDiagnosticsShown || sSilent)
 		return;
 	va_list arguments;
 	va_start(arguments, format);
@@ -24,9 +24,9 @@ PrintDiagnostic(const char* format, ...)
 
 
 void
-PrintCall(const char* function, const char* first, const char* second)
+PrintShownCall(const char* function, const char* first, const char* second)
 {
-	if (!sShown || sSilent)
+	if (sSilent)
 		return;
 
 	// Put together here, a line takes a fraction of what printf() takes for it.
@@ -50,7 +50,7 @@ PrintCall(const char* function, const char* first, const char* second)
 void
 ShowDiagnostics(bool shown)
 {
-	sShown = shown;
+	gDiagnosticsShown = shown;
 }
 
 

@@ -36,7 +36,8 @@ TProperty::TProperty(TComponent* component, const char* name, const char* value,
 	: fComponent(component),
 	  fEditor(editor),
 	  fQuoted(false),
-	  fGenerated(generated)
+	  fGenerated(generated),
+	  fStoreOrder(0)
 {
 	const size_t length = name != nullptr ? strnlen(name, sizeof(fName) - 1) : 0;
 	if (length > 0)
@@ -50,7 +51,8 @@ TProperty::TProperty(const TProperty& other)
 	: fComponent(other.fComponent),
 	  fEditor(other.fEditor),
 	  fQuoted(other.fQuoted),
-	  fGenerated(other.fGenerated)
+	  fGenerated(other.fGenerated),
+	  fStoreOrder(0)
 {
 	memcpy(fName, other.fName, sizeof(fName));
 	fValue.Fill(other.fValue.Text());
@@ -173,14 +175,15 @@ TProperty::ReadExtendedData(const BMessage*)
 void
 TProperty::SetValue(const char* value)
 {
-	KeepDefault(value);
-	fValue.SetTo(value);
+	KeepStored();
+	TakeValue(value);
 }
 
 
 void
 TProperty::FillValue(const char* value)
 {
+	KeepStored();
 	KeepDefault(value);
 	fValue.Fill(value);
 }
@@ -198,4 +201,21 @@ TProperty::KeepDefault(const char* newValue)
 {
 	if (newValue != nullptr && !fDefValue.IsSet() && strcmp(newValue, Value()) != 0)
 		fDefValue.SetTo(Value());
+}
+
+
+/// The store keeps the old value, whatever becomes of the property.
+void
+TProperty::KeepStored()
+{
+	if (fStoreOrder != 0)
+		fComponent->PropertyStore();
+}
+
+
+void
+TProperty::TakeValue(const char* value)
+{
+	KeepDefault(value);
+	fValue.SetTo(value);
 }

@@ -95,7 +95,12 @@ public:
 	void SetGenerated(bool generated) { fGenerated = generated; }
 
 private:
+	// Which puts values into its store.
+	friend class TComponent;
+
 	void KeepDefault(const char* newValue);
+	void KeepStored();
+	void TakeValue(const char* value);
 
 	static const size_t kNameSize = 32;
 
@@ -108,4 +113,7 @@ private:
 	TRarePropertyText fGetStatement;
 	bool fQuoted;
 	bool fGenerated;
+	// The component has not put the value into its store yet: as which one it was stored; otherwise 0. In the gap behind the
+	// flags.
+	uint16 fStoreOrder;
 };

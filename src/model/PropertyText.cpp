@@ -63,11 +63,8 @@ TRarePropertyText::~TRarePropertyText()
 
 
 void
-TRarePropertyText::SetTo(const char* text)
+TRarePropertyText::Assign(const char* text)
 {
-	if (text == nullptr)
-		return;
-
 	const size_t length = strnlen(text, TPropertyText::kSize - 1);
 	char* newText = static_cast<char*>(TBlockPool::Allocate(length + 1));
 	memcpy(newText, text, length);

@@ -66,8 +66,14 @@ public:
 	const char* Text() const { return fText; }
 
 	/// Takes over at most 1023 bytes of \a text. A null text is ignored.
-	void SetTo(const char* text);
+	void SetTo(const char* text)
+	{
+		if (text != nullptr)
+			Assign(text);
+	}
 
 private:
+	void Assign(const char* text);
+
 	char* fText;
 };

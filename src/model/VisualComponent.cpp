@@ -4,7 +4,6 @@
 #include "model/VisualComponent.h"
 
 #include <cstdio>
-#include <cstdlib>
 #include <cstring>
 
 #include <Font.h>
@@ -13,6 +12,7 @@
 #include "model/ColorText.h"
 #include "model/Diagnostics.h"
 #include "model/NameCompare.h"
+#include "model/NumberText.h"
 #include "model/PropertyStore.h"
 #include "model/PropertyTable.h"
 #include "model/ViewLock.h"
@@ -213,9 +213,9 @@ TVisualComponent::ApplyToView(const char* name, const char* value)
 {
 	const int edge = EdgeIndex(name);
 	if (edge >= 0)
-		SetEdge(DTView(), edge, strtol(value, nullptr, 10));
+		SetEdge(DTView(), edge, NumberIn(value));
 	else if (IsSameName(name, "FontSize"))
-		SetFontSize(DTView(), strtol(value, nullptr, 10));
+		SetFontSize(DTView(), NumberIn(value));
 	else if (IsSameName(name, "Font") && FontNamed(value) != nullptr)
 		DTView()->SetFont(FontNamed(value));
 	else
