@@ -3,6 +3,7 @@
 
 #include "model/Component.h"
 
+#include <cstring>
 #include <string>
 #include <vector>
 
@@ -139,6 +140,24 @@ TEST_F(ComponentTest, NamesAreCutAndNullIsIgnored)
 }
 
 
+TEST_F(ComponentTest, NamesOfAnyLengthTakeTurns)
+{
+	for (size_t length : {0, 1, 38, 39, 40, 41, 1023, 5, 200}) {
+		const std::string name(length, 'n');
+		fComponent.SetComponentName(name.c_str());
+		EXPECT_EQ(fComponent.ComponentName(), name);
+	}
+	// A part of the short name, and one that stays valid when a long one comes.
+	fComponent.SetComponentName(fComponent.ComponentName() + 195);
+	EXPECT_STREQ(fComponent.ComponentName(), "nnnnn");
+	TComponent other(nullptr, nullptr, CT_VISUAL);
+	other.SetComponentName("short");
+	const char* given = other.ComponentName();
+	other.SetComponentName(std::string(100, 'l').c_str());
+	EXPECT_STREQ(given, "short");
+}
+
+
 TEST_F(ComponentTest, TheBaseListHasTheNameOnly)
 {
 	fComponent.ClearProperties(false);
@@ -238,6 +257,74 @@ TEST_F(ComponentTest, ARefusalByTheOwnerStoresButDoesNotMarkModified)
 }
 
 
+TEST_F(ComponentTest, TheStoreHasWhatWasStoredInTheOrderOfStoring)
+{
+	TProperty color(&fComponent, "Color", "red", nullptr, true);
+	fComponent.AddProperty(&color);
+	fComponent.StoreProperty("Color", "blue");
+	fComponent.StoreProperty("Label", "Cancel");
+	fComponent.StoreProperty("Color", "green");
+	EXPECT_STREQ(color.Value(), "green");
+	fComponent.StoreProperty("Unlisted", "kept");
+	fComponent.StoreProperty("Label", "Close");
+
+	const char* const names[] = {"Color", "Label", "Unlisted"};
+	const char* const values[] = {"green", "Close", "kept"};
+	EXPECT_EQ(fComponent.PropertyStore()->CountNames(B_ANY_TYPE), 3);
+	for (int32 i = 0; i < 3; i++) {
+		char* name;
+		type_code type;
+		ASSERT_EQ(fComponent.PropertyStore()->GetInfo(B_STRING_TYPE, i, &name, &type), B_OK);
+		EXPECT_STREQ(name, names[i]);
+		EXPECT_STREQ(Stored(name), values[i]);
+	}
+	fComponent.StoreProperty("Color", "white");
+	EXPECT_STREQ(Stored("Color"), "white");
+	fComponent.RemoveProperty(&color);
+}
+
+
+TEST_F(ComponentTest, TheStoreKeepsWhatThePropertyHasNoLonger)
+{
+	fComponent.StoreProperty("Label", "Cancel");
+	fLabel.SetValue("typed");
+	EXPECT_STREQ(Stored("Label"), "Cancel");
+
+	TComponent filled(nullptr, nullptr, CT_VISUAL);
+	TProperty* label = new TProperty(&filled, "Label", "", nullptr, true);
+	filled.AddProperty(label);
+	filled.StoreProperty("Label", "Cancel");
+	label->FillValue("typed");
+	EXPECT_STREQ(filled.PropertyStore()->FindString("Label"), "Cancel");
+
+	TComponent emptied(nullptr, nullptr, CT_VISUAL);
+	emptied.AddProperty(new TProperty(&emptied, "Label", "", nullptr, true));
+	emptied.AddProperty(new TProperty(&emptied, "Text", "", nullptr, true));
+	emptied.StoreProperty("Text", "stored");
+	emptied.StoreProperty("Label", "Cancel");
+	emptied.AddProperty(emptied.RemoveProperty(int32(1)));
+	EXPECT_STREQ(emptied.PropertyStore()->FindString("Text"), "stored");
+	emptied.StoreProperty("Label", "Close");
+	emptied.ClearProperties(true);
+	EXPECT_STREQ(emptied.PropertyStore()->FindString("Label"), "Close");
+	emptied.InitPropertyList();
+	EXPECT_TRUE(emptied.PropertyStore()->IsEmpty());
+}
+
+
+TEST_F(ComponentTest, APropertyOfAnotherComponentIsStoredHere)
+{
+	TComponent other(nullptr, nullptr, CT_VISUAL);
+	TProperty foreign(&other, "Foreign", "", nullptr, true);
+	fComponent.AddProperty(&foreign);
+	fComponent.StoreProperty("Foreign", "value");
+	foreign.SetValue("typed");
+	EXPECT_STREQ(Stored("Foreign"), "value");
+	EXPECT_TRUE(other.PropertyStore()->IsEmpty());
+	fComponent.RemoveProperty(&foreign);
+}
+
+
 TEST_F(ComponentTest, ValueAndStoreAgreeForLongTexts)
 {
 	fComponent.StoreProperty("Label", std::string(2000, 'x').c_str());
@@ -329,6 +416,37 @@ TEST_F(ComponentTest, TheFirstOfSeveralPropertiesWithOneNameIsFound)
 	EXPECT_EQ(fComponent.FindProperty("Twin"), &first);
 	fComponent.ClearProperties(false);
 	EXPECT_EQ(fComponent.FindProperty("Twin"), nullptr);
+}
+
+
+TEST_F(ComponentTest, ARepeatedNameIsFoundFirstWhateverWasFoundBefore)
+{
+	TComponent component(nullptr, nullptr, CT_VISUAL);
+	for (const char* name : {"A", "B", "A", "C", "B"})
+		component.AddProperty(new TProperty(&component, name, "", nullptr, true));
+	for (const char* name : {"A", "B", "A", "C", "B", "A", "A", "C", "A", "B", "C", "B", "A"}) {
+		int32 first = 0;
+		while (strcmp(component.PropertyAt(first)->Name(), name) != 0)
+			first++;
+		EXPECT_EQ(component.FindProperty(name), component.PropertyAt(first));
+	}
+	EXPECT_EQ(component.FindProperty("D"), nullptr);
+
+	// What was found last moves when an entry before it goes.
+	TProperty* const moved = component.PropertyAt(1);
+	EXPECT_EQ(component.FindProperty("B"), moved);
+	component.AddProperty(component.RemoveProperty(int32(0)));
+	EXPECT_EQ(component.FindProperty("A"), component.PropertyAt(1));
+	EXPECT_EQ(component.FindProperty("B"), moved);
+	EXPECT_EQ(component.FindProperty("C"), component.PropertyAt(2));
+
+	component.AddEvent(new TEvent("OnA", nullptr, nullptr, false));
+	component.AddEvent(new TEvent("OnB", nullptr, nullptr, false));
+	component.AddEvent(new TEvent("OnA", nullptr, nullptr, false));
+	for (int32 round = 0; round < 2; round++) {
+		EXPECT_EQ(component.FindEvent("OnB"), component.EventAt(1));
+		EXPECT_EQ(component.FindEvent("OnA"), component.EventAt(0));
+	}
 }
 
 

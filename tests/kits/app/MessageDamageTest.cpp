@@ -288,6 +288,25 @@ TEST(MessageDamageTest, FieldOutsideEveryChainIsOnlyEnumerated)
 }
 
 
+TEST(MessageDamageTest, ANameThatOccursTwiceIsLookedForAsAnyOther)
+{
+	std::string bytes = Sound();
+	memcpy(bytes.data() + kData, "Left", 4);
+	BMessage message;
+	ASSERT_EQ(Read(bytes, &message), B_OK);
+	const BMessage copy(message);
+	for (const BMessage* each : {const_cast<const BMessage*>(&message), &copy}) {
+		for (int32 i = 0; i < 2; i++) {
+			char* name;
+			type_code type;
+			ASSERT_EQ(each->GetInfo(B_STRING_TYPE, i, &name, &type), B_OK);
+			EXPECT_STREQ(name, "Left");
+			EXPECT_STREQ(each->FindString(name), "5");
+		}
+	}
+}
+
+
 TEST(MessageDamageTest, ItemsOfOtherFormsAreNotThere)
 {
 	BMessage message;
