@@ -9,6 +9,7 @@
 #include <string>
 
 #include <Errors.h>
+#include <SupportDefs.h>
 
 TEST(ErrorTextTest, AStatusHasTheTextOfTheHostsNumber)
 {
@@ -49,7 +50,8 @@ TEST(ErrorTextTest, EveryStatusHasAText)
 	};
 	for (const auto& family : families) {
 		for (status_t status = family.first; status <= family.last; status++)
-			EXPECT_EQ(std::string(strerror(status)).find("Unknown"), std::string::npos) << status;
+			EXPECT_EQ(std::string(strerror(status)).find("Unknown error"), std::string::npos)
+				<< status;
 	}
 }
 
