@@ -25,7 +25,7 @@ constexpr const char* kMayStayUnused = "[[maybe_unused]] ";
 BString
 SourceValue(const TProperty& property)
 {
-	const BString value(property.Value(), TPropertyText::kSize);
+	BString value(property.Value(), TPropertyText::kSize);
 	// No flags at all are no text.
 	if (value.IsEmpty() && strcmp(property.Name(), "Flags") == 0)
 		return BString("0");

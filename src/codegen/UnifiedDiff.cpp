@@ -9,7 +9,7 @@
 
 namespace {
 
-constexpr int kContextLines = 3;
+constexpr size_t kContextLines = 3;
 
 /// Texts that differ in more lines are not searched for what they share: it would take too long.
 constexpr int kMostEdits = 2000;

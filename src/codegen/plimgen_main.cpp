@@ -88,7 +88,7 @@ CompleteOptions(command_line* line)
 	line->options.output = line->output.c_str();
 	line->options.mainForm = line->mainForm.c_str();
 	for (const std::string& folder : line->componentFolders)
-		line->options.componentFolders.push_back(folder.c_str());
+		line->options.componentFolders.emplace_back(folder.c_str());
 }
 
 
@@ -141,8 +141,9 @@ Generate(const generation_options& options)
 } // namespace
 
 
+// Without memory, or with options that contradict each other in the source, it ends where that happens.
 int
-main(int argc, char** argv)
+main(int argc, char** argv) // NOLINT(bugprone-exception-escape): as said above
 {
 	command_line line;
 	CLI::App parser("Generates the C++ sources of a project.", "plimgen");

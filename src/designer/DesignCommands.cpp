@@ -279,7 +279,7 @@ TDesignFormView::RetrieveComponent(const void* record, ssize_t size)
 	// Copies: a component may build its list of properties anew when one is set.
 	std::vector<BString> names;
 	for (int32 i = 0; i < component->CountProperties(); i++)
-		names.push_back(component->PropertyAt(i)->Name());
+		names.emplace_back(component->PropertyAt(i)->Name());
 	for (const BString& name : names) {
 		const char* value;
 		if (properties.FindString(name.String(), &value) == B_OK)
