@@ -75,6 +75,29 @@ IsSubtypeOf(const std::string& type, const std::string& supertype)
 		&& type.compare(0, supertype.size(), supertype) == 0;
 }
 
+/// Reads those of the folder's packages only that could have the type.
+bool
+FolderHas(const std::string& folder, const std::string& key)
+{
+	for (const std::string& name : PackageFiles(folder)) {
+		std::string document;
+		if (read_whole_file(folder + "/" + name, kMaxPackageSize, &document) != B_OK)
+			continue;
+		const std::string letters = mime_key(document);
+		// A character may also be written as its number.
+		if (letters.find(key) == std::string::npos && letters.find("&#") == std::string::npos)
+			continue;
+		std::vector<mime_description> types;
+		read_mime_package(document, &types);
+		for (const mime_description& type : types) {
+			const std::string known = mime_key(type.type);
+			if (known == key || IsSubtypeOf(known, key))
+				return true;
+		}
+	}
+	return false;
+}
+
 } // namespace
 
 
@@ -123,6 +146,25 @@ MimeDatabase::Find(const std::string& type, mime_description* description)
 		}
 	}
 	return isFound;
+}
+
+
+bool
+MimeDatabase::Has(const std::string& type)
+{
+	const std::string key = mime_key(type);
+	if (key.find('/') != std::string::npos) {
+		std::lock_guard<std::mutex> lock(fLock);
+		if (fFolders.empty()) {
+			const std::vector<std::string> directories = xdg_data_directories();
+			return std::any_of(
+				directories.begin(), directories.end(), [&key](const std::string& directory) {
+					return FolderHas(directory + kPackages, key);
+				});
+		}
+	}
+	mime_description description;
+	return Find(type, &description);
 }
 
 

@@ -26,6 +26,8 @@ public:
 	/// What is known about the type: of each thing, what the package with the highest precedence
 	/// tells. False when no package has the type. A supertype is there when it has a subtype.
 	bool Find(const std::string& type, mime_description* description);
+	/// Whether Find() would find it. Takes a hundredth of the time as long as nothing else was asked for.
+	bool Has(const std::string& type);
 	/// Every type, as its first package spells it, in alphabetical order.
 	std::vector<std::string> Types();
 

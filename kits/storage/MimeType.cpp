@@ -212,8 +212,7 @@ BMimeType::Delete()
 bool
 BMimeType::IsInstalled() const
 {
-	mime_description description;
-	return fStatus == B_OK && MimeDatabase::Default().Find(fType, &description);
+	return fStatus == B_OK && MimeDatabase::Default().Has(fType);
 }
 
 

@@ -160,6 +160,25 @@ TEST_F(MimeDatabaseTest, InstallingMakesTheTypeKnown)
 }
 
 
+TEST_F(MimeDatabaseTest, ATypeIsInstalledHoweverItsPackageSpellsIt)
+{
+	WriteSystemPackage("<mime-type type='application/X-One'><comment>application/x-named</comment>"
+					   "</mime-type><mime-type type='application&#x2F;x-two'/>"
+					   "<mime-type type='application/x-three-and-more'/>");
+	const auto check = [] {
+		EXPECT_TRUE(BMimeType("application/x-one").IsInstalled());
+		EXPECT_TRUE(BMimeType("application/X-Two").IsInstalled());
+		EXPECT_FALSE(BMimeType("application/x-three").IsInstalled());
+		EXPECT_FALSE(BMimeType("application/x-named").IsInstalled());
+	};
+	check();
+	// From here on all packages are known.
+	BMessage types;
+	BMimeType::GetInstalledTypes(&types);
+	check();
+}
+
+
 TEST_F(MimeDatabaseTest, SettersInstallAndKeepWhatWasSetBefore)
 {
 	BMimeType type("application/x-test");
