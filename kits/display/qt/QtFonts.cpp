@@ -179,9 +179,14 @@ QtFonts::FindStandardFont(standard_font which)
 		return;
 	fHasStandard[which] = true;
 	ReadFamilies();
-	std::string name = StandardFamily(which).toStdString();
-	auto found = std::find_if(fFamilies.begin(), fFamilies.end(),
-		[&](const Family& family) { return family.name == name; });
+	auto find = [this](const std::string& name) {
+		return std::find_if(fFamilies.begin(), fFamilies.end(),
+			[&](const Family& family) { return family.name == name; });
+	};
+	// Qt would load a font to tell its family.
+	auto found = which == kFixedFont ? fFamilies.end() : find(AwaitFontSettings());
+	if (found == fFamilies.end())
+		found = find(StandardFamily(which).toStdString());
 	if (found == fFamilies.end())
 		return;
 
