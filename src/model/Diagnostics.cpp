@@ -40,6 +40,7 @@ PrintShownCall(const char* function, const char* first, const char* second)
 			printf("%s('%s', '%s')\n", function, parts[2], parts[4]);
 			return;
 		}
+		// NOLINTNEXTLINE(bugprone-not-null-terminated-result): the line is written by its length
 		memcpy(line + length, part, partLength);
 		length += partLength;
 	}
