@@ -22,7 +22,8 @@ public:
 	void KeyDown(const char* bytes, int32 numBytes) override
 	{
 		if (numBytes == 1 && *bytes == B_TAB)
-			BView::KeyDown(bytes, numBytes); // NOLINT(bugprone-parent-virtual-call): the text view inserts it
+			BView::KeyDown(
+				bytes, numBytes); // NOLINT(bugprone-parent-virtual-call): the text view inserts it
 		else
 			BTextView::KeyDown(bytes, numBytes);
 	}
