@@ -64,6 +64,7 @@ TProperty::TProperty(const TProperty& other)
 
 TProperty::~TProperty()
 {
+	KeepStored();
 	TPropertyWatch::PropertyGone(this);
 }
 

@@ -4,6 +4,7 @@
 #include "designer/SurfaceTest.h"
 
 #include <cmath>
+#include <cstdlib>
 
 #include "support/Printers.h"
 
@@ -23,6 +24,23 @@ protected:
 			}
 		}
 		return false;
+	}
+
+	/// Whether all pixels are the same, but for one step of a channel: where smoothed letters and corners of two
+	/// components meet, the order of drawing rounds differently.
+	static bool LookAlike(const WindowPicture& one, const WindowPicture& other)
+	{
+		if (one.pixels.size() != other.pixels.size())
+			return false;
+		for (size_t i = 0; i < one.pixels.size(); i++) {
+			for (int32 shift = 0; shift < 32; shift += 8) {
+				const int32 first = (one.pixels[i] >> shift) & 0xff;
+				const int32 second = (other.pixels[i] >> shift) & 0xff;
+				if (std::abs(first - second) > 1)
+					return false;
+			}
+		}
+		return true;
 	}
 
 	void CheckSelected(TComponent* component, BRect frame)
@@ -93,6 +111,6 @@ TEST_F(DesignScaleTest, WhatIsMarkedOtherwiseLooksAsIfAllWereDrawnAnew)
 		fRobot.Settle();
 		const WindowPicture whole = fRobot.Picture();
 		ASSERT_FALSE(whole.pixels.empty());
-		EXPECT_TRUE(picture.pixels == whole.pixels) << where.x << ", " << where.y;
+		EXPECT_TRUE(LookAlike(picture, whole)) << where.x << ", " << where.y;
 	}
 }
