@@ -25,6 +25,7 @@ EVENTS_TAB = (110, 10)
 VIEW_COLOR, TITLE, WINDOW_LOOK, WINDOW_FLAGS = 7, 12, 13, 15
 # Codes of the messages that the property window prints.
 INVOKED, EVENT_INVOKED = "0x9", "0xb"
+MENU = "mnuPickEdit"
 # In the dialogs: a box, a place on the colours' second ramp, and how far OK is from the right and bottom edges.
 NOT_CLOSABLE = (20, 91)
 MUCH_RED = (260, 46)
@@ -88,6 +89,7 @@ def edit_form(desktop, program, example, pictures):
 
     inspector.invoke(WINDOW_LOOK)
     desktop.key("space")
+    desktop.input.wait_until_shown(MENU)
     session.save_picture("menu")
     for key in ("Home", "Down", "Down", "Return"):
         desktop.key(key)

@@ -196,7 +196,7 @@ class Desktop:
         self.xdotool("type", "--delay", 1, text)
 
     def key(self, key):
-        self.input.key(key)
+        self.xdotool("key", "--delay", 1, key)
 
     # Pictures
 
