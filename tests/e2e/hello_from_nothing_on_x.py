@@ -207,6 +207,8 @@ class BareForm(Form):
     def set_up(self, name, title, picture=False):
         session = self.session
         session.click_in("Form", (3, 3))
+        # The designer makes it active, maybe after the next click.
+        session.wait_for_active("Form")
         session.edit("Form", "sizes" if picture else None, Name=name, Title=title, FontSize="12")
         session.invoke(FIRST_ROW, ROWS["Form"].index("WindowFlags"), PROPERTY_INVOKED)
         session.wait_for_active("Window Flags")
