@@ -91,6 +91,9 @@ public:
 	/// Writes a PNG file. B_OK; B_BAD_VALUE for an empty picture; an error of the file; B_UNSUPPORTED.
 	virtual status_t SavePicture(const Picture& picture, const char* path) = 0;
 
+	/// Returns when the display's thread has done what it was asked to before: what was presented is shown.
+	virtual void Sync() = 0;
+
 	/// Input as if from the user, for tests and scripts: the messages are with the loopers on return.
 	/// Moves the pointer and sets which buttons are held.
 	virtual void InjectPointer(BPoint screenWhere, uint32 buttons) = 0;

@@ -35,6 +35,7 @@ public:
 		const BMessage& message, BRect rect, const PixelBuffer* image, BPoint offset) override;
 	status_t DecodePicture(const void* data, size_t size, Picture* picture) override;
 	status_t SavePicture(const Picture& picture, const char* path) override;
+	void Sync() override {}
 	void InjectPointer(BPoint screenWhere, uint32 buttons) override;
 	void InjectWheel(float deltaX, float deltaY) override;
 	void InjectKey(const InjectedKey& key, bool down) override;

@@ -283,8 +283,8 @@ Robot::Settle()
 	bool settled = true;
 	for (int round = 0; round < kRounds && settled; round++)
 		settled = SettleOnce(kBusyTime);
-	// A step of the display's thread: what was presented before is shown.
-	Display::Get().InjectPointer(fWhere, fButtons);
+	// The pointer is left alone: it may be somebody else's, where the robot only looks.
+	Display::Get().Sync();
 	return settled;
 }
 

@@ -445,6 +445,13 @@ QtDisplay::RepaintOverlay()
 
 
 void
+QtDisplay::Sync()
+{
+	fThread.Run([] {});
+}
+
+
+void
 QtDisplay::InjectPointer(BPoint screenWhere, uint32 buttons)
 {
 	fThread.Run([&] {

@@ -8,6 +8,7 @@
 
 #include "InterfaceFixture.h"
 #include "display/Display.h"
+#include "display/Robot.h"
 #include "support/Printers.h"
 
 using BPrivate::Display;
@@ -148,6 +149,24 @@ protected:
 };
 
 } // namespace
+
+
+// The windows may be driven by a hand of the host, while a robot waits for what that brings about.
+TEST_F(HostInputTest, ARobotThatOnlyWaitsLeavesThePointerAlone)
+{
+	Point(340, 150, B_PRIMARY_MOUSE_BUTTON);
+	EXPECT_TRUE(BPrivate::Robot().Settle());
+
+	BPoint where;
+	uint32 buttons;
+	Display::Get().GetPointer(&where, &buttons);
+	EXPECT_EQ(where, BPoint(340, 150));
+	EXPECT_EQ(buttons, uint32(B_PRIMARY_MOUSE_BUTTON));
+	EXPECT_EQ(TakeRight(), Log({"right down"}));
+
+	Point(340, 150);
+	EXPECT_EQ(TakeRight(), Log({"right up"}));
+}
 
 
 TEST_F(HostInputTest, AClickInAnInactiveWindowOnlyActivatesIt)
