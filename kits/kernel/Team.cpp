@@ -171,7 +171,7 @@ load_image(int32 argc, const char** argv, const char** environ)
 		remove_thread_record(team);
 		return B_NO_MORE_THREADS;
 	}
-	argument.release();
+	static_cast<void>(argument.release());
 	pthread_detach(watcher);
 	return child;
 }

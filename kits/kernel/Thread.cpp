@@ -110,7 +110,7 @@ spawn_thread(thread_func function, const char* name, int32 priority, void* data)
 		remove_thread_record(thread);
 		return B_NO_MORE_THREADS;
 	}
-	argument.release();
+	static_cast<void>(argument.release());
 	set_host_name(thread.get());
 	return thread->id;
 }

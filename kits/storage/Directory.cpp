@@ -17,7 +17,6 @@
 #include "storage/StorageStatus.h"
 
 using BPrivate::status_from_errno;
-using BPrivate::status_of;
 
 const mode_t kNewDirectoryMode = 0777;
 

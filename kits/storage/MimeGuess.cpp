@@ -76,7 +76,7 @@ guess_mime_type(std::string_view content, const std::string& name)
 {
 	if (content.starts_with(kElfMagic))
 		return B_APP_MIME_TYPE;
-	const std::string type = MimeDatabase::Default().Guess(content, name);
+	std::string type = MimeDatabase::Default().Guess(content, name);
 	if (!type.empty())
 		return type;
 	return IsText(content) ? kTextType : B_FILE_MIME_TYPE;

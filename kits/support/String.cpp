@@ -116,14 +116,16 @@ BString::operator=(BString&& string) noexcept
 BString&
 BString::operator=(const char* string)
 {
-	return SetTo(string);
+	SetTo(string);
+	return *this;
 }
 
 
 BString&
 BString::operator=(char c)
 {
-	return SetTo(c, 1);
+	SetTo(c, 1);
+	return *this;
 }
 
 
