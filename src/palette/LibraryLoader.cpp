@@ -29,7 +29,7 @@ PathsIn(BDirectory* directory)
 	BPath path;
 	while (directory->GetNextEntry(&entry, true) == B_OK) {
 		if (entry.GetPath(&path) == B_OK)
-			paths.push_back(path.Path());
+			paths.emplace_back(path.Path());
 	}
 	directory->Rewind();
 	return paths;

@@ -68,7 +68,7 @@ TEditorState::TEditorState(TProperty* property, TPropertyEditor* editor, TPropEd
 	TStringList list(20);
 	editor->GetValuePickList(&list);
 	for (int32 i = 0; i < list.CountItems(); i++)
-		choices.push_back(list.StringAt(i));
+		choices.emplace_back(list.StringAt(i));
 }
 
 

@@ -31,7 +31,7 @@ TEventListItem::~TEventListItem() {}
 
 
 bool
-TEventListItem::Update(const TEventListItem& fresh)
+TEventListItem::TakeOver(const TEventListItem& fresh)
 {
 	const bool changed = fName != fresh.fName || fMarked != fresh.fMarked;
 	fEvent = fresh.fEvent;

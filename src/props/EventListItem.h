@@ -23,7 +23,7 @@ public:
 	void Clear() { fEvent = nullptr; }
 
 	/// Takes over what \a fresh shows. True when that is something else.
-	bool Update(const TEventListItem& fresh);
+	bool TakeOver(const TEventListItem& fresh);
 
 	const char* Name() const { return fName; }
 	bool IsMarked() const { return fMarked; }

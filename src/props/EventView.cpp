@@ -80,7 +80,7 @@ TEventView::UpdateRows(TComponentRows* rows)
 		return;
 	}
 	for (int32 i = 0; i < fList->CountItems(); i++) {
-		if (static_cast<TEventListItem*>(fList->ItemAt(i))->Update(*rows->events[i]))
+		if (static_cast<TEventListItem*>(fList->ItemAt(i))->TakeOver(*rows->events[i]))
 			fList->InvalidateItem(i);
 	}
 }

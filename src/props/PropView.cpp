@@ -62,7 +62,7 @@ TPropView::UpdateRows(TComponentRows* rows)
 		return;
 	}
 	for (int32 i = 0; i < fList->CountItems(); i++) {
-		if (static_cast<TPropertyListItem*>(fList->ItemAt(i))->Update(*rows->properties[i]))
+		if (static_cast<TPropertyListItem*>(fList->ItemAt(i))->TakeOver(*rows->properties[i]))
 			fList->InvalidateItem(i);
 	}
 }

@@ -40,7 +40,7 @@ TPropertyListItem::GetProperty(TPropertyWatch* property, TPropertyEditor** edito
 
 
 bool
-TPropertyListItem::Update(const TPropertyListItem& fresh)
+TPropertyListItem::TakeOver(const TPropertyListItem& fresh)
 {
 	fProperty.SetTo(fresh.fProperty);
 	fEditor = fresh.fEditor;

@@ -29,7 +29,7 @@ public:
 	void Clear() { fProperty.SetTo(nullptr); }
 
 	/// Takes over what \a fresh shows. True when that is something else.
-	bool Update(const TPropertyListItem& fresh);
+	bool TakeOver(const TPropertyListItem& fresh);
 
 	const char* Name() const { return fName.String(); }
 	const char* DisplayValue() const { return fValue.String(); }

@@ -246,7 +246,7 @@ PropertyWin::Bury(std::unique_ptr<TForgottenEditors> editors)
 	if (PostMessage(&message) != B_OK)
 		editors->Spare();
 	else
-		editors.release();
+		static_cast<void>(editors.release());
 }
 
 
