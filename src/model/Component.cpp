@@ -6,6 +6,7 @@
 
 #include <cstring>
 #include <mutex>
+#include <utility>
 
 #include "model/ComponentDrag.h"
 #include "model/ComponentOwner.h"
@@ -70,8 +71,7 @@ TComponent::TComponent(TComponentOwner* owner, TFormDesigner* designer, TCompone
 	  fStoreIsLate(true),
 	  fPropertyStore(new TPropertyStore(this)),
 	  fDesignerSelected(false),
-	  fStoredCount(0),
-	  fUnused(0),
+	  fLastStored(nullptr),
 	  fDTView(nullptr)
 {
 	fShortName[0] = '\0';
@@ -83,7 +83,7 @@ TComponent::~TComponent()
 {
 	ComponentDrag::Forget(this);
 	// Nobody will ask for the store any more.
-	fStoredCount = 0;
+	fLastStored = nullptr;
 	// Not the overrides of derived classes: those are gone.
 	TComponent::ClearProperties(true);
 	delete fProperties;
@@ -443,8 +443,12 @@ TComponent::StoreProperty(const char* name, const char* value)
 	}
 	property->TakeValue(value);
 	if (fStoreIsLate.load(std::memory_order_relaxed) && property->fComponent == this) {
-		if (property->fStoreOrder == 0)
-			property->fStoreOrder = ++fStoredCount;
+		if (property->fNextStored == nullptr) {
+			property->fNextStored = property;
+			if (fLastStored != nullptr)
+				std::swap(property->fNextStored, fLastStored->fNextStored);
+			fLastStored = property;
+		}
 		return;
 	}
 	// Not by the store's own setter: that takes precautions for texts of the store.
@@ -462,18 +466,12 @@ TComponent::FillStore() const
 	if (!fStoreIsLate.load(std::memory_order_relaxed))
 		return;
 
-	// In the order in which they were stored, which is mostly that of the list.
-	const int32 count = CountProperties();
-	int32 index = 0;
-	for (uint16 order = 1; order <= fStoredCount; order++) {
-		for (int32 tried = 0; tried < count; tried++, index++) {
-			TProperty* property = PropertyAt(index % count);
-			if (property == nullptr || property->fStoreOrder != order)
-				continue;
-			fPropertyStore->BMessage::SetString(property->Name(), property->Value());
-			property->fStoreOrder = 0;
-			break;
-		}
+	// In the order in which they were stored.
+	TProperty* last = std::exchange(fLastStored, nullptr);
+	TProperty* property = last != nullptr ? std::exchange(last->fNextStored, nullptr) : nullptr;
+	while (property != nullptr) {
+		fPropertyStore->BMessage::SetString(property->Name(), property->Value());
+		property = std::exchange(property->fNextStored, nullptr);
 	}
 	fStoreIsLate.store(false, std::memory_order_release);
 }
@@ -483,6 +481,6 @@ TComponent::FillStore() const
 void
 TComponent::KeepStored()
 {
-	if (fStoredCount > 0)
+	if (fLastStored != nullptr)
 		PropertyStore();
 }

@@ -234,9 +234,8 @@ private:
 	mutable std::atomic<bool> fStoreIsLate;
 	TPropertyStore* fPropertyStore;
 	bool fDesignerSelected;
-	// How many properties have been stored since. In a gap, too.
-	uint16 fStoredCount;
-	int32 fUnused;
+	// The property that was stored last since; that one leads to the first. Null for none.
+	mutable TProperty* fLastStored;
 	BView* fDTView;
 };
 

@@ -37,7 +37,7 @@ TProperty::TProperty(TComponent* component, const char* name, const char* value,
 	  fEditor(editor),
 	  fQuoted(false),
 	  fGenerated(generated),
-	  fStoreOrder(0)
+	  fNextStored(nullptr)
 {
 	const size_t length = name != nullptr ? strnlen(name, sizeof(fName) - 1) : 0;
 	if (length > 0)
@@ -52,7 +52,7 @@ TProperty::TProperty(const TProperty& other)
 	  fEditor(other.fEditor),
 	  fQuoted(other.fQuoted),
 	  fGenerated(other.fGenerated),
-	  fStoreOrder(0)
+	  fNextStored(nullptr)
 {
 	memcpy(fName, other.fName, sizeof(fName));
 	fValue.Fill(other.fValue.Text());
@@ -209,7 +209,7 @@ TProperty::KeepDefault(const char* newValue)
 void
 TProperty::KeepStored()
 {
-	if (fStoreOrder != 0)
+	if (fNextStored != nullptr)
 		fComponent->PropertyStore();
 }
 

@@ -113,7 +113,7 @@ private:
 	TRarePropertyText fGetStatement;
 	bool fQuoted;
 	bool fGenerated;
-	// The component has not put the value into its store yet: as which one it was stored; otherwise 0. In the gap behind the
-	// flags.
-	uint16 fStoreOrder;
+	// While the component has not put the value into its store: the property that was stored next, or, behind the last one,
+	// the first. Null otherwise.
+	TProperty* fNextStored;
 };

@@ -4,6 +4,7 @@
 #include "model/Component.h"
 
 #include <cstring>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -309,6 +310,18 @@ TEST_F(ComponentTest, TheStoreKeepsWhatThePropertyHasNoLonger)
 	EXPECT_STREQ(emptied.PropertyStore()->FindString("Label"), "Close");
 	emptied.InitPropertyList();
 	EXPECT_TRUE(emptied.PropertyStore()->IsEmpty());
+}
+
+
+TEST_F(ComponentTest, TheStoreIsFilledWhenAPropertyThatWasNeverStoredHasGone)
+{
+	// Not in the memory that properties share, so that a checker of memory sees it go.
+	auto gone = std::make_shared<TProperty>(&fComponent, "Gone", "", nullptr, true);
+	fComponent.AddProperty(gone.get());
+	fComponent.StoreProperty("Label", "Cancel");
+	gone.reset();
+	EXPECT_STREQ(Stored("Label"), "Cancel");
+	EXPECT_EQ(fComponent.PropertyStore()->CountNames(B_ANY_TYPE), 1);
 }
 
 
