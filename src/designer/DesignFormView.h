@@ -68,6 +68,7 @@ public:
 	void ComponentSelected(TComponent* component) override;
 	/// Shows the new place of \a component in the property window, if that shows it.
 	void ComponentMoved(TComponent* component, BPoint point) override;
+	using TFormDesigner::DeselectComponents;
 
 	/// Whether \a component is one of this form's, at any depth; it may be gone.
 	bool Lists(const TComponent* component) const;
@@ -77,9 +78,6 @@ public:
 
 	/// Selects the form's component, or not. The frame that marks it is drawn anew when that changes.
 	void MarkForm(bool selected);
-
-	/// Deselects every component but \a kept, which may be null. Those that were selected are drawn anew.
-	void DeselectComponents(const TComponent* kept);
 
 	/// Deselects every form of the project. Locks each in turn; this window's lock is given up meanwhile.
 	void DeselectForms();

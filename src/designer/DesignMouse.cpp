@@ -152,21 +152,6 @@ TDesignFormView::MarkForm(bool selected)
 
 
 void
-TDesignFormView::DeselectComponents(const TComponent* kept)
-{
-	for (int32 i = 0; i < TFormDesigner::CountComponents(); i++) {
-		TComponent* component = TFormDesigner::ComponentAt(i);
-		if (component == kept)
-			continue;
-		const bool wasMarked = component->IsDesignerSelected();
-		component->DesignerSelect(false);
-		if (wasMarked && component->DTView() != nullptr)
-			component->DTView()->Invalidate();
-	}
-}
-
-
-void
 TDesignFormView::RepaintChildren()
 {
 	for (int32 i = 0; i < TFormDesigner::CountComponents(); i++) {

@@ -87,17 +87,8 @@ void
 TComponent::SelectAlone()
 {
 	DesignerSelect(true);
-	for (int32 i = 0; Owner() != nullptr && i < Owner()->CountComponents(); i++) {
-		TComponent* other = Owner()->ComponentAt(i);
-		if (other == nullptr || other == this)
-			continue;
-		// A form may have a thousand of them: only the one that looks otherwise then is drawn anew.
-		const bool wasMarked = other->IsDesignerSelected();
-		other->DesignerSelect(false);
-		if (wasMarked && other->DTView() != nullptr)
-			other->DTView()->Invalidate();
-	}
-
+	if (Owner() != nullptr)
+		Owner()->DeselectComponents(this);
 	if (fDTView != nullptr) {
 		fDTView->Invalidate();
 		for (BView* child = fDTView->ChildAt(0); child != nullptr; child = child->NextSibling())

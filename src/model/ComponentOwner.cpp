@@ -3,6 +3,8 @@
 
 #include "model/ComponentOwner.h"
 
+#include <View.h>
+
 #include "model/Component.h"
 
 
@@ -79,4 +81,20 @@ TComponentOwner::ClearComponents(bool deleteComponents)
 		}
 	}
 	fComponents.MakeEmpty();
+}
+
+
+void
+TComponentOwner::DeselectComponents(const TComponent* kept)
+{
+	for (int32 i = 0; i < CountComponents(); i++) {
+		TComponent* component = ComponentAt(i);
+		if (component == nullptr || component == kept)
+			continue;
+		// A form may have a thousand of them: only the one that looks otherwise then is drawn anew.
+		const bool wasMarked = component->IsDesignerSelected();
+		component->DesignerSelect(false);
+		if (wasMarked && component->DTView() != nullptr)
+			component->DTView()->Invalidate();
+	}
 }

@@ -41,6 +41,9 @@ public:
 	/// Empties the list; with \a deleteComponents destroys the components first, in list order.
 	virtual void ClearComponents(bool deleteComponents);
 
+	/// Deselects every component but \a kept, which may be null. Those that were selected are drawn anew.
+	void DeselectComponents(const TComponent* kept);
+
 private:
 	BList fComponents;
 };

@@ -55,6 +55,25 @@ TEST(ComponentOwnerTest, AddingMakesTheOwner)
 }
 
 
+TEST(ComponentOwnerTest, AllButTheKeptOneAreDeselected)
+{
+	TComponentOwner owner;
+	TComponent components[] = {{nullptr, nullptr, CT_VISUAL}, {nullptr, nullptr, CT_VISUAL},
+		{nullptr, nullptr, CT_VISUAL}};
+	for (TComponent& component : components) {
+		owner.AddComponent(&component);
+		component.DesignerSelect(true);
+	}
+
+	owner.DeselectComponents(&components[1]);
+	EXPECT_FALSE(components[0].IsDesignerSelected());
+	EXPECT_TRUE(components[1].IsDesignerSelected());
+	EXPECT_FALSE(components[2].IsDesignerSelected());
+	owner.DeselectComponents(nullptr);
+	EXPECT_FALSE(components[1].IsDesignerSelected());
+}
+
+
 TEST(ComponentOwnerTest, RemovingLeavesTheComponentWithoutOwner)
 {
 	TComponentOwner owner;
