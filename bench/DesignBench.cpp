@@ -215,9 +215,14 @@ SelectAllOrNone(benchmark::State& state)
 	bool selected = false;
 	const std::function<void()> selectOrNot = [&] {
 		selected = !selected;
-		for (int32 i = 0; i < form->CountComponents(); i++)
-			form->ComponentAt(i)->DesignerSelect(selected);
-		form->View()->RepaintChildren();
+		if (!selected) {
+			form->View()->DeselectComponents(nullptr);
+			return;
+		}
+		for (int32 i = 0; i < form->CountComponents(); i++) {
+			form->ComponentAt(i)->DesignerSelect(true);
+			form->ComponentAt(i)->DTView()->Invalidate();
+		}
 	};
 	form.Run(selectOrNot);
 	if (before.empty() || ScreenAround(corner) == before)

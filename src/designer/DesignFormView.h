@@ -73,9 +73,6 @@ public:
 	/// Whether \a component is one of this form's, at any depth; it may be gone.
 	bool Lists(const TComponent* component) const;
 
-	/// Draws every component anew, with its selection marks.
-	void RepaintChildren();
-
 	/// Selects the form's component, or not. The frame that marks it is drawn anew when that changes.
 	void MarkForm(bool selected);
 

@@ -152,17 +152,6 @@ TDesignFormView::MarkForm(bool selected)
 
 
 void
-TDesignFormView::RepaintChildren()
-{
-	for (int32 i = 0; i < TFormDesigner::CountComponents(); i++) {
-		BView* view = TFormDesigner::ComponentAt(i)->DTView();
-		if (view != nullptr)
-			view->Invalidate();
-	}
-}
-
-
-void
 TDesignFormView::ComponentSelected(TComponent* component)
 {
 	MarkForm(false);

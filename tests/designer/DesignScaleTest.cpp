@@ -104,10 +104,7 @@ TEST_F(DesignScaleTest, WhatIsMarkedOtherwiseLooksAsIfAllWereDrawnAnew)
 	for (BPoint where : clicks) {
 		fRobot.Click(where);
 		const WindowPicture picture = fRobot.Picture();
-		Locked([&] {
-			Form()->View()->Invalidate();
-			Form()->View()->RepaintChildren();
-		});
+		Locked([&] { Form()->View()->Invalidate(); });
 		fRobot.Settle();
 		const WindowPicture whole = fRobot.Picture();
 		ASSERT_FALSE(whole.pixels.empty());
