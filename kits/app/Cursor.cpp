@@ -288,12 +288,7 @@ BCursor::InitCheck() const
 }
 
 
-BCursor&
-BCursor::operator=(const BCursor& other)
-{
-	fShape = other.fShape;
-	return *this;
-}
+BCursor& BCursor::operator=(const BCursor& other) = default;
 
 
 std::shared_ptr<const CursorShape>

@@ -41,7 +41,7 @@ Hand(const MessageAddress& to, std::unique_ptr<BMessage> copy)
 		status = reply->Put(copy.get()) ? B_OK : B_BAD_PORT_ID;
 
 	if (status == B_OK) {
-		copy.release();
+		static_cast<void>(copy.release());
 		return B_OK;
 	}
 	// Nobody has seen it, so nobody is to be told that it is answered.

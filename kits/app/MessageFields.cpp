@@ -446,9 +446,9 @@ BMessage::RemoveField(int32 index)
 	fBody->fieldCount--;
 	memmove(fields + index, fields + index + 1, (fBody->fieldCount - index) * sizeof(Field));
 
-	for (uint32 i = 0; i < kBucketCount; i++) {
-		if (fBody->buckets[i] > index)
-			fBody->buckets[i]--;
+	for (int32& bucket : fBody->buckets) {
+		if (bucket > index)
+			bucket--;
 	}
 	for (uint32 i = 0; i < fBody->fieldCount; i++) {
 		if (fields[i].next > index)

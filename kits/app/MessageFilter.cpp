@@ -51,6 +51,8 @@ BMessageFilter::~BMessageFilter() {}
 BMessageFilter&
 BMessageFilter::operator=(const BMessageFilter& from)
 {
+	if (this == &from)
+		return *this;
 	fFiltersAny = from.fFiltersAny;
 	fWhat = from.fWhat;
 	fDelivery = from.fDelivery;

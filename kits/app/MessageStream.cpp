@@ -59,7 +59,7 @@ MessageStream::ReadUpTo(size_t size, size_t enough)
 			uint8* bytes = static_cast<uint8*>(realloc(fBytes.get(), capacity));
 			if (bytes == nullptr)
 				return B_NO_MEMORY;
-			fBytes.release();
+			static_cast<void>(fBytes.release());
 			fBytes.reset(bytes);
 			fCapacity = capacity;
 		}
@@ -92,7 +92,7 @@ MessageStream::Share()
 {
 	MessageBytes* shared = MessageBytes::Adopt(fBytes.get(), fSize);
 	if (shared != nullptr)
-		fBytes.release();
+		static_cast<void>(fBytes.release());
 	return shared;
 }
 

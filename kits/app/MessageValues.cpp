@@ -52,6 +52,7 @@ BMessage::HasValue(const char* name, type_code type, int32 index, size_t size) c
 
 
 // Every line of the family for one type: Type is the value, TypeRef how a default is passed.
+// NOLINTBEGIN(bugprone-macro-parentheses): a type cannot stand in parentheses.
 #define DEFINE_VALUE(Name, Type, TypeRef, code)                                                    \
 	status_t BMessage::Add##Name(const char* name, Type value)                                     \
 	{                                                                                              \
@@ -102,6 +103,7 @@ BMessage::HasValue(const char* name, type_code type, int32 index, size_t size) c
 	{                                                                                              \
 		return SetData(name, code, &value, sizeof(value), true);                                   \
 	}
+// NOLINTEND(bugprone-macro-parentheses)
 
 #define DEFINE_FIND_BY_VALUE(Name, Type)                                                           \
 	Type BMessage::Find##Name(const char* name, int32 index) const                                 \

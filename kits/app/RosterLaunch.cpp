@@ -170,7 +170,7 @@ RequestFor(int argc, const char* const* args)
 {
 	LaunchRequest request;
 	for (int i = 0; args != nullptr && i < argc; i++)
-		request.arguments.push_back(args[i] != nullptr ? args[i] : "");
+		request.arguments.emplace_back(args[i] != nullptr ? args[i] : "");
 	return request;
 }
 
