@@ -127,13 +127,7 @@ BTextView::TakeDrop(const BMessage* message)
 	std::string text;
 	BPrivate::RunArray runs;
 	ReadText(*message, &text, &runs);
-	const int32 length = static_cast<int32>(text.size());
-	if (length == 0 || !IsAllowed(text.data(), length, 0))
-		return;
-	SealUndo();
-	Replace(offset, offset, text.data(), length, runs.get());
-	SealUndo();
-	ScrollToSelection();
+	PutInPlace(offset, offset, text, runs.get());
 }
 
 

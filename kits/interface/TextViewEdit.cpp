@@ -302,11 +302,19 @@ BTextView::Paste(BClipboard* clipboard)
 	int32 start;
 	int32 end;
 	GetSelection(&start, &end);
+	PutInPlace(start, end, text, runs.get());
+}
+
+
+/// Puts text that comes from elsewhere in the place of other text, as one change, if it is allowed.
+void
+BTextView::PutInPlace(int32 from, int32 to, const std::string& text, const text_run_array* runs)
+{
 	const int32 length = static_cast<int32>(text.size());
-	if (length == 0 || !IsAllowed(text.data(), length, end - start))
+	if (length == 0 || !IsAllowed(text.data(), length, to - from))
 		return;
 	SealUndo();
-	Replace(start, end, text.data(), length, runs.get());
+	Replace(from, to, text.data(), length, runs);
 	SealUndo();
 	ScrollToSelection();
 }

@@ -198,6 +198,7 @@ private:
 		int32 from, int32 to, const char* text, int32 length, const text_run_array* runs = NULL);
 	void InsertAt(int32 offset, const char* text, int32 length, const text_run_array* runs);
 	bool IsAllowed(const char* text, int32 length, int32 replaced);
+	void PutInPlace(int32 from, int32 to, const std::string& text, const text_run_array* runs);
 	void TextChanged();
 	void SealUndo();
 	void Redo();
