@@ -124,7 +124,7 @@ public:
 	{
 		const QtUse use;
 		if (!use)
-			content.release();
+			static_cast<void>(content.release());
 	}
 
 	std::unique_ptr<Content> content;

@@ -46,7 +46,7 @@ QtHostWindow::~QtHostWindow()
 	});
 	// Without its thread the host's window cannot be taken apart.
 	if (!removed)
-		fWindow.release();
+		static_cast<void>(fWindow.release());
 }
 
 
