@@ -36,6 +36,9 @@ struct InputOverlay {
 	BRect dragged;
 	/// The dragged picture's left-top is that of dragged.
 	std::shared_ptr<const Picture> image;
+
+	/// An image is nowhere without a valid rect.
+	bool IsEmpty() const { return !tracking.IsValid() && !dragged.IsValid(); }
 };
 
 

@@ -22,6 +22,7 @@ const size_t kLeastShared = 64 * 1024;
 
 WindowPixels::WindowPixels(size_t count)
 	: fCount(count),
+	  fFile(-1),
 	  fDrawn(nullptr),
 	  fFinished(nullptr),
 	  fIsBegun(false)
@@ -70,6 +71,7 @@ WindowPixels::~WindowPixels()
 		return;
 	munmap(fDrawn, fCount * sizeof(uint32));
 	munmap(fFinished, fCount * sizeof(uint32));
+	close(fFile);
 }
 
 
@@ -88,14 +90,15 @@ WindowPixels::Share()
 		finished = mmap(nullptr, bytes, PROT_READ | PROT_WRITE, MAP_SHARED, file, 0);
 		drawn = mmap(nullptr, bytes, PROT_READ | PROT_WRITE, MAP_PRIVATE, file, 0);
 	}
-	close(file);
 	if (finished == MAP_FAILED || drawn == MAP_FAILED) {
+		close(file);
 		if (finished != MAP_FAILED)
 			munmap(finished, bytes);
 		if (drawn != MAP_FAILED)
 			munmap(drawn, bytes);
 		return false;
 	}
+	fFile = file;
 	fFinished = static_cast<uint32*>(finished);
 	fDrawn = static_cast<uint32*>(drawn);
 	std::fill_n(fFinished, fCount, kWhite);

@@ -23,6 +23,8 @@ public:
 	WindowPixels& operator=(const WindowPixels&) = delete;
 
 	size_t Count() const { return fCount; }
+	/// The file in memory that Finished() is a mapping of; -1 where nothing is shared.
+	int File() const { return fFile; }
 	/// Belongs to who draws.
 	uint32* Drawn() { return fDrawn; }
 	/// Belongs to who shows it: for as long as a Surface has it, use it under its lock only.
@@ -44,6 +46,7 @@ private:
 	void BeginDrawing();
 
 	const size_t fCount;
+	int fFile;
 	uint32* fDrawn;
 	uint32* fFinished;
 	/// Where nothing is shared.

@@ -10,7 +10,9 @@ the window's foot says came of their use.
 
 import sys
 import time
+from pathlib import Path
 
+import picture
 from exchange import Program, check, main
 from watched import Watched
 from waits import wait_for
@@ -289,13 +291,30 @@ class Session:
         g.expect_status("Dropped: apple.txt banana.txt")
         source.process.terminate()
 
+    def server_reads_the_picture(self):
+        """From the gallery's own memory, and so what is on the screen is what the gallery has drawn."""
+        g = self.gallery
+        maps = Path(f"/proc/{self.desktop.server.pid}/maps")
+        wait_for("the server has the memory of the window", lambda: "memfd:window" in maps.read_text())
+        drawn = self.desktop.folder / "gallery.png"
+        left, top = self.desktop.input.place_of(int(self.desktop.wait_for_window("Gallery")))
+
+        def is_shown():
+            g.tell(f"save-png {drawn}")
+            g.ask("print-windows", "window: Gallery")
+            own = picture.load(drawn)
+            return self.desktop.picture().part(left, top, left + own.width - 1, top + own.height - 1) == own
+        g.keys("ctrl+1")
+        g.click("cbOff")
+        wait_for("the screen shows what was drawn", is_shown)
+
 
 def use_gallery(desktop, program, client):
     started = time.monotonic()
     session = Session(desktop, program, client)
     for part in (session.buttons, session.menus_by_click, session.menus_by_keys, session.pop_up_menu, session.alerts,
                  session.open_panel, session.save_panel, session.lists, session.sliders_and_colours, session.tabs,
-                 session.texts, session.selecting_beyond_the_edge, session.dropped_file):
+                 session.texts, session.selecting_beyond_the_edge, session.dropped_file, session.server_reads_the_picture):
         part()
         print(f"{time.monotonic() - started:6.2f} s  {part.__name__} done", flush=True)
     session.gallery.close()

@@ -58,6 +58,7 @@ class Desktop:
         self.screen = None
         self.input = None
         self.manager = None
+        self.server = None
 
     def __enter__(self):
         try:
@@ -108,7 +109,7 @@ class Desktop:
     def start_server(self):
         """The server finds a free number itself, and says it as soon as it can be used."""
         reader, writer = os.pipe()
-        server = self.start(
+        self.server = self.start(
             ["Xvfb", "-displayfd", writer, "-screen", "0", "1024x768x24", "-nolisten", "tcp", "-noreset", "-fbdir",
              self.folder], "Xvfb", pass_fds=[writer])
         os.close(writer)
@@ -118,7 +119,7 @@ class Desktop:
             ready, _, _ = select.select([reader], [], [], max(end - time.monotonic(), 0))
             read = os.read(reader, 16) if ready else b""
             if not read:
-                raise Failure(f"Xvfb did not start (code {server.poll()}): " + self.output_of("Xvfb").read_text())
+                raise Failure(f"Xvfb did not start (code {self.server.poll()}): " + self.output_of("Xvfb").read_text())
             number += read
         os.close(reader)
         self.environment["DISPLAY"] = f":{int(number)}"

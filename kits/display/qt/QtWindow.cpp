@@ -394,6 +394,8 @@ QtWindow::Paint(const QRegion& wanted)
 	if (region.isEmpty())
 		return;
 	PlanRest();
+	if (LetServerShow(region))
+		return;
 	// After a rest the host still has the other parts; for the first picture it has asked for all of them.
 	if (fBackingStore == nullptr) {
 		fBackingStore = std::make_unique<QBackingStore>(this);
@@ -412,13 +414,40 @@ QtWindow::Paint(const QRegion& wanted)
 	}
 	fBackingStore->endPaint();
 	fBackingStore->flush(region);
+	fPaintedSize = size();
+}
+
+
+// Not what only Qt does: a new size, after which it answers the window manager, and what follows the pointer.
+bool
+QtWindow::LetServerShow(const QRegion& region)
+{
+	if (fPaintedSize != size() || !fDisplay.Hub().Overlay().IsEmpty())
+		return false;
+	bool isShown = false;
+	fSurface->Paint([&](const QImage& image, const std::shared_ptr<WindowPixels>& pixels) {
+		const qreal ratio = devicePixelRatio();
+		const QSizeF covered = image.isNull() ? QSizeF() : image.deviceIndependentSize();
+		if (image.devicePixelRatio() != ratio || covered.width() < width()
+			|| covered.height() < height())
+			return;
+		QRegion device;
+		for (const QRect& rect : region) {
+			device += QRectF(rect.x() * ratio, rect.y() * ratio, rect.width() * ratio,
+						  rect.height() * ratio)
+						  .toAlignedRect()
+				& image.rect();
+		}
+		isShown = fServerPixels.Show(pixels, image.size(), device, static_cast<uint32>(winId()));
+	});
+	return isShown;
 }
 
 
 void
 QtWindow::PaintPicture(QPainter& painter)
 {
-	fSurface->Paint([&](const QImage& image) {
+	fSurface->Paint([&](const QImage& image, const std::shared_ptr<WindowPixels>&) {
 		QSizeF covered = image.isNull() ? QSizeF() : image.deviceIndependentSize();
 		if (covered.width() < width() || covered.height() < height())
 			painter.fillRect(QRect(QPoint(0, 0), size()), kUndrawnColor);

@@ -12,6 +12,7 @@
 
 #include "display/HostWindow.h"
 #include "display/SharedFrame.h"
+#include "display/qt/ServerPixels.h"
 
 class QBackingStore;
 class QDragMoveEvent;
@@ -72,6 +73,7 @@ protected:
 private:
 	void AskHost();
 	void HostAnswered();
+	bool LetServerShow(const QRegion& region);
 	void PlanRest();
 	void Rest();
 	void GeometryChanged();
@@ -85,6 +87,9 @@ private:
 	QtDisplay& fDisplay;
 	/// What is on its way to the host. Null before the first painting, and after a rest.
 	std::unique_ptr<QBackingStore> fBackingStore;
+	/// The window's size when Qt painted it last.
+	QSize fPaintedSize;
+	ServerPixels fServerPixels;
 	std::shared_ptr<Surface> fSurface;
 	QElapsedTimer fLastChange;
 	QTimer fRestTimer;

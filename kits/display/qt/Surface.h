@@ -28,12 +28,12 @@ public:
 	/// What changed since the last call, in window coordinates, rounded outwards.
 	QRegion TakeDamage();
 
-	/// Calls \a painter with the picture, which is empty before the first Take().
+	/// Calls \a painter with the picture, which is empty before the first Take(), and the memory that it is in.
 	template <typename Painter>
 	void Paint(Painter painter) const
 	{
 		std::lock_guard<std::mutex> lock(fMutex);
-		painter(fImage);
+		painter(fImage, fPixels);
 	}
 
 	Picture Copy() const;
