@@ -369,8 +369,13 @@ QtCanvas::PaintRounded(
 		cover(whole.left(), coverage);
 		cover(firstRight, coverage + corner + 1);
 		const uint8 middle = coverage[corner];
+		const int from = std::max(whole.left() + corner, left);
 		const int to = std::min(firstRight - 1, right);
-		for (int x = std::max(whole.left() + corner, left); middle != 0 && x <= to; x++)
+		if (middle == 255 && from <= to) {
+			std::fill(row + from, row + to + 1, pixel);
+			return;
+		}
+		for (int x = from; middle != 0 && x <= to; x++)
 			row[x] = MixPixels(row[x], pixel, middle) | (fBuffer.hasAlpha ? 0 : pixel & 0xff000000);
 	});
 	return true;
