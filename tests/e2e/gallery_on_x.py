@@ -306,6 +306,8 @@ class Session:
             return self.desktop.picture().part(left, top, left + own.width - 1, top + own.height - 1) == own
         g.keys("ctrl+1")
         g.click("cbOff")
+        # Its shape is part of the screen.
+        self.desktop.input.move(*SOURCE)
         wait_for("the screen shows what was drawn", is_shown)
 
 
