@@ -151,7 +151,7 @@ void
 BButton::KeyDown(const char* bytes, int32 numBytes)
 {
 	if (numBytes != 1 || (bytes[0] != B_ENTER && bytes[0] != B_SPACE)) {
-		BView::KeyDown(bytes, numBytes);
+		BControl::KeyDown(bytes, numBytes);
 		return;
 	}
 	if (!IsEnabled())

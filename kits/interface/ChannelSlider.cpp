@@ -211,7 +211,7 @@ BChannelSlider::KeyDown(const char* bytes, int32 numBytes)
 	int32 minimum, maximum;
 	if ((!isArrow && key != B_HOME && key != B_END) || GetLimits(&minimum, &maximum) != B_OK) {
 		// Space and Enter have nothing to click here.
-		BView::KeyDown(bytes, numBytes);
+		BView::KeyDown(bytes, numBytes); // NOLINT(bugprone-parent-virtual-call): as said above
 		return;
 	}
 	if (!IsEnabled())

@@ -92,7 +92,7 @@ void
 BCheckBox::KeyDown(const char* bytes, int32 numBytes)
 {
 	if (!BPrivate::ClickTracking::IsClickKey(bytes, numBytes))
-		BView::KeyDown(bytes, numBytes);
+		BControl::KeyDown(bytes, numBytes);
 	else if (IsEnabled())
 		Toggle();
 }

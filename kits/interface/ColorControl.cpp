@@ -235,7 +235,8 @@ BColorControl::KeyDown(const char* bytes, int32 numBytes)
 		Invalidate();
 		return;
 	} else {
-		BView::KeyDown(bytes, numBytes);
+		// Space and Enter have nothing to click here.
+		BView::KeyDown(bytes, numBytes); // NOLINT(bugprone-parent-virtual-call): as said above
 		return;
 	}
 	if (IsEnabled())

@@ -149,7 +149,8 @@ BColorControl::PaletteWidth() const
 float
 BColorControl::PaletteHeight() const
 {
-	return std::floor(256 / std::max(static_cast<int32>(fLayout), 1) * fCellSize) + 2 * kBevel;
+	const int32 rows = 256 / std::max(static_cast<int32>(fLayout), 1);
+	return std::floor(rows * fCellSize) + 2 * kBevel;
 }
 
 
@@ -203,7 +204,7 @@ BColorControl::DrawRamp(int32 ramp)
 	const float step = std::max(length / 256, 1.0f);
 	for (float way = 0; way <= length; way += step) {
 		BRect part = frame;
-		const int32 level = static_cast<int32>(way / length * 255 + 0.5f);
+		const int32 level = static_cast<int32>(std::lround(way / length * 255));
 		if (IsUpright()) {
 			part.bottom = std::floor(frame.bottom - way);
 			part.top = std::max(part.bottom - std::ceil(step) - 1, frame.top);

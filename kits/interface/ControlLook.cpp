@@ -56,7 +56,7 @@ rgb_color
 BlendColors(rgb_color under, rgb_color over, float amount)
 {
 	const auto blend = [amount](uint8 from, uint8 to) {
-		return static_cast<uint8>(from + (to - from) * std::clamp(amount, 0.0f, 1.0f) + 0.5f);
+		return static_cast<uint8>(std::lround(from + (to - from) * std::clamp(amount, 0.0f, 1.0f)));
 	};
 	rgb_color color;
 	color.red = blend(under.red, over.red);

@@ -123,7 +123,7 @@ void
 BPictureButton::KeyDown(const char* bytes, int32 numBytes)
 {
 	if (!BPrivate::ClickTracking::IsClickKey(bytes, numBytes)) {
-		BView::KeyDown(bytes, numBytes);
+		BControl::KeyDown(bytes, numBytes);
 		return;
 	}
 	if (!IsEnabled())

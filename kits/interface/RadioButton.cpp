@@ -89,7 +89,7 @@ void
 BRadioButton::KeyDown(const char* bytes, int32 numBytes)
 {
 	if (!BPrivate::ClickTracking::IsClickKey(bytes, numBytes))
-		BView::KeyDown(bytes, numBytes);
+		BControl::KeyDown(bytes, numBytes);
 	else if (IsEnabled())
 		Choose();
 }

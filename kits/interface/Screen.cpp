@@ -29,7 +29,7 @@ BScreen::BScreen(BWindow* window)
 }
 
 
-BScreen::~BScreen() = default;
+BScreen::~BScreen() {}
 
 
 bool

@@ -27,7 +27,7 @@ FollowMode(orientation direction)
 
 
 /// The bar as its target sees it.
-class BScrollBar::Link : public BPrivate::ScrollBarLink {
+class BScrollBar::Link final : public BPrivate::ScrollBarLink {
 public:
 	explicit Link(BScrollBar* bar)
 		: fBar(bar)

@@ -198,7 +198,7 @@ BSlider::KeyDown(const char* bytes, int32 numBytes)
 			break;
 		default:
 			// Space and Enter have nothing to click here.
-			BView::KeyDown(bytes, numBytes);
+			BView::KeyDown(bytes, numBytes); // NOLINT(bugprone-parent-virtual-call): as said above
 			return;
 	}
 	if (!IsEnabled())

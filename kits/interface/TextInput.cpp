@@ -41,6 +41,7 @@ void
 TextInput::KeyDown(const char* bytes, int32 numBytes)
 {
 	if (!fControl->IsEnabled()) {
+		// NOLINTNEXTLINE(bugprone-parent-virtual-call): the text is left alone
 		BView::KeyDown(bytes, numBytes);
 		return;
 	}
@@ -55,7 +56,7 @@ TextInput::KeyDown(const char* bytes, int32 numBytes)
 
 		case B_TAB:
 			// Navigation, not a character.
-			BView::KeyDown(bytes, numBytes);
+			BView::KeyDown(bytes, numBytes); // NOLINT(bugprone-parent-virtual-call): as said above
 			break;
 
 		default:

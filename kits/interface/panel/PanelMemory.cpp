@@ -92,7 +92,7 @@ PanelMemory::Load()
 	for (int32 i = 0; size_t(i) < kMostFolders && memory.FindString("folder", i, &folder) == B_OK;
 		 i++) {
 		if (folder[0] == '/')
-			fFolders.push_back(folder);
+			fFolders.emplace_back(folder);
 	}
 	SetSize(memory.GetFloat("width", 0), memory.GetFloat("height", 0));
 	fShowsHidden = memory.GetBool("hidden", false);
@@ -187,7 +187,7 @@ std::string
 StartFolder(const PanelMemory& memory)
 {
 	char* current = getcwd(nullptr, 0);
-	const std::string folder = current != nullptr ? current : "";
+	std::string folder = current != nullptr ? current : "";
 	free(current);
 	std::string home;
 	const bool hasHome = FindFolder(home_directory(), &home) == B_OK;

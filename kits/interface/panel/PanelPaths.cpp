@@ -68,7 +68,7 @@ TypedPath(const std::string& text, const std::string& folder)
 	const size_t first = text.find_first_not_of(" \t");
 	if (first == std::string::npos)
 		return "";
-	const std::string path = text.substr(first, text.find_last_not_of(" \t") + 1 - first);
+	std::string path = text.substr(first, text.find_last_not_of(" \t") + 1 - first);
 	if (path[0] == '/')
 		return path;
 	if (path == "~" || path.starts_with("~/"))
