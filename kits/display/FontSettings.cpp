@@ -63,7 +63,7 @@ Fontconfig::FamilyFor(const char* name) const
 		return "";
 	unsigned char* family = nullptr;
 	const bool hasFamily = getString(found, "family", 0, &family) == 0;
-	const std::string answer = hasFamily ? reinterpret_cast<const char*>(family) : "";
+	std::string answer = hasFamily ? reinterpret_cast<const char*>(family) : "";
 	destroyPattern(found);
 	return answer;
 }

@@ -203,7 +203,7 @@ Robot::WindowTitles()
 	std::vector<BString> titles;
 	ForEachWindow([&](BWindow* window) {
 		if (!window->IsHidden())
-			titles.push_back(window->Title());
+			titles.emplace_back(window->Title());
 		return false;
 	});
 	return titles;

@@ -56,7 +56,7 @@ QtDisplay::ReadScreens()
 	if (!frames.empty())
 		fScreens.swap(frames);
 	else if (fScreens.empty())
-		fScreens.push_back(BRect(0, 0, 1023, 767));
+		fScreens.emplace_back(0, 0, 1023, 767);
 }
 
 
