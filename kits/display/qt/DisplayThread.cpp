@@ -247,8 +247,10 @@ DisplayThread::Stop(std::function<void()> ending)
 	if (IsCurrent())
 		return;
 	bool isQueued = Post([this, ending = std::move(ending)] {
-		Refuse();
+		// First, while others' tasks still wait: who is told that a task will not be run may at once delete what the
+		// ending works on.
 		ending();
+		Refuse();
 		// quit() would have Qt close what windows it has of its own, those of a drag for one.
 		QCoreApplication::exit();
 	});

@@ -25,7 +25,7 @@ public:
 	bool Start(const std::string& platforms, std::function<void()> started);
 
 	/// Runs \a ending in the thread, then ends Qt there and waits for that; the thread itself stays. Later tasks
-	/// are refused.
+	/// are refused, but only after \a ending: who waits for one does so until then.
 	void Stop(std::function<void()> ending);
 
 	/// Queues \a task; false, and nothing happens, when the thread has ended.

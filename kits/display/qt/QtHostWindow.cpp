@@ -44,9 +44,12 @@ QtHostWindow::~QtHostWindow()
 		// The host's events that were under way, word of the focus above all, have named it again.
 		fDisplay.Hub().RemoveWindow(&fStacked);
 	});
-	// Without its thread the host's window cannot be taken apart.
-	if (!removed)
-		static_cast<void>(fWindow.release());
+	if (removed)
+		return;
+	// The display has ended, which took the host's window apart and may have named it, too; or it is lost: without
+	// its thread the window cannot be taken apart.
+	static_cast<void>(fWindow.release());
+	fDisplay.Hub().RemoveWindow(&fStacked);
 }
 
 

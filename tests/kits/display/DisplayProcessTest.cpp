@@ -68,9 +68,10 @@ class EndingTest : public testing::TestWithParam<const char*> {};
 
 TEST_P(EndingTest, AProgramEndsWellWhileItsWindowsDraw)
 {
-	// What could go wrong depends on who comes first.
-	const Result result = RunCommand("seq 20 | " + kClean + "xargs -P 4 -I NUMBER " + Within(60)
-		+ ENDING_PROGRAM + " " + GetParam());
+	// What could go wrong depends on who comes first. What is freed is overwritten, so that its use is noticed.
+	const Result result =
+		RunCommand("seq 20 | " + kClean + "MALLOC_PERTURB_=165 xargs -P 4 -I NUMBER " + Within(60)
+			+ ENDING_PROGRAM + " " + GetParam());
 	EXPECT_EQ(result.code, 0) << result.output;
 }
 
