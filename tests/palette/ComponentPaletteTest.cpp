@@ -189,7 +189,7 @@ TEST_F(ComponentPaletteTest, EntriesAreFoundByTheExactNameOfTheirClass)
 TEST_F(ComponentPaletteTest, AColumnThatIsLongerThanTheWindowCanBeScrolled)
 {
 	ComponentPalette* palette = ShowPalette();
-	BAutolock lock(palette);
+	ASSERT_TRUE(palette->Lock());
 	palette->View()->SetColumnHeight(500);
 	const float height = palette->View()->Bounds().Height();
 	float smallest;
