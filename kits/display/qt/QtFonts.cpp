@@ -6,6 +6,8 @@
 #include <cmath>
 #include <cstring>
 #include <memory>
+#include <mutex>
+#include <vector>
 
 #include <QFont>
 #include <QFontDatabase>
@@ -116,15 +118,27 @@ InkOf(const Mask& mask)
 }
 
 
-/// What a thread keeps of its last font. It is Qt's own, so it stays when Qt is gone already.
+/// Keeps what threads leave that end when Qt is gone already: it is Qt's own, so it is never destroyed.
+template <typename Content>
+void
+LeaveBehind(std::unique_ptr<Content> content)
+{
+	static std::mutex& sMutex = *new std::mutex;
+	static auto& sLeft = *new std::vector<std::unique_ptr<Content>>;
+	std::lock_guard<std::mutex> lock(sMutex);
+	sLeft.push_back(std::move(content));
+}
+
+
+/// What a thread keeps of its last font.
 template <typename Content>
 class ThreadsLast {
 public:
 	~ThreadsLast()
 	{
 		const QtUse use;
-		if (!use)
-			static_cast<void>(content.release());
+		if (!use && content != nullptr)
+			LeaveBehind(std::move(content));
 	}
 
 	std::unique_ptr<Content> content;
