@@ -14,6 +14,7 @@
 #include "interface/PixelFormat.h"
 #include "interface/WindowPrivate.h"
 
+using BPrivate::ColorSpaceOf;
 using BPrivate::ConvertPixels;
 using BPrivate::PixelRows;
 using BPrivate::RowLength;
@@ -68,7 +69,7 @@ BBitmap::BBitmap(BMessage* archive)
 	: BArchivable(archive)
 {
 	Init(archive->GetRect("_frame", BRect()),
-		static_cast<color_space>(archive->GetInt32("_cspace", B_NO_COLOR_SPACE)),
+		ColorSpaceOf(archive->GetInt32("_cspace", B_NO_COLOR_SPACE)),
 		archive->GetInt32("_bmflags", 0), archive->GetInt32("_rowbytes", B_ANY_BYTES_PER_ROW));
 	const void* data;
 	ssize_t size;

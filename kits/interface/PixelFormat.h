@@ -16,6 +16,9 @@ struct PixelRows {
 };
 
 
+/// The colour space that has \a number, which may be anything; B_NO_COLOR_SPACE for one that has no pixels here.
+color_space ColorSpaceOf(uint32 number);
+
 /// The bytes of a row of \a width pixels, a multiple of 4; 0 for a colour space that has no pixels here.
 int32 RowLength(int32 width, color_space space);
 

@@ -19,6 +19,7 @@
 #include "display/Canvas.h"
 #include "display/HostWindow.h"
 #include "interface/MenuTracker.h"
+#include "interface/PixelFormat.h"
 #include "interface/WindowClient.h"
 #include "interface/WindowPrivate.h"
 
@@ -171,7 +172,7 @@ WindowData::DispatchWindowMessage(BMessage* message, BHandler* handler)
 
 		case B_SCREEN_CHANGED:
 			window->ScreenChanged(message->GetRect("frame", BRect()),
-				static_cast<color_space>(message->GetInt32("mode", B_RGB32)));
+				ColorSpaceOf(message->GetInt32("mode", B_RGB32)));
 			return true;
 
 		case B_WORKSPACE_ACTIVATED:

@@ -9,6 +9,8 @@
 #include <Bitmap.h>
 #include <ByteOrder.h>
 
+#include "interface/PixelFormat.h"
+
 namespace {
 
 constexpr uint32 kBitmapMagic = 'bits';
@@ -84,7 +86,7 @@ BitmapOf(const std::vector<uint8>& data)
 	if (length > data.size() - kHeaderSize || !(rows >= 1) || rows * bytesPerRow != length)
 		return nullptr;
 
-	const color_space space = static_cast<color_space>(WordAt(&data[24]));
+	const color_space space = BPrivate::ColorSpaceOf(WordAt(&data[24]));
 	auto bitmap = std::make_unique<BBitmap>(bounds, 0, space, static_cast<int32>(bytesPerRow));
 	if (bitmap->InitCheck() != B_OK || static_cast<uint32>(bitmap->BitsLength()) != length)
 		return nullptr;

@@ -132,3 +132,18 @@ TEST(BitmapTest, CopiesAndArchivesHaveTheSamePixels)
 	EXPECT_EQ(made->ColorSpace(), B_RGB16);
 	EXPECT_EQ(memcmp(made->Bits(), bits, bitmap.BitsLength()), 0);
 }
+
+
+TEST(BitmapTest, AnArchiveWithAColourSpaceThatDoesNotExistIsNoBitmap)
+{
+	BMessage archive;
+	ASSERT_EQ(BBitmap(BRect(0, 0, 3, 1), B_RGB32).Archive(&archive), B_OK);
+	for (int32 space : {0x77000008, -1, 7, INT32_MAX}) {
+		SCOPED_TRACE(space);
+		ASSERT_EQ(archive.ReplaceInt32("_cspace", space), B_OK);
+		const BBitmap bitmap(&archive);
+		EXPECT_EQ(bitmap.InitCheck(), B_BAD_VALUE);
+		EXPECT_EQ(bitmap.ColorSpace(), B_NO_COLOR_SPACE);
+		EXPECT_EQ(bitmap.BitsLength(), 0);
+	}
+}
