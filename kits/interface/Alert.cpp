@@ -16,7 +16,10 @@
 
 #include "ControlLook.h"
 #include "app/LooperPrivate.h"
+#include "interface/ArchivedEnum.h"
 #include "interface/UserWait.h"
+
+using BPrivate::EnumBetween;
 
 namespace {
 
@@ -135,7 +138,7 @@ BAlert::BAlert(BMessage* archive)
 		&& number <= B_STOP_ALERT)
 		fType = static_cast<alert_type>(number);
 	if (archive->FindInt32("_but_width", &number) == B_OK)
-		fButtonWidth = static_cast<button_width>(number);
+		fButtonWidth = EnumBetween(number, B_WIDTH_AS_USUAL, B_WIDTH_FROM_LABEL, fButtonWidth);
 	const char* labels[kMostButtons] = {NULL, NULL, NULL};
 	for (int32 i = 0; i < kMostButtons; i++) {
 		if (archive->FindString("_but_label", i, &labels[i]) != B_OK)

@@ -4,8 +4,12 @@
 #include <View.h>
 #include <Window.h>
 
+#include "interface/ArchivedEnum.h"
 #include "interface/ViewPrivate.h"
 #include "interface/WindowPrivate.h"
+
+using BPrivate::EnumAmong;
+using BPrivate::EnumBetween;
 
 namespace {
 
@@ -40,6 +44,16 @@ ArchiveViews(const Parent* parent, BMessage* archive)
 	return status;
 }
 
+
+window_look
+LookIn(const BMessage& archive)
+{
+	return EnumAmong(archive.GetInt32("_wlook", B_TITLED_WINDOW_LOOK),
+		{B_BORDERED_WINDOW_LOOK, B_NO_BORDER_WINDOW_LOOK, B_TITLED_WINDOW_LOOK,
+			B_DOCUMENT_WINDOW_LOOK, B_MODAL_WINDOW_LOOK, B_FLOATING_WINDOW_LOOK},
+		B_TITLED_WINDOW_LOOK);
+}
+
 } // namespace
 
 
@@ -66,7 +80,7 @@ BView::BView(BMessage* archive)
 		Drawing().state.penSize = penSize;
 	int32 mode;
 	if (archive->FindInt32("_dmod", &mode) == B_OK)
-		Drawing().state.mode = static_cast<drawing_mode>(mode);
+		Drawing().state.mode = EnumBetween(mode, B_OP_COPY, B_OP_ALPHA, B_OP_COPY);
 	const char* family;
 	const char* style;
 	if (archive->FindString("_fname", 0, &family) == B_OK
@@ -127,8 +141,9 @@ BView::Archive(BMessage* archive, bool deep) const
 
 BWindow::BWindow(BMessage* archive)
 	: BWindow(archive->GetRect("_frame", BRect()), archive->GetString("_title", ""),
-		static_cast<window_look>(archive->GetInt32("_wlook", B_TITLED_WINDOW_LOOK)),
-		static_cast<window_feel>(archive->GetInt32("_wfeel", B_NORMAL_WINDOW_FEEL)),
+		LookIn(*archive),
+		EnumBetween(archive->GetInt32("_wfeel", B_NORMAL_WINDOW_FEEL), B_NORMAL_WINDOW_FEEL,
+			B_FLOATING_ALL_WINDOW_FEEL, B_NORMAL_WINDOW_FEEL),
 		archive->GetInt32("_flags", 0), archive->GetInt32("_wspace", B_CURRENT_WORKSPACE))
 {
 	float limits[4];

@@ -9,6 +9,9 @@
 #include <Window.h>
 
 #include "ControlLook.h"
+#include "interface/ArchivedEnum.h"
+
+using BPrivate::EnumBetween;
 
 namespace {
 
@@ -52,7 +55,7 @@ BBox::BBox(BMessage* archive)
 	archive->FindString("_label", &fLabel);
 	int32 style;
 	if (archive->FindInt32("_style", &style) == B_OK)
-		fBorder = static_cast<border_style>(style);
+		fBorder = EnumBetween(style, B_PLAIN_BORDER, B_NO_BORDER, B_FANCY_BORDER);
 	bool hasLabelView = false;
 	if (archive->FindBool("_lblview", &hasLabelView) == B_OK && hasLabelView)
 		fLabelView = ChildAt(0);

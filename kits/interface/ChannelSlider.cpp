@@ -9,6 +9,9 @@
 #include <Window.h>
 
 #include "ThumbTracking.h"
+#include "interface/ArchivedEnum.h"
+
+using BPrivate::EnumBetween;
 
 namespace {
 
@@ -139,7 +142,8 @@ BChannelSlider::BChannelSlider(const char* name, const char* label, BMessage* me
 
 BChannelSlider::BChannelSlider(BMessage* archive)
 	: BChannelControl(archive),
-	  fOrientation(static_cast<orientation>(archive->GetInt32("_orient", B_HORIZONTAL))),
+	  fOrientation(EnumBetween(
+		  archive->GetInt32("_orient", B_HORIZONTAL), B_HORIZONTAL, B_VERTICAL, B_HORIZONTAL)),
 	  fThumb(std::make_unique<Thumb>(this))
 {
 	if (CountChannels() > kMostChannels)

@@ -10,6 +10,10 @@
 #include <TextView.h>
 #include <Window.h>
 
+#include "interface/ArchivedEnum.h"
+
+using BPrivate::EnumAmong;
+
 namespace {
 
 constexpr uint32 kMsgNumberEntered = 'cNum';
@@ -51,7 +55,8 @@ BColorControl::BColorControl(BPoint start, color_control_layout layout, float ce
 
 BColorControl::BColorControl(BMessage* archive)
 	: BControl(archive),
-	  fLayout(static_cast<color_control_layout>(archive->GetInt32("_layout", B_CELLS_32x8))),
+	  fLayout(EnumAmong(archive->GetInt32("_layout", B_CELLS_32x8),
+		  {B_CELLS_4x64, B_CELLS_8x32, B_CELLS_16x16, B_CELLS_32x8, B_CELLS_64x4}, B_CELLS_32x8)),
 	  fCellSize(std::max(archive->GetFloat("_csize", kLeastCellSize), kLeastCellSize)),
 	  fUseOffscreen(archive->GetBool("_use_off", false)),
 	  fCurrentRamp(kGreyRamp),

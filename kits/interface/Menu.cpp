@@ -12,12 +12,14 @@
 #include <Screen.h>
 #include <Window.h>
 
+#include "interface/ArchivedEnum.h"
 #include "interface/MenuInfo.h"
 #include "interface/MenuLook.h"
 #include "interface/MenuPrivate.h"
 #include "interface/MenuTracker.h"
 #include "interface/MenuWindow.h"
 
+using BPrivate::EnumBetween;
 using BPrivate::MenuData;
 using BPrivate::MenuLock;
 using BPrivate::MenuModel;
@@ -60,8 +62,8 @@ BMenu::BMenu(const char* name, float width, float height)
 
 BMenu::BMenu(BMessage* archive)
 	: BView(archive),
-	  fData(std::make_unique<MenuData>(
-		  static_cast<menu_layout>(archive->GetInt32("_layout", B_ITEMS_IN_ROW))))
+	  fData(std::make_unique<MenuData>(EnumBetween(archive->GetInt32("_layout", B_ITEMS_IN_ROW),
+		  B_ITEMS_IN_ROW, B_ITEMS_IN_MATRIX, B_ITEMS_IN_ROW)))
 {
 	SetItemMargins(BPrivate::kMarkWidth, kMarginAbove, BPrivate::kArrowWidth, kMarginBelow);
 	fData->matrixSize = Bounds().Size();

@@ -8,11 +8,13 @@
 #include <Message.h>
 #include <Window.h>
 
+#include "interface/ArchivedEnum.h"
 #include "interface/MenuLook.h"
 #include "interface/MenuPrivate.h"
 #include "interface/MenuTracker.h"
 #include "interface/WindowPrivate.h"
 
+using BPrivate::EnumBetween;
 using BPrivate::MenuData;
 using BPrivate::MenuModel;
 using BPrivate::MenuTracker;
@@ -46,7 +48,8 @@ BMenuBar::BMenuBar(const char* name, menu_layout layout, uint32 flags)
 
 BMenuBar::BMenuBar(BMessage* archive)
 	: BMenu(archive),
-	  fBorder(static_cast<menu_bar_border>(archive->GetInt32("_border", B_BORDER_FRAME)))
+	  fBorder(EnumBetween(archive->GetInt32("_border", B_BORDER_FRAME), B_BORDER_FRAME,
+		  B_BORDER_EACH_ITEM, B_BORDER_FRAME))
 {
 	MenuModel::Of(this).isBar = true;
 	MenuModel::Of(this).resizeToFit = archive->GetBool("_rsize_to_fit", true);

@@ -7,6 +7,7 @@
 #include <Errors.h>
 
 #include "display/PixelBuffer.h"
+#include "interface/ArchivedEnum.h"
 
 namespace BPrivate {
 
@@ -239,16 +240,21 @@ OperationPlayer::PlayState()
 	RecordedState recorded = fReader.Get<RecordedState>();
 	fState.highColor = recorded.highColor;
 	fState.lowColor = recorded.lowColor;
-	fState.mode = static_cast<drawing_mode>(recorded.mode);
-	fState.alphaSource = static_cast<source_alpha>(recorded.alphaSource);
-	fState.alphaFunction = static_cast<alpha_function>(recorded.alphaFunction);
+	fState.mode = EnumBetween(recorded.mode, B_OP_COPY, B_OP_ALPHA, B_OP_COPY);
+	fState.alphaSource =
+		EnumBetween(recorded.alphaSource, B_PIXEL_ALPHA, B_CONSTANT_ALPHA, B_PIXEL_ALPHA);
+	fState.alphaFunction = EnumBetween(
+		recorded.alphaFunction, B_ALPHA_OVERLAY, B_ALPHA_COMPOSITE_DARKEN, B_ALPHA_OVERLAY);
 	fState.penSize = recorded.penSize;
-	fState.lineCap = static_cast<cap_mode>(recorded.lineCap);
-	fState.lineJoin = static_cast<join_mode>(recorded.lineJoin);
+	fState.lineCap =
+		EnumAmong(recorded.lineCap, {B_ROUND_CAP, B_BUTT_CAP, B_SQUARE_CAP}, B_BUTT_CAP);
+	fState.lineJoin = EnumBetween(recorded.lineJoin, B_ROUND_JOIN, B_SQUARE_JOIN, B_MITER_JOIN);
 	fState.miterLimit = recorded.miterLimit;
 	fState.fillRule = recorded.fillRule;
 	fState.origin = recorded.origin + fOffset;
-	if (recorded.mode < B_OP_COPY || recorded.mode > B_OP_ALPHA)
+	if (recorded.mode != fState.mode || recorded.alphaSource != fState.alphaSource
+		|| recorded.alphaFunction != fState.alphaFunction || recorded.lineCap != fState.lineCap
+		|| recorded.lineJoin != fState.lineJoin)
 		fReader.Fail();
 	DrawIfGood([&](Canvas& canvas) { canvas.SetState(fState); });
 }

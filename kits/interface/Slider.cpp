@@ -9,6 +9,9 @@
 #include <Window.h>
 
 #include "ThumbTracking.h"
+#include "interface/ArchivedEnum.h"
+
+using BPrivate::EnumBetween;
 
 namespace {
 
@@ -98,9 +101,12 @@ BSlider::BSlider(BMessage* archive)
 	  fMinimum(archive->GetInt32("_min", 0)),
 	  fMaximum(std::max(fMinimum, archive->GetInt32("_max", 100))),
 	  fHashMarkCount(std::max<int32>(archive->GetInt32("_hashcount", 0), 0)),
-	  fHashMarks(static_cast<hash_mark_location>(archive->GetInt16("_hashloc", 0))),
-	  fStyle(static_cast<thumb_style>(archive->GetInt16("_sstyle", B_BLOCK_THUMB))),
-	  fOrientation(static_cast<orientation>(archive->GetInt32("_orient", B_HORIZONTAL))),
+	  fHashMarks(EnumBetween(archive->GetInt16("_hashloc", 0), B_HASH_MARKS_NONE, B_HASH_MARKS_BOTH,
+		  B_HASH_MARKS_NONE)),
+	  fStyle(EnumBetween(archive->GetInt16("_sstyle", B_BLOCK_THUMB), B_BLOCK_THUMB,
+		  B_TRIANGLE_THUMB, B_BLOCK_THUMB)),
+	  fOrientation(EnumBetween(
+		  archive->GetInt32("_orient", B_HORIZONTAL), B_HORIZONTAL, B_VERTICAL, B_HORIZONTAL)),
 	  fBarThickness(std::max(archive->GetFloat("_bthickness", kDefaultBarThickness), 1.0f)),
 	  fBarColor(make_color(0, 0, 0)),
 	  fFillColor(make_color(0, 0, 0)),

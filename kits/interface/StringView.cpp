@@ -8,6 +8,9 @@
 #include <Window.h>
 
 #include "ControlLook.h"
+#include "interface/ArchivedEnum.h"
+
+using BPrivate::EnumBetween;
 
 BStringView::BStringView(
 	BRect frame, const char* name, const char* text, uint32 resizingMode, uint32 flags)
@@ -34,7 +37,7 @@ BStringView::BStringView(BMessage* archive)
 {
 	int32 value;
 	if (archive->FindInt32("_align", &value) == B_OK)
-		fAlignment = static_cast<alignment>(value);
+		fAlignment = EnumBetween(value, B_ALIGN_USE_FULL_WIDTH, B_ALIGN_CENTER, B_ALIGN_LEFT);
 	if (archive->FindInt32("_truncation", &value) == B_OK)
 		fTruncation = static_cast<uint32>(value);
 }

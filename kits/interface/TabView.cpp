@@ -8,6 +8,10 @@
 #include <Window.h>
 
 #include "ControlLook.h"
+#include "interface/ArchivedEnum.h"
+
+using BPrivate::EnumAmong;
+using BPrivate::EnumBetween;
 
 BTabView::BTabView(
 	BRect frame, const char* name, button_width width, uint32 resizeMask, uint32 flags)
@@ -31,10 +35,13 @@ BTabView::BTabView(BMessage* archive)
 		view->RemoveSelf();
 		delete view;
 	}
-	Init(static_cast<button_width>(archive->GetInt16("_but_width", B_WIDTH_AS_USUAL)));
+	Init(EnumBetween(archive->GetInt16("_but_width", B_WIDTH_AS_USUAL), B_WIDTH_AS_USUAL,
+		B_WIDTH_FROM_LABEL, B_WIDTH_AS_USUAL));
 	fTabHeight = std::max(archive->GetFloat("_high", fTabHeight), 1.0f);
-	fBorder = static_cast<border_style>(archive->GetInt32("_border_style", B_FANCY_BORDER));
-	fTabSide = static_cast<tab_side>(archive->GetInt32("_TabSide", kTopSide));
+	fBorder = EnumBetween(archive->GetInt32("_border_style", B_FANCY_BORDER), B_PLAIN_BORDER,
+		B_NO_BORDER, B_FANCY_BORDER);
+	fTabSide = EnumAmong(archive->GetInt32("_TabSide", kTopSide),
+		{kLeftSide, kRightSide, kTopSide, kBottomSide}, kTopSide);
 	LayOutContainer();
 
 	BMessage tabArchive;

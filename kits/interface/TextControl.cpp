@@ -9,6 +9,9 @@
 
 #include "ControlLook.h"
 #include "TextInput.h"
+#include "interface/ArchivedEnum.h"
+
+using BPrivate::EnumBetween;
 
 namespace {
 
@@ -60,9 +63,9 @@ BTextControl::BTextControl(BMessage* archive)
 {
 	int32 number;
 	if (archive->FindInt32("_a_label", &number) == B_OK)
-		fLabelAlignment = static_cast<alignment>(number);
+		fLabelAlignment = EnumBetween(number, B_ALIGN_USE_FULL_WIDTH, B_ALIGN_CENTER, B_ALIGN_LEFT);
 	if (archive->FindInt32("_a_text", &number) == B_OK)
-		fTextAlignment = static_cast<alignment>(number);
+		fTextAlignment = EnumBetween(number, B_ALIGN_USE_FULL_WIDTH, B_ALIGN_CENTER, B_ALIGN_LEFT);
 	archive->FindFloat("_divide", &fDivider);
 	BMessage message;
 	if (archive->FindMessage("_mod_msg", &message) == B_OK)

@@ -19,6 +19,9 @@
 #include "TextLayout.h"
 #include "TextStyles.h"
 #include "TextUndo.h"
+#include "interface/ArchivedEnum.h"
+
+using BPrivate::EnumBetween;
 
 namespace {
 
@@ -137,7 +140,7 @@ BTextView::BTextView(BMessage* archive)
 	if (archive->FindInt32("_max", &number) == B_OK)
 		fMaxBytes = number;
 	if (archive->FindInt32("_align", &number) == B_OK)
-		fAlignment = static_cast<alignment>(number);
+		fAlignment = EnumBetween(number, B_ALIGN_USE_FULL_WIDTH, B_ALIGN_CENTER, B_ALIGN_LEFT);
 	bool flag;
 	if (archive->FindBool("_nedit", &flag) == B_OK)
 		fEditable = !flag;

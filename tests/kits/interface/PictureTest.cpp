@@ -157,6 +157,44 @@ TEST_F(PictureTest, DamagedPicturesAreRefused)
 }
 
 
+TEST_F(PictureTest, AStateThatDoesNotExistIsRefused)
+{
+	BPicture picture;
+	fBitmaps[0]->Lock();
+	fViews[0]->BeginPicture(&picture);
+	fViews[0]->SetDrawingMode(B_OP_ALPHA);
+	fViews[0]->SetBlendingMode(B_CONSTANT_ALPHA, B_ALPHA_COMPOSITE);
+	fViews[0]->SetPenSize(7);
+	fViews[0]->FillRect(BRect(1, 1, 4, 4));
+	fViews[0]->EndPicture();
+	fBitmaps[0]->Unlock();
+	BMallocIO stream;
+	ASSERT_EQ(picture.Flatten(&stream), B_OK);
+	const std::string whole(static_cast<const char*>(stream.Buffer()), stream.BufferLength());
+
+	const struct {
+		int32 mode = B_OP_ALPHA;
+		int32 alphaSource = B_CONSTANT_ALPHA;
+		int32 alphaFunction = B_ALPHA_COMPOSITE;
+		float penSize = 7;
+		int32 lineCap = B_BUTT_CAP;
+		int32 lineJoin = B_MITER_JOIN;
+	} kState;
+	const size_t place =
+		whole.rfind(std::string(reinterpret_cast<const char*>(&kState), sizeof(kState)));
+	ASSERT_NE(place, std::string::npos);
+	for (size_t number : {0, 1, 2, 4, 5}) {
+		for (int32 value : {-1, 14, 0x77000000}) {
+			std::string damaged = whole;
+			memcpy(&damaged[place + number * sizeof(int32)], &value, sizeof(value));
+			BMemoryIO all(damaged.data(), damaged.size());
+			BPicture read;
+			EXPECT_EQ(read.Unflatten(&all), B_BAD_DATA) << number << ": " << value;
+		}
+	}
+}
+
+
 TEST_F(PictureTest, APictureMayBeTheClipping)
 {
 	BPicture picture;
