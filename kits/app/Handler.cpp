@@ -315,9 +315,10 @@ BHandler::SetLooper(BLooper* looper, const LooperPort* port)
 {
 	fLooper = looper;
 	fNextHandler = nullptr;
-	Registry::Default().SetHandlerPort(fToken, port != nullptr ? port->Id() : -1);
 	for (int32 i = 0; fFilters != nullptr && i < fFilters->CountItems(); i++)
 		static_cast<BMessageFilter*>(fFilters->ItemAt(i))->fLooper = looper;
+	// Last: without a looper's lock to wait for, the handler is the other thread's.
+	Registry::Default().SetHandlerPort(fToken, port != nullptr ? port->Id() : -1);
 }
 
 

@@ -131,10 +131,12 @@ BView::RemoveSelf()
 	if (fOwner != nullptr) {
 		InvalidateFrame(Frame());
 		CallDetachedHooks();
-		ClearOwner();
 	}
 	if (fParent != nullptr)
 		fParent->UnlinkChild(this);
+	// Last: who waits for the looper of a menu may delete it from then on.
+	if (fOwner != nullptr)
+		ClearOwner();
 	return true;
 }
 
@@ -432,11 +434,12 @@ BView::SetOwner(BWindow* window)
 void
 BView::ClearOwner()
 {
-	fOwner->fData->ViewRemoved(this);
-	fOwner->RemoveHandler(this);
-	fOwner = nullptr;
 	for (BView* child = fFirstChild; child != nullptr; child = child->fNextSibling)
 		child->ClearOwner();
+	BWindow* window = fOwner;
+	window->fData->ViewRemoved(this);
+	fOwner = nullptr;
+	window->RemoveHandler(this);
 }
 
 
