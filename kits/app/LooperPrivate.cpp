@@ -3,6 +3,7 @@
 
 #include "app/LooperPrivate.h"
 
+#include "app/Delivery.h"
 #include "app/LooperPort.h"
 #include "app/MessagePrivate.h"
 #include "app/Registry.h"
@@ -44,6 +45,28 @@ LooperAccess::LoopersOfKind(looper_kind kind, bigtime_t timeout)
 		port->Unlock();
 	}
 	return loopers;
+}
+
+
+BMessenger
+LooperAccess::RunningApplication()
+{
+	const port_id id = Registry::Default().ApplicationPort();
+	const std::shared_ptr<LooperPort> port = Registry::Default().PortFor(id);
+	return port != nullptr && port->IsRunning() ? MessengerFor({id, kNoToken, ThisTeam()})
+												: BMessenger();
+}
+
+
+std::vector<BWindow*>
+LooperAccess::Windows()
+{
+	std::vector<BWindow*> windows;
+	for (const std::shared_ptr<LooperPort>& port : Registry::Default().Loopers()) {
+		if (port->Kind() == kWindowLooper || port->Kind() == kFilePanelWindowLooper)
+			windows.push_back(port->Window());
+	}
+	return windows;
 }
 
 

@@ -43,6 +43,11 @@ struct LooperAccess {
 	/// that stay locked for \a timeout microseconds.
 	static std::vector<BMessenger> LoopersOfKind(looper_kind kind, bigtime_t timeout);
 
+	/// The application while its loop runs, else one that is not valid. For threads that may outlive it: be_app goes.
+	static BMessenger RunningApplication();
+	/// As BApplication::WindowAt() has them. Any of them may be gone.
+	static std::vector<BWindow*> Windows();
+
 	/// The looper's port, which outlives it: for threads that must not touch the looper itself.
 	static port_id Port(const BLooper* looper);
 	static int32 Token(const BHandler* handler);

@@ -7,7 +7,6 @@
 #include <cstring>
 #include <string>
 
-#include <Application.h>
 #include <OS.h>
 #include <Window.h>
 
@@ -247,12 +246,15 @@ bool
 Robot::SettleOnce(bigtime_t limit)
 {
 	// A test may do without the application's loop.
-	bool settled = be_app == nullptr || !LooperAccess::IsRunning(be_app)
-		|| Ping(be_app, be_app_messenger, limit);
-	for (int32 i = 0; be_app != nullptr && i < be_app->CountWindows(); i++) {
-		BWindow* window = be_app->WindowAt(i);
-		settled = (window == nullptr || SettleWindow(window, limit)) && settled;
+	bool settled = true;
+	const BMessenger application = LooperAccess::RunningApplication();
+	if (application.IsValid()) {
+		BLooper* looper;
+		application.Target(&looper);
+		settled = Ping(looper, application, limit);
 	}
+	for (BWindow* window : LooperAccess::Windows())
+		settled = SettleWindow(window, limit) && settled;
 	// What follows an open menu counts too: it opens and closes the menus' windows.
 	for (const BMessenger& menu : LooperAccess::LoopersOfKind(kMenuWindowLooper, limit)) {
 		BLooper* looper;

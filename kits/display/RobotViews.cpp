@@ -3,7 +3,6 @@
 #include <cmath>
 #include <cstring>
 
-#include <Application.h>
 #include <Control.h>
 #include <Menu.h>
 #include <MenuItem.h>
@@ -99,9 +98,8 @@ ForEachMenuWindow(const std::function<bool(BWindow*)>& task)
 bool
 ForEachWindow(const std::function<bool(BWindow*)>& task)
 {
-	for (int32 i = 0; be_app != nullptr && i < be_app->CountWindows(); i++) {
-		BWindow* window = be_app->WindowAt(i);
-		if (window == nullptr || window->LockWithTimeout(kLockTime) != B_OK)
+	for (BWindow* window : LooperAccess::Windows()) {
+		if (LooperAccess::LockIfThere(window, kLockTime) != B_OK)
 			continue;
 		bool isDone = task(window);
 		window->Unlock();
