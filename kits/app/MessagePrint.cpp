@@ -186,8 +186,11 @@ ItemText(const BMessage& message, const char* name, type_code type, int32 index)
 void
 BMessage::PrintToStream() const
 {
+	// In one piece, whatever other threads print.
+	flockfile(stdout);
 	PrintIndented(0);
 	fflush(stdout);
+	funlockfile(stdout);
 }
 
 

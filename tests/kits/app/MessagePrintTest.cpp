@@ -2,6 +2,7 @@
 // The text that a message prints.
 
 #include <string>
+#include <thread>
 
 #include <Entry.h>
 #include <GraphicsDefs.h>
@@ -104,4 +105,34 @@ TEST(MessagePrintTest, ReferencesShowTheirPath)
 		"BMessage('refs') {\n        refs = entry_ref(device=" + std::to_string(int32(ref.device))
 			+ ", directory=" + std::to_string(ref.directory)
 			+ ", name=\"no such entry\", path=\"/usr/no such entry\")\n}\n");
+}
+
+
+TEST(MessagePrintTest, WhatTwoThreadsPrintIsNotMixed)
+{
+	const size_t kCount = 3000;
+	BMessage one('one ');
+	one.AddInt32("number", 1);
+	BMessage two('two ');
+	two.AddInt32("number", 2);
+	const std::string texts[] = {Printed(one), Printed(two)};
+
+	testing::internal::CaptureStdout();
+	const auto printOften = [](const BMessage& message) {
+		for (size_t i = 0; i < kCount; i++)
+			message.PrintToStream();
+	};
+	std::thread other([&] { printOften(two); });
+	printOften(one);
+	other.join();
+	const std::string printed = testing::internal::GetCapturedStdout();
+
+	size_t at = 0;
+	while (at < printed.size()) {
+		const std::string& text =
+			texts[printed.compare(at, texts[0].size(), texts[0]) == 0 ? 0 : 1];
+		ASSERT_EQ(printed.compare(at, text.size(), text), 0) << printed.substr(at, 200);
+		at += text.size();
+	}
+	EXPECT_EQ(printed.size(), kCount * (texts[0].size() + texts[1].size()));
 }
