@@ -22,8 +22,8 @@ public:
 	void KeyDown(const char* bytes, int32 numBytes) override
 	{
 		if (numBytes == 1 && *bytes == B_TAB)
-			BView::KeyDown(
-				bytes, numBytes); // NOLINT(bugprone-parent-virtual-call): the text view inserts it
+			// NOLINTNEXTLINE(bugprone-parent-virtual-call): the text view would insert it
+			BView::KeyDown(bytes, numBytes);
 		else
 			BTextView::KeyDown(bytes, numBytes);
 	}
