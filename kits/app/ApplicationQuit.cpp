@@ -9,6 +9,7 @@
 #include <Autolock.h>
 
 #include "app/LooperPort.h"
+#include "app/LooperPrivate.h"
 #include "app/Registry.h"
 #include "kernel/Kernel.h"
 
@@ -37,25 +38,18 @@ Windows(Wanted wanted)
 }
 
 
-static bool
-IsCounted(BPrivate::looper_kind kind)
-{
-	return kind == BPrivate::kWindowLooper || kind == BPrivate::kFilePanelWindowLooper;
-}
-
-
 int32
 BApplication::CountWindows() const
 {
-	return int32(Windows(IsCounted).size());
+	return int32(BPrivate::LooperAccess::Windows().size());
 }
 
 
 BWindow*
 BApplication::WindowAt(int32 index) const
 {
-	std::vector<PortRef> windows = Windows(IsCounted);
-	return index >= 0 && size_t(index) < windows.size() ? windows[index]->Window() : nullptr;
+	const std::vector<BWindow*> windows = BPrivate::LooperAccess::Windows();
+	return index >= 0 && size_t(index) < windows.size() ? windows[index] : nullptr;
 }
 
 

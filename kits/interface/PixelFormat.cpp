@@ -8,6 +8,8 @@
 #include <Errors.h>
 #include <InterfaceDefs.h>
 
+#include "interface/ArchivedEnum.h"
+
 namespace BPrivate {
 
 namespace {
@@ -87,14 +89,10 @@ IsMagic(rgb_color color)
 color_space
 ColorSpaceOf(uint32 number)
 {
-	static const color_space kSpaces[] = {B_RGB32, B_RGBA32, B_RGB32_BIG, B_RGBA32_BIG, B_RGB24,
-		B_RGB24_BIG, B_RGB16, B_RGB16_BIG, B_RGB15, B_RGBA15, B_RGB15_BIG, B_RGBA15_BIG, B_CMAP8,
-		B_GRAY8, B_GRAY1};
-	for (color_space space : kSpaces) {
-		if (number == space)
-			return space;
-	}
-	return B_NO_COLOR_SPACE;
+	return EnumAmong(static_cast<int32>(number),
+		{B_RGB32, B_RGBA32, B_RGB32_BIG, B_RGBA32_BIG, B_RGB24, B_RGB24_BIG, B_RGB16, B_RGB16_BIG,
+			B_RGB15, B_RGBA15, B_RGB15_BIG, B_RGBA15_BIG, B_CMAP8, B_GRAY8, B_GRAY1},
+		B_NO_COLOR_SPACE);
 }
 
 
