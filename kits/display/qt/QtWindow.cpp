@@ -86,6 +86,14 @@ FlagsOf(const HostWindowStyle& style)
 }
 
 
+bool
+Covers(const QImage& image, QSize size)
+{
+	const QSizeF covered = image.isNull() ? QSizeF() : image.deviceIndependentSize();
+	return covered.width() >= size.width() && covered.height() >= size.height();
+}
+
+
 void
 PaintOutline(QPainter& painter, const QRectF& rect)
 {
@@ -427,9 +435,7 @@ QtWindow::LetServerShow(const QRegion& region)
 	bool isShown = false;
 	fSurface->Paint([&](const QImage& image, const std::shared_ptr<WindowPixels>& pixels) {
 		const qreal ratio = devicePixelRatio();
-		const QSizeF covered = image.isNull() ? QSizeF() : image.deviceIndependentSize();
-		if (image.devicePixelRatio() != ratio || covered.width() < width()
-			|| covered.height() < height())
+		if (image.devicePixelRatio() != ratio || !Covers(image, size()))
 			return;
 		QRegion device;
 		for (const QRect& rect : region) {
@@ -448,8 +454,7 @@ void
 QtWindow::PaintPicture(QPainter& painter)
 {
 	fSurface->Paint([&](const QImage& image, const std::shared_ptr<WindowPixels>&) {
-		QSizeF covered = image.isNull() ? QSizeF() : image.deviceIndependentSize();
-		if (covered.width() < width() || covered.height() < height())
+		if (!Covers(image, size()))
 			painter.fillRect(QRect(QPoint(0, 0), size()), kUndrawnColor);
 		if (!image.isNull())
 			painter.drawImage(QPointF(0, 0), image);

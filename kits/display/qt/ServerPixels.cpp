@@ -3,6 +3,7 @@
 #include "display/qt/ServerPixels.h"
 
 #include <cstdlib>
+#include <memory>
 
 #include <fcntl.h>
 #include <sys/socket.h>
@@ -10,6 +11,8 @@
 #include <xcb/xcb.h>
 
 #include <QGuiApplication>
+
+#include <ByteOrder.h>
 
 #include "display/WindowPixels.h"
 
@@ -25,18 +28,18 @@ const uint32 kRedMask = 0xff0000, kGreenMask = 0xff00, kBlueMask = 0xff;
 const int kMajor = 1, kMinor = 2;
 
 
-template <typename Reply>
-struct Freed {
-	explicit Freed(Reply* reply)
-		: reply(reply)
-	{
-	}
-	~Freed() { free(reply); }
-	Freed(const Freed&) = delete;
-	Freed& operator=(const Freed&) = delete;
-
-	Reply* const reply;
+/// What xcb returns, which its caller frees.
+struct Free {
+	void operator()(void* memory) const { free(memory); }
 };
+
+
+template <typename Reply>
+std::unique_ptr<Reply, Free>
+Owned(Reply* reply)
+{
+	return std::unique_ptr<Reply, Free>(reply);
+}
 
 
 /// Null where there is no X server any more, or another platform.
@@ -67,10 +70,8 @@ IsLocal(xcb_connection_t* connection)
 bool
 HasPixelFormat(const xcb_setup_t* setup)
 {
-	const uint16 one = 1;
-	const bool isLittle = *reinterpret_cast<const uint8*>(&one) == 1;
 	if (setup->image_byte_order
-		!= (isLittle ? XCB_IMAGE_ORDER_LSB_FIRST : XCB_IMAGE_ORDER_MSB_FIRST))
+		!= (B_HOST_IS_LENDIAN ? XCB_IMAGE_ORDER_LSB_FIRST : XCB_IMAGE_ORDER_MSB_FIRST))
 		return false;
 	for (auto format = xcb_setup_pixmap_formats_iterator(setup); format.rem > 0;
 		 xcb_format_next(&format)) {
@@ -92,11 +93,11 @@ TakesMemory(xcb_connection_t* connection)
 	const xcb_query_extension_reply_t* extension = xcb_get_extension_data(connection, &xcb_shm_id);
 	if (extension == nullptr || extension->present == 0)
 		return false;
-	Freed version(
-		xcb_shm_query_version_reply(connection, xcb_shm_query_version(connection), nullptr));
-	return version.reply != nullptr
-		&& (version.reply->major_version > kMajor
-			|| (version.reply->major_version == kMajor && version.reply->minor_version >= kMinor));
+	const auto version =
+		Owned(xcb_shm_query_version_reply(connection, xcb_shm_query_version(connection), nullptr));
+	return version != nullptr
+		&& (version->major_version > kMajor
+			|| (version->major_version == kMajor && version->minor_version >= kMinor));
 }
 
 
@@ -125,11 +126,11 @@ ShowsPixels(xcb_connection_t* connection, xcb_window_t window)
 	xcb_get_geometry_cookie_t geometryCookie = xcb_get_geometry(connection, window);
 	xcb_get_window_attributes_cookie_t attributesCookie =
 		xcb_get_window_attributes(connection, window);
-	Freed geometry(xcb_get_geometry_reply(connection, geometryCookie, nullptr));
-	Freed attributes(xcb_get_window_attributes_reply(connection, attributesCookie, nullptr));
-	return geometry.reply != nullptr && attributes.reply != nullptr
-		&& geometry.reply->depth == kDepth
-		&& HasMasks(xcb_get_setup(connection), attributes.reply->visual);
+	const auto geometry = Owned(xcb_get_geometry_reply(connection, geometryCookie, nullptr));
+	const auto attributes =
+		Owned(xcb_get_window_attributes_reply(connection, attributesCookie, nullptr));
+	return geometry != nullptr && attributes != nullptr && geometry->depth == kDepth
+		&& HasMasks(xcb_get_setup(connection), attributes->visual);
 }
 
 } // namespace
@@ -176,8 +177,9 @@ ServerPixels::Show(
 			static_cast<int16>(rect.y()), kDepth, XCB_IMAGE_FORMAT_Z_PIXMAP, false, fSegment, 0);
 	}
 	// Any answer comes after the pictures have been read: only then may they change.
-	Freed answer(xcb_get_input_focus_reply(connection, xcb_get_input_focus(connection), nullptr));
-	return answer.reply != nullptr;
+	const auto answer =
+		Owned(xcb_get_input_focus_reply(connection, xcb_get_input_focus(connection), nullptr));
+	return answer != nullptr;
 }
 
 
@@ -205,9 +207,9 @@ ServerPixels::Attach(xcb_connection_t* connection, const std::shared_ptr<WindowP
 		return false;
 	fSegment = xcb_generate_id(connection);
 	const bool isReadOnly = true;
-	Freed error(xcb_request_check(
+	const auto error = Owned(xcb_request_check(
 		connection, xcb_shm_attach_fd_checked(connection, fSegment, file, isReadOnly)));
-	if (error.reply != nullptr)
+	if (error != nullptr)
 		return false;
 	fPixels = pixels;
 	return true;
