@@ -28,8 +28,12 @@ function(plimworks_add_component_library name)
   # The views that components show may be those of generated programs, which are in headers alone.
   target_include_directories(${name} PRIVATE
     $<TARGET_PROPERTY:Ormi::ormi,INTERFACE_INCLUDE_DIRECTORIES>)
-  # The designer passes over what it cannot load without a word, so a missing function is an error here.
-  target_link_options(${name} PRIVATE LINKER:--no-undefined)
+  # The designer passes over what it cannot load without a word, so a missing function is an error here. Clang's
+  # sanitizers have theirs in the program alone.
+  get_directory_property(link_options LINK_OPTIONS)
+  if(NOT (CMAKE_CXX_COMPILER_ID MATCHES "Clang" AND "${CMAKE_CXX_FLAGS};${link_options}" MATCHES "-fsanitize="))
+    target_link_options(${name} PRIVATE LINKER:--no-undefined)
+  endif()
 
   set(output "${Plimworks_OUTPUT_DIR}")
   if(NOT output)
