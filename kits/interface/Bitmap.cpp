@@ -12,12 +12,14 @@
 #include <Window.h>
 
 #include "interface/PixelFormat.h"
+#include "interface/WholePixels.h"
 #include "interface/WindowPrivate.h"
 
 using BPrivate::ColorSpaceOf;
 using BPrivate::ConvertPixels;
 using BPrivate::PixelRows;
 using BPrivate::RowLength;
+using BPrivate::WholePixels;
 
 BBitmap::BBitmap(BRect bounds, uint32 flags, color_space colorSpace, int32 bytesPerRow, screen_id)
 {
@@ -259,17 +261,16 @@ BBitmap::ImportBits(const void* data, int32 length, int32 bpr, color_space color
 	if (data == nullptr || length < 0 || size.width < 0 || size.height < 0)
 		return B_BAD_VALUE;
 
-	int32 width = static_cast<int32>(size.width) + 1;
-	int32 height = static_cast<int32>(size.height) + 1;
+	int32 width = WholePixels(size.width) + 1;
+	int32 height = WholePixels(size.height) + 1;
 	if (bpr == B_ANY_BYTES_PER_ROW)
-		bpr = RowLength(static_cast<int32>(from.x) + width, colorSpace);
+		bpr = RowLength(WholePixels(from.x) + width, colorSpace);
 	PixelRows source{static_cast<uint8*>(const_cast<void*>(data)), length, bpr, colorSpace};
 	PixelRows target{fBits, fBitsLength, fBytesPerRow, fColorSpace};
 
 	// What lies outside of the bitmap on the left and top is left out on both sides.
-	int32 fromX = static_cast<int32>(from.x), fromY = static_cast<int32>(from.y);
-	int32 toX = static_cast<int32>(to.x - fBounds.left),
-		  toY = static_cast<int32>(to.y - fBounds.top);
+	int32 fromX = WholePixels(from.x), fromY = WholePixels(from.y);
+	int32 toX = WholePixels(to.x - fBounds.left), toY = WholePixels(to.y - fBounds.top);
 	int32 skipX = std::max({0, -toX, -fromX}), skipY = std::max({0, -toY, -fromY});
 	width = std::min(width - skipX, fBounds.IntegerWidth() + 1 - toX - skipX);
 	height = std::min(height - skipY, fBounds.IntegerHeight() + 1 - toY - skipY);

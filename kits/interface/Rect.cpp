@@ -6,6 +6,10 @@
 #include <cmath>
 #include <cstdio>
 
+#include "interface/WholePixels.h"
+
+using BPrivate::WholePixels;
+
 void
 BRect::Set(float left, float top, float right, float bottom)
 {
@@ -222,14 +226,14 @@ BRect::operator|(BRect other) const
 int32
 BRect::IntegerWidth() const
 {
-	return static_cast<int32>(std::ceil(right - left));
+	return WholePixels(std::ceil(right - left));
 }
 
 
 int32
 BRect::IntegerHeight() const
 {
-	return static_cast<int32>(std::ceil(bottom - top));
+	return WholePixels(std::ceil(bottom - top));
 }
 
 

@@ -8,13 +8,13 @@
 #include <limits>
 #include <span>
 
+#include "interface/WholePixels.h"
+
+using BPrivate::WholePixels;
+
 namespace {
 
 const clipping_rect kEmpty = {0, 0, -1, -1};
-
-// Far enough outside of any screen, and near enough that sums of two stay in an int32.
-const float kLimit = 1 << 29;
-
 
 struct Interval {
 	int64 from;
@@ -46,21 +46,14 @@ Overlap(const clipping_rect& a, const clipping_rect& b)
 }
 
 
-int32
-Clamp(float value)
-{
-	return static_cast<int32>(std::clamp(value, -kLimit, kLimit));
-}
-
-
 // Every pixel that the rectangle touches.
 clipping_rect
 Covered(BRect rect)
 {
 	if (!rect.IsValid())
 		return kEmpty;
-	return {Clamp(std::floor(rect.left)), Clamp(std::floor(rect.top)), Clamp(std::ceil(rect.right)),
-		Clamp(std::ceil(rect.bottom))};
+	return {WholePixels(std::floor(rect.left)), WholePixels(std::floor(rect.top)),
+		WholePixels(std::ceil(rect.right)), WholePixels(std::ceil(rect.bottom))};
 }
 
 
@@ -295,7 +288,7 @@ BRegion::Intersects(clipping_rect clipping) const
 bool
 BRegion::Contains(BPoint point) const
 {
-	return Contains(Clamp(std::floor(point.x)), Clamp(std::floor(point.y)));
+	return Contains(WholePixels(std::floor(point.x)), WholePixels(std::floor(point.y)));
 }
 
 
@@ -316,7 +309,7 @@ BRegion::Contains(int32 x, int32 y) const
 void
 BRegion::OffsetBy(const BPoint& point)
 {
-	OffsetBy(Clamp(std::round(point.x)), Clamp(std::round(point.y)));
+	OffsetBy(WholePixels(std::round(point.x)), WholePixels(std::round(point.y)));
 }
 
 

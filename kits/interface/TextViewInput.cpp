@@ -9,6 +9,9 @@
 #include <Window.h>
 
 #include "TextLayout.h"
+#include "interface/WholePixels.h"
+
+using BPrivate::WholePixels;
 
 namespace {
 
@@ -91,8 +94,8 @@ BTextView::MoveByKey(char key, bool extend, bool byWord)
 	GetSelection(&start, &end);
 	const bool collapse = start != end && !extend && !byWord;
 	const float wantedX = fWantedX >= 0 ? fWantedX : PointAt(fCaret).x;
-	const int32 page = std::max<int32>(
-		1, static_cast<int32>(Bounds().Height() / std::max(LineHeight(0), 1.0f)) - 1);
+	const int32 page =
+		std::max<int32>(1, WholePixels(Bounds().Height() / std::max(LineHeight(0), 1.0f)) - 1);
 
 	switch (key) {
 		case B_LEFT_ARROW:

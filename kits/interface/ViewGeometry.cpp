@@ -10,7 +10,10 @@
 #include <Window.h>
 
 #include "interface/ScrollBarLink.h"
+#include "interface/WholePixels.h"
 #include "interface/WindowPrivate.h"
+
+using BPrivate::WholePixels;
 
 namespace {
 
@@ -282,8 +285,8 @@ BView::SetFrame(BPoint leftTop, float width, float height)
 {
 	BRect oldFrame = Frame();
 	bool moved = leftTop != fLeftTop;
-	int32 dx = static_cast<int32>(width - fBounds.Width());
-	int32 dy = static_cast<int32>(height - fBounds.Height());
+	int32 dx = WholePixels(width - fBounds.Width());
+	int32 dy = WholePixels(height - fBounds.Height());
 	bool resized = dx != 0 || dy != 0;
 	if (!moved && !resized)
 		return;
@@ -333,8 +336,8 @@ BView::PostFrameMessages(bool moved, bool resized)
 	if (resized) {
 		BMessage message(B_VIEW_RESIZED);
 		message.AddInt64("when", system_time());
-		message.AddInt32("width", static_cast<int32>(fBounds.Width()));
-		message.AddInt32("height", static_cast<int32>(fBounds.Height()));
+		message.AddInt32("width", WholePixels(fBounds.Width()));
+		message.AddInt32("height", WholePixels(fBounds.Height()));
 		fOwner->PostMessage(&message, this);
 	}
 }

@@ -20,8 +20,11 @@
 #include "display/HostWindow.h"
 #include "interface/MenuTracker.h"
 #include "interface/PixelFormat.h"
+#include "interface/WholePixels.h"
 #include "interface/WindowClient.h"
 #include "interface/WindowPrivate.h"
+
+using BPrivate::WholePixels;
 
 BHandler*
 BWindow::ChooseTarget(BMessage* message, BHandler* target, bool preferred)
@@ -287,8 +290,8 @@ WindowData::PostResized()
 {
 	BMessage message(B_WINDOW_RESIZED);
 	message.AddInt64("when", system_time());
-	message.AddInt32("width", static_cast<int32>(frame.Width()));
-	message.AddInt32("height", static_cast<int32>(frame.Height()));
+	message.AddInt32("width", WholePixels(frame.Width()));
+	message.AddInt32("height", WholePixels(frame.Height()));
 	window->PostMessage(&message);
 }
 

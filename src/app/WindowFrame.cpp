@@ -3,12 +3,12 @@
 #include "app/WindowFrame.h"
 
 #include <algorithm>
-#include <cmath>
 
 #include <Screen.h>
 #include <Window.h>
 
 #include "app/Preferences.h"
+#include "model/FiniteRect.h"
 
 namespace {
 
@@ -18,9 +18,7 @@ constexpr int32 kMostScreens = 16;
 bool
 IsFrame(BRect frame)
 {
-	const bool finite = std::isfinite(frame.left) && std::isfinite(frame.top)
-		&& std::isfinite(frame.right) && std::isfinite(frame.bottom);
-	return finite && frame.IsValid();
+	return IsFinite(frame) && frame.IsValid();
 }
 
 

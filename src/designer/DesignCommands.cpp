@@ -26,6 +26,7 @@
 #include "model/DesignMessages.h"
 #include "model/Diagnostics.h"
 #include "model/Event.h"
+#include "model/FiniteRect.h"
 #include "model/Property.h"
 #include "palette/PaletteCatalog.h"
 #include "palette/PaletteEntry.h"
@@ -269,7 +270,7 @@ TDesignFormView::RetrieveComponent(const void* record, ssize_t size)
 	if (message.Unflatten(&stream) != B_OK || message.FindMessage("Properties", &properties) != B_OK
 		|| message.FindMessage("Events", &events) != B_OK
 		|| message.FindString("_ClassName", &className) != B_OK
-		|| message.FindRect("_Frame", &frame) != B_OK)
+		|| message.FindRect("_Frame", &frame) != B_OK || !IsFinite(frame))
 		return nullptr;
 	TPaletteEntry* entry = PaletteCatalog().FindPalEntry(className);
 	TComponent* component = entry != nullptr ? entry->CreateComponent(this, this, frame) : nullptr;

@@ -14,6 +14,7 @@
 #include "designer/LoadReport.h"
 #include "model/Diagnostics.h"
 #include "model/Event.h"
+#include "model/FiniteRect.h"
 #include "model/Property.h"
 #include "model/ViewLock.h"
 #include "model/ViewTree.h"
@@ -128,7 +129,7 @@ TFormReader::CreateComponent(const char* savedName, const BMessage& record)
 
 	const char* className;
 	BRect frame(0, 0, -1, -1);
-	const bool hasFrame = properties.FindRect("_Frame", &frame) == B_OK;
+	const bool hasFrame = properties.FindRect("_Frame", &frame) == B_OK && IsFinite(frame);
 	if (properties.FindString("_ClassName", &className) != B_OK || !hasFrame) {
 		PrintDiagnostic("Warning: No class name/location for '%s'\n", savedName);
 		DropComponent(savedName, "it has no class name or no frame");

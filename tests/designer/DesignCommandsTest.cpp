@@ -3,6 +3,7 @@
 
 #include "designer/SurfaceTest.h"
 
+#include <cmath>
 #include <cstdio>
 #include <filesystem>
 
@@ -400,6 +401,10 @@ TEST_F(DesignCommandsTest, ADamagedRecordPastesNothing)
 	}
 	BMessage record(whole);
 	record.ReplaceString("_ClassName", "TNobodys");
+	paste(record);
+	EXPECT_EQ(Names(), "Button1");
+	record = whole;
+	record.ReplaceRect("_Frame", BRect(10, 10, std::nanf(""), 30));
 	paste(record);
 	EXPECT_EQ(Names(), "Button1");
 

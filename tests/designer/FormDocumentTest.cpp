@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // Saving and loading forms.
 
+#include <cmath>
 #include <cstring>
 
 #include "designer/DesignerTest.h"
@@ -236,6 +237,39 @@ TEST_F(FormDocumentTest, UnknownClassesAreLeftOutAndTheRestIsLoaded)
 	EXPECT_EQ(report.Problems()[0].kind, LOAD_CLASS_UNKNOWN);
 	EXPECT_STREQ(report.Problems()[0].file.String(), path.c_str());
 	EXPECT_EQ(report.Problems()[1].kind, LOAD_COMPONENT_DAMAGED);
+}
+
+
+TEST_F(FormDocumentTest, AComponentWhoseFrameIsNoNumbersIsLeftOut)
+{
+	TDesignForm* form = NewForm();
+	Place(form, "TButton", "Button1");
+	Place(form, "TButton", "Button2");
+	Place(form, "TButton", "Button3");
+	const std::string path = SaveChanged(form, [](BMessage& components) {
+		const auto setFrame = [&](const char* component, BRect frame) {
+			BMessage record;
+			BMessage properties;
+			ASSERT_EQ(components.FindMessage(component, &record), B_OK);
+			ASSERT_EQ(record.FindMessage("Properties", &properties), B_OK);
+			ASSERT_EQ(properties.ReplaceRect("_Frame", frame), B_OK);
+			record.ReplaceMessage("Properties", &properties);
+			components.ReplaceMessage(component, &record);
+		};
+		setFrame("Button1", BRect(std::nanf(""), 10, 20, 30));
+		setFrame("Button3", BRect(10, 10, HUGE_VALF, 30));
+	});
+
+	TDesignForm* loaded = NewForm("Other");
+	TLoadReport report;
+	const std::string output = Load(loaded, path, &report);
+	EXPECT_TRUE(fResult);
+	EXPECT_NE(output.find("Warning: No class name/location for 'Button1'\n"), std::string::npos);
+	EXPECT_NE(output.find("Warning: No class name/location for 'Button3'\n"), std::string::npos);
+	ASSERT_EQ(loaded->CountComponents(), 1);
+	EXPECT_STREQ(loaded->ComponentAt(0)->ComponentName(), "Button2");
+	ASSERT_EQ(report.Problems().size(), 2u);
+	EXPECT_EQ(report.Problems()[0].kind, LOAD_COMPONENT_DAMAGED);
 }
 
 

@@ -2,6 +2,8 @@
 // Tests of BPoint and BRect.
 #include <Rect.h>
 
+#include <limits>
+
 #include <gtest/gtest.h>
 
 #include "support/Printers.h"
@@ -127,4 +129,19 @@ TEST(RectTest, MovesOfSidesAndCorners)
 	EXPECT_EQ(rect.LeftBottom(), BPoint(5, 6));
 	EXPECT_EQ(rect.RightTop(), BPoint(7, 8));
 	EXPECT_EQ(&rect.OffsetBySelf(1, 1).InsetBySelf(0, 0).OffsetToSelf(0, 0), &rect);
+}
+
+
+TEST(RectTest, WholeSizesOfSidesThatAreNoPixelsStayNumbers)
+{
+	const float nan = std::numeric_limits<float>::quiet_NaN();
+	const float infinite = std::numeric_limits<float>::infinity();
+	EXPECT_EQ(BRect(nan, 0, 10, nan).IntegerWidth(), 0);
+	EXPECT_EQ(BRect(nan, 0, 10, nan).IntegerHeight(), 0);
+	for (float far : {1e30f, infinite}) {
+		EXPECT_GT(BRect(0, 0, far, 1).IntegerWidth(), 1000000) << far;
+		EXPECT_LT(BRect(0, 0, 1, -far).IntegerHeight(), -1000000) << far;
+		// A pixel more, as loops over pixels have it, is a number too.
+		EXPECT_GT(BRect(-far, 0, far, 1).IntegerWidth() + 1, 1000000) << far;
+	}
 }

@@ -3,6 +3,7 @@
 #include <Region.h>
 
 #include <bitset>
+#include <cmath>
 #include <random>
 
 #include <gtest/gtest.h>
@@ -209,6 +210,15 @@ TEST(RegionTest, EqualSetsHaveEqualRectsWhateverTheOrder)
 	}
 	EXPECT_EQ(rows, columns);
 	EXPECT_EQ(rows.CountRects(), 1);
+}
+
+
+TEST(RegionTest, APlaceThatIsNoNumberMovesNothing)
+{
+	BRegion region(BRect(0, 0, 5, 5));
+	region.OffsetBy(BPoint(std::nanf(""), 2));
+	EXPECT_EQ(region.Frame(), BRect(0, 2, 5, 7));
+	EXPECT_TRUE(region.Contains(BPoint(std::nanf(""), 3)));
 }
 
 

@@ -2,6 +2,7 @@
 // Tests of BView: the tree, its hooks, coordinates, resizing and the graphics state.
 #include <View.h>
 
+#include <limits>
 
 #include <MessageFilter.h>
 #include <Region.h>
@@ -414,6 +415,25 @@ TEST_F(ViewTest, SizesMayShrinkBelowZeroAndComeBack)
 	parent->ResizeTo(4, 4);
 	EXPECT_EQ(child->Bounds().Width(), -16);
 	parent->ResizeTo(99, 99);
+	EXPECT_EQ(child->Frame(), BRect(10, 10, 89, 89));
+	window->Quit();
+}
+
+
+TEST_F(ViewTest, SizesThatAreNoNumbersLeaveTheChildrenAlone)
+{
+	const float nan = std::numeric_limits<float>::quiet_NaN();
+	BWindow* window = MakeWindow();
+	BView* parent = MakeView("parent", BRect(0, 0, 99, 99));
+	BView* child = MakeView("child", BRect(10, 10, 89, 89), B_FOLLOW_ALL);
+	window->AddChild(parent);
+	parent->AddChild(child);
+	parent->ResizeTo(nan, nan);
+	parent->MoveTo(nan, nan);
+	EXPECT_EQ(child->Frame(), BRect(10, 10, 89, 89));
+	parent->MoveTo(0, 0);
+	parent->ResizeTo(99, 99);
+	EXPECT_EQ(parent->Frame(), BRect(0, 0, 99, 99));
 	EXPECT_EQ(child->Frame(), BRect(10, 10, 89, 89));
 	window->Quit();
 }
