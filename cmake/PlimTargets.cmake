@@ -96,8 +96,9 @@ function(plim_test name)
     target_sources(${name} PRIVATE $<TARGET_OBJECTS:editor_keeper>)
   endif()
   if(CMAKE_BUILD_TYPE STREQUAL "Debug" OR "address" IN_LIST PLIM_SANITIZE)
-    # Halves the time of compiling; most of the time that a test takes passes in the libraries.
-    target_compile_options(${name} PRIVATE -O0)
+    # Halves the time of compiling; most of the time that a test takes passes in the libraries. Lines are enough to
+    # see where a test failed.
+    target_compile_options(${name} PRIVATE -O0 -g1)
   endif()
   target_compile_definitions(${name} PRIVATE
     TEST_DATA_DIR="${CMAKE_CURRENT_SOURCE_DIR}" PLIM_BUILD_DIR="${CMAKE_BINARY_DIR}"
