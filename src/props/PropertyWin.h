@@ -67,6 +67,10 @@ public:
 	/// thread, no lock needed.
 	virtual void UpdateDisplayValues();
 
+	/// Whether the values are shown as they were when UpdateDisplayValues() or PWM_REFRESH was handled last: not while
+	/// that waits for the next frame. The window is locked.
+	bool ShowsLatestValues() const { return fDelayedRefresh == nullptr; }
+
 	/// Destroys \a editors in the window's own thread, after the message that it is handling, with which it may still
 	/// be about to use one. Any thread, no lock needed.
 	void Bury(std::unique_ptr<TForgottenEditors> editors);
