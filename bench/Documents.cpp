@@ -8,7 +8,10 @@
 #include <cstdio>
 #include <cstdlib>
 
+#include <unistd.h>
+
 #include <Application.h>
+#include <Path.h>
 #include <String.h>
 
 #include "ButtonForm.h"
@@ -21,6 +24,12 @@ main(int argc, char** argv)
 {
 	if (argc != 3 && argc != 4) {
 		fprintf(stderr, "usage: %s COUNT FOLDER [FORMS]\n", argv[0]);
+		return 2;
+	}
+	// Relative names would be those of the documents' folder, and a file that cannot be saved would be asked about.
+	BPath folder(argv[2], nullptr, true);
+	if (folder.InitCheck() != B_OK || access(folder.Path(), W_OK) != 0) {
+		fprintf(stderr, "bench_documents: cannot write into the folder '%s'\n", argv[2]);
 		return 2;
 	}
 	setenv("BE_DISPLAY", "none", 1);
@@ -36,11 +45,11 @@ main(int argc, char** argv)
 	for (int i = 0; i < formCount; i++) {
 		TDesignForm* form = project.NewForm();
 		PlaceButtons(form, atoi(argv[1]));
-		BString path(argv[2]);
+		BString path(folder.Path());
 		path << "/" << form->ComponentName() << ".frm";
 		form->SetFilename(path.String());
 	}
-	BString path(argv[2]);
+	BString path(folder.Path());
 	path << "/bench.plim";
 	return project.SaveToFile(path.String(), true) ? 0 : 3;
 }
