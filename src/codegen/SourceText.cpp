@@ -194,19 +194,28 @@ HasDollar(std::initializer_list<placeholder_value> placeholders)
 }
 
 
-/// Appends \a source with all of \a placeholders replaced at once. False, with \a text as it was, when one pass for
+/// The first dollar sign from \a from to \a end; null when there is none.
+const char*
+FindDollar(const char* from, const char* end)
+{
+	return static_cast<const char*>(memchr(from, '$', end - from));
+}
+
+
+/// Appends \a whole with all of \a placeholders replaced at once. False, with \a text as it was, when one pass for
 /// each could come to another result: when replacing one makes another.
 bool
-AppendInOnePass(const char* source, std::initializer_list<placeholder_value> placeholders,
+AppendInOnePass(const BString& whole, std::initializer_list<placeholder_value> placeholders,
 	LineBreaks lineBreaks, std::string& text)
 {
-	const char* from = strchr(source, '$');
+	const char* source = whole.String();
+	const char* const end = source + whole.Length();
+	const char* from = FindDollar(source, end);
 	if (from == nullptr) {
-		AppendPiece(source, lineBreaks, text);
+		AppendPiece(std::string_view(source, end - source), lineBreaks, text);
 		return true;
 	}
 
-	const char* const end = from + strlen(from);
 	const size_t oldLength = text.length();
 	const bool isOne = placeholders.size() == 1;
 	const bool hasDollar = HasDollar(placeholders);
@@ -225,7 +234,7 @@ AppendInOnePass(const char* source, std::initializer_list<placeholder_value> pla
 			}
 			writer.Append(piece);
 		};
-		for (; from != nullptr; from = strchr(from, '$')) {
+		for (; from != nullptr; from = FindDollar(from, end)) {
 			const placeholder_value* found = FindPlaceholder(from, end, placeholders);
 			if (found == nullptr) {
 				loneDollar = from++;
@@ -259,12 +268,12 @@ AppendInOnePass(const char* source, std::initializer_list<placeholder_value> pla
 bool
 ReplaceInOnePass(BString& text, std::initializer_list<placeholder_value> placeholders)
 {
-	if (strchr(text.String(), '$') == nullptr)
+	if (FindDollar(text.String(), text.String() + text.Length()) == nullptr)
 		return true;
 
 	std::string result;
 	result.reserve(text.Length() + text.Length() / 8 + 64);
-	if (!AppendInOnePass(text.String(), placeholders, kLineBreaksKept, result))
+	if (!AppendInOnePass(text, placeholders, kLineBreaksKept, result))
 		return false;
 	text.SetTo(result.data(), static_cast<int32>(result.length()));
 	return true;
@@ -342,7 +351,7 @@ AppendStatement(std::string& text, const BString& statement,
 	std::initializer_list<placeholder_value> placeholders)
 {
 	text.append("$TAB");
-	if (!AppendInOnePass(statement.String(), placeholders, kLineBreaksIndented, text)) {
+	if (!AppendInOnePass(statement, placeholders, kLineBreaksIndented, text)) {
 		BString replaced(statement);
 		ReplacePlaceholders(replaced, placeholders);
 		AppendPiece(replaced.String(), kLineBreaksIndented, text);
