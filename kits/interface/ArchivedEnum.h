@@ -5,6 +5,7 @@
 
 #include <initializer_list>
 
+#include <InterfaceDefs.h>
 #include <SupportDefs.h>
 
 namespace BPrivate {
@@ -29,6 +30,14 @@ EnumBetween(int32 number, Enum first, Enum last, Enum otherwise)
 {
 	const bool isKnown = number >= static_cast<int32>(first) && number <= static_cast<int32>(last);
 	return isKnown ? static_cast<Enum>(number) : otherwise;
+}
+
+
+/// The alignment that has \a number; B_ALIGN_LEFT when it is none.
+inline alignment
+AlignmentOf(int32 number)
+{
+	return EnumBetween(number, B_ALIGN_USE_FULL_WIDTH, B_ALIGN_CENTER, B_ALIGN_LEFT);
 }
 
 } // namespace BPrivate

@@ -16,8 +16,8 @@
 #include "interface/MenuLook.h"
 #include "interface/MenuPrivate.h"
 
+using BPrivate::AlignmentOf;
 using BPrivate::ControlState;
-using BPrivate::EnumBetween;
 using BPrivate::MenuData;
 using BPrivate::MenuModel;
 
@@ -157,8 +157,7 @@ BMenuField::BMenuField(BMessage* archive)
 	if (menu == NULL)
 		menu = new BPopUpMenu("");
 	Init(archive->GetString("_label", ""), menu, archive->GetBool("_fixeds", false));
-	fAlignment = EnumBetween(archive->GetInt32("_align", B_ALIGN_LEFT), B_ALIGN_USE_FULL_WIDTH,
-		B_ALIGN_CENTER, B_ALIGN_LEFT);
+	fAlignment = AlignmentOf(archive->GetInt32("_align", B_ALIGN_LEFT));
 	fDivider = archive->GetFloat("_divide", fDivider);
 	if (archive->GetBool("_disable", false)) {
 		SetEnabled(false);

@@ -10,7 +10,7 @@
 #include "ControlLook.h"
 #include "interface/ArchivedEnum.h"
 
-using BPrivate::EnumBetween;
+using BPrivate::AlignmentOf;
 
 BStringView::BStringView(
 	BRect frame, const char* name, const char* text, uint32 resizingMode, uint32 flags)
@@ -37,7 +37,7 @@ BStringView::BStringView(BMessage* archive)
 {
 	int32 value;
 	if (archive->FindInt32("_align", &value) == B_OK)
-		fAlignment = EnumBetween(value, B_ALIGN_USE_FULL_WIDTH, B_ALIGN_CENTER, B_ALIGN_LEFT);
+		fAlignment = AlignmentOf(value);
 	if (archive->FindInt32("_truncation", &value) == B_OK)
 		fTruncation = static_cast<uint32>(value);
 }

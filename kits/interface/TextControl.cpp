@@ -11,7 +11,7 @@
 #include "TextInput.h"
 #include "interface/ArchivedEnum.h"
 
-using BPrivate::EnumBetween;
+using BPrivate::AlignmentOf;
 
 namespace {
 
@@ -63,9 +63,9 @@ BTextControl::BTextControl(BMessage* archive)
 {
 	int32 number;
 	if (archive->FindInt32("_a_label", &number) == B_OK)
-		fLabelAlignment = EnumBetween(number, B_ALIGN_USE_FULL_WIDTH, B_ALIGN_CENTER, B_ALIGN_LEFT);
+		fLabelAlignment = AlignmentOf(number);
 	if (archive->FindInt32("_a_text", &number) == B_OK)
-		fTextAlignment = EnumBetween(number, B_ALIGN_USE_FULL_WIDTH, B_ALIGN_CENTER, B_ALIGN_LEFT);
+		fTextAlignment = AlignmentOf(number);
 	archive->FindFloat("_divide", &fDivider);
 	BMessage message;
 	if (archive->FindMessage("_mod_msg", &message) == B_OK)

@@ -21,7 +21,7 @@
 #include "TextUndo.h"
 #include "interface/ArchivedEnum.h"
 
-using BPrivate::EnumBetween;
+using BPrivate::AlignmentOf;
 
 namespace {
 
@@ -140,7 +140,7 @@ BTextView::BTextView(BMessage* archive)
 	if (archive->FindInt32("_max", &number) == B_OK)
 		fMaxBytes = number;
 	if (archive->FindInt32("_align", &number) == B_OK)
-		fAlignment = EnumBetween(number, B_ALIGN_USE_FULL_WIDTH, B_ALIGN_CENTER, B_ALIGN_LEFT);
+		fAlignment = AlignmentOf(number);
 	bool flag;
 	if (archive->FindBool("_nedit", &flag) == B_OK)
 		fEditable = !flag;
