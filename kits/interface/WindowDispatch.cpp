@@ -24,8 +24,6 @@
 #include "interface/WindowClient.h"
 #include "interface/WindowPrivate.h"
 
-using BPrivate::WholePixels;
-
 BHandler*
 BWindow::ChooseTarget(BMessage* message, BHandler* target, bool preferred)
 {

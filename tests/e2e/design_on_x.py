@@ -19,6 +19,7 @@ WHOLE_LIMIT = 220
 
 MARKS = (0, 200, 200)  # of what is selected
 BUTTON_ON_PALETTE = (50, 12)
+CHOSEN = "BMessage('PalE')"
 FIRST_PLACE, SECOND_PLACE = (30, 440), (640, 440)
 # Items of a component's menu: how far below and right of where it opens.
 COPY = (40, 70)
@@ -77,8 +78,11 @@ class Form:
         self.click(BARE)
         self.desktop.wait_until_active(self.window)
         palette, = wait_for("one palette", lambda: self.palettes_if_one())
+        chosen = self.session.output().count(CHOSEN)
         self.session.click_in("Components", BUTTON_ON_PALETTE)
         self.desktop.wait_until_active(palette)
+        # What is drawn before the palette has handled the click places nothing.
+        self.expect_told(CHOSEN, chosen + 1)
         self.drag((left, top), (right, bottom))
         self.expect_selected(left, top, right, bottom)
 
