@@ -2,6 +2,7 @@
 // Short texts that were measured or drawn lately.
 #include "display/qt/TextRuns.h"
 
+#include <cstdlib>
 #include <cstring>
 
 namespace BPrivate {
@@ -9,9 +10,19 @@ namespace BPrivate {
 namespace {
 
 // Enough for a screen full of labels.
-const size_t kMostBytes = 2 * 1024 * 1024;
+const size_t kMostKilobytes = 2048;
 // What a run takes besides its text and pixels: nodes, pointers, the allocator's.
 const size_t kBytesOfRun = 256;
+
+
+// What the user allows, or else what is enough.
+size_t
+MostBytes()
+{
+	const char* setting = getenv("BE_TEXT_CACHE");
+	const size_t kilobytes = setting != nullptr ? strtoul(setting, nullptr, 10) : 0;
+	return (kilobytes > 0 && kilobytes < kMostKilobytes ? kilobytes : kMostKilobytes) * 1024;
+}
 
 } // namespace
 
@@ -47,6 +58,12 @@ private:
 };
 
 
+TextRuns::TextRuns()
+	: fMostBytes(MostBytes())
+{
+}
+
+
 std::shared_ptr<const TextRun>
 TextRuns::Find(const FontKey& font, const char* text, int32 length)
 {
@@ -80,7 +97,7 @@ TextRuns::Insert(std::string_view key, std::shared_ptr<const TextRun> run)
 {
 	fYoungBytes += key.size() + run->coverage.capacity() + kBytesOfRun;
 	fYoung.insert_or_assign(std::string(key), std::move(run));
-	if (fYoungBytes < kMostBytes / 2)
+	if (fYoungBytes < fMostBytes / 2)
 		return;
 	fOld.swap(fYoung);
 	fYoung.clear();

@@ -36,6 +36,9 @@ struct TextRun {
 /// long time goes. Any thread.
 class TextRuns {
 public:
+	/// Takes as much memory as BE_TEXT_CACHE says, in kB, and 2 MB at most.
+	TextRuns();
+
 	/// Whether runs of this length, in bytes, are kept.
 	static bool IsKept(int32 length) { return length > 0 && length <= kLongest; }
 
@@ -58,6 +61,7 @@ private:
 
 	void Insert(std::string_view key, std::shared_ptr<const TextRun> run);
 
+	const size_t fMostBytes;
 	std::mutex fMutex;
 	// When the young ones take half of the room, they become the old ones, and the old ones go.
 	RunMap fYoung;
