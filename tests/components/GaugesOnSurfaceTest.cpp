@@ -7,6 +7,7 @@
 #include "designer/SurfaceTest.h"
 #include "model/Component.h"
 #include "props/PropertyListItem.h"
+#include "support/LatestValues.h"
 #include "support/Printers.h"
 
 class GaugesOnSurfaceTest : public SurfaceTest {
@@ -14,7 +15,7 @@ protected:
 	/// What the property window shows for it.
 	std::string Shown(const char* property)
 	{
-		fRobot.Settle();
+		WaitForLatestValues(Inspector(), fRobot);
 		WindowGuard guard(Inspector());
 		auto* list = dynamic_cast<BListView*>(Inspector()->FindView("lvProperties"));
 		for (int32 i = 0; i < list->CountItems(); i++) {

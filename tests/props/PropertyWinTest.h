@@ -15,7 +15,7 @@
 #include "app/WindowGuard.h"
 #include "props/PropertyListItem.h"
 #include "props/PropertyWin.h"
-#include "support/Patience.h"
+#include "support/LatestValues.h"
 
 /// Notes in which order an edit asks and tells it.
 class WatchfulControl : public PlainControl {
@@ -102,24 +102,9 @@ protected:
 		return -1;
 	}
 
-	/// Waits for what is shown with the next frame.
-	void WaitForLatestValues()
-	{
-		robot.Settle();
-		const auto isWaiting = [this] {
-			WindowGuard guard(window);
-			return !window->ShowsLatestValues();
-		};
-		for (int i = 0; isWaiting() && i < 2000 * Patience(); i++)
-			snooze(1000);
-		EXPECT_FALSE(isWaiting());
-		// It may have begun to show them.
-		robot.Settle();
-	}
-
 	std::string ShownValue(const char* property)
 	{
-		WaitForLatestValues();
+		WaitForLatestValues(window, robot);
 		const int32 row = RowOf(property);
 		WindowGuard guard(window);
 		auto* item = static_cast<TPropertyListItem*>(List("lvProperties")->ItemAt(row));
