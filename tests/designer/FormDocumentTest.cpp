@@ -51,18 +51,26 @@ protected:
 	}
 
 	/// Replaces a field of a component's "Properties" in the collection.
-	static void SetRecordString(
-		BMessage& components, const char* component, const char* name, const char* value)
+	template <typename Change>
+	static void ChangeProperties(BMessage& components, const char* component, Change change)
 	{
 		BMessage record;
 		BMessage properties;
 		ASSERT_EQ(components.FindMessage(component, &record), B_OK);
 		ASSERT_EQ(record.FindMessage("Properties", &properties), B_OK);
-		properties.RemoveName(name);
-		if (value != nullptr)
-			properties.AddString(name, value);
+		change(properties);
 		record.ReplaceMessage("Properties", &properties);
 		components.ReplaceMessage(component, &record);
+	}
+
+	static void SetRecordString(
+		BMessage& components, const char* component, const char* name, const char* value)
+	{
+		ChangeProperties(components, component, [&](BMessage& properties) {
+			properties.RemoveName(name);
+			if (value != nullptr)
+				properties.AddString(name, value);
+		});
 	}
 };
 
@@ -248,13 +256,9 @@ TEST_F(FormDocumentTest, AComponentWhoseFrameIsNoNumbersIsLeftOut)
 	Place(form, "TButton", "Button3");
 	const std::string path = SaveChanged(form, [](BMessage& components) {
 		const auto setFrame = [&](const char* component, BRect frame) {
-			BMessage record;
-			BMessage properties;
-			ASSERT_EQ(components.FindMessage(component, &record), B_OK);
-			ASSERT_EQ(record.FindMessage("Properties", &properties), B_OK);
-			ASSERT_EQ(properties.ReplaceRect("_Frame", frame), B_OK);
-			record.ReplaceMessage("Properties", &properties);
-			components.ReplaceMessage(component, &record);
+			ChangeProperties(components, component, [&](BMessage& properties) {
+				ASSERT_EQ(properties.ReplaceRect("_Frame", frame), B_OK);
+			});
 		};
 		setFrame("Button1", BRect(std::nanf(""), 10, 20, 30));
 		setFrame("Button3", BRect(10, 10, HUGE_VALF, 30));
